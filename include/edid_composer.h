@@ -1,0 +1,781 @@
+/**
+ * @file edid_composer.h
+ * @brief libedid_composer: composes the EDID that a video platform shows on its own HDMI input.
+ *
+ * A platform that sits between an HDMI source and a downstream sink presents an EDID of its own on its input. This
+ * library composes it from the sink's EDID, the platform's configuration tree and the caller's settings for the port,
+ * and decodes any EDID into a readable report.
+ *
+ * Conventions that hold for every operation:
+ *
+ * - **Results.** Operations answer 1 (`true`) for success and 0 (`false`) for failure unless stated otherwise. There
+ *   are no error codes and no exceptions: each failure is reported once, where it is detected, by one line on standard
+ *   output (see @ref debug_enable for the four kinds of line).
+ * - **Ownership.** Records are provided by the caller. All heap memory is list entries and their payloads, owned by the
+ *   list that holds them and released by the record's own destroy operation. Nothing survives a call but what the caller
+ *   was given.
+ * - **Threads.** The library keeps no state but the debug switch. Every operation may run on any thread, and on several
+ *   threads at once as long as they work on different records and buffers. Lines that several threads print may
+ *   interleave. Composing also calls the host's eight `config_*` operations: whether those may run at once is the host's
+ *   affair.
+ * - **Units.** Pixel clocks are in hertz, refresh rates in whole hertz (truncated), latencies in milliseconds.
+ *
+ * Standards: EDID 1.3 is "VESA Enhanced EDID Standard, Release A, Revision 1"; CEA-861 is CEA-861-D; HDMI is the "High-
+ * Definition Multimedia Interface Specification, Version 1.4a", whose CEC supplement defines physical addresses.
+ *
+ * The header is self-contained and valid as C11 and as C++17.
+ */
+#ifndef EDID_COMPOSER_H
+#define EDID_COMPOSER_H
+
+#include <stdbool.h>
+#include <stdint.h>
+
+/** Marks what the shared library exports, and what it binds to in the host. */
+#define EDID_COMPOSER_API __attribute__((visibility("default")))
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/** @defgroup types Fixed-width types
+ * @{ */
+typedef uint8_t u8;   /**< Unsigned byte. As a result or a flag: 0 or 1. */
+typedef uint16_t u16; /**< Unsigned 16-bit integer. */
+typedef uint32_t u32; /**< Unsigned 32-bit integer. */
+typedef int32_t i32;  /**< Signed 32-bit integer. */
+/** @} */
+
+/** @defgroup diagnostics Diagnostics and version
+ *
+ * All diagnostics go to C's `stdout`, in four kinds of line:
+ *
+ * | kind    | bytes                                                      | written              |
+ * |---------|------------------------------------------------------------|----------------------|
+ * | error   | `module:line:function() ERROR: ` message, newline          | always               |
+ * | warning | `module:line:function() WARNING: ` message, newline        | always               |
+ * | bug     | `module:line:function() BUG: ` message, newline            | always               |
+ * | trace   | message, ` \t\t\tfunction():line`, newline                 | while tracing is on  |
+ *
+ * The module is `edid_composer`, `edid_decode_encode`, `utility` or `linked_list`. A bug line tells of a broken
+ * internal invariant (a corrupt list, a failed allocation), the other two of bad input.
+ * @{ */
+
+/**
+ * Turns tracing on or off for the whole process. It is off until the first call.
+ *
+ * The switch may be changed from any thread at any time; a change takes effect on the next line written. Prints nothing.
+ *
+ * @param enable true to write debug traces and dumps, false to write errors, warnings, bugs and reports only.
+ */
+EDID_COMPOSER_API void debug_enable(bool enable);
+
+/** Tells whether tracing is on. May be called from any thread. */
+EDID_COMPOSER_API bool debug_enabled(void);
+
+/**
+ * The text that identifies a build: `#@# libedid_composer.so Unofficial Build ` and the date of the build in the form
+ * of the system's `date` command. Never NULL, read-only, valid as long as the library is loaded. The marker `#@#` lets
+ * the text be found in the library file.
+ */
+EDID_COMPOSER_API extern const char *const gVersion;
+/** @} */
+
+/** @defgroup linked_list Typed linked list
+ *
+ * The singly linked list that holds every collection. A head carries a magic number made from its own address, and head
+ * and entries carry a tag made from the name of their element type, so that a head that was never initialised, was moved
+ * or was overwritten, and an entry of the wrong type, are reported instead of followed. Nearly every operation verifies
+ * the whole list.
+ *
+ * A head must never be copied by value or moved: at another address it is not initialised.
+ *
+ * All operations answer true on success. Each failure prints one error or bug line of module `linked_list`. A list may be
+ * used by one thread at a time.
+ * @{ */
+
+struct ll_entry_t;
+
+/** Head of a typed list; embedded by value in the record that owns it. */
+typedef struct ll_list_t {
+  u32 magic;               /**< Made from the head's own address while the list is initialised; 0 once deleted. */
+  u32 type;                /**< Tag of the element type's name. */
+  u32 size;                /**< Number of entries. */
+  struct ll_entry_t *head; /**< First entry; NULL when the list is empty. */
+} ll_list_t;
+
+/** One entry of a typed list, allocated by @ref ll_create_entry. */
+typedef struct ll_entry_t {
+  void *data;              /**< The payload; owned by the entry. */
+  struct ll_entry_t *next; /**< Following entry; NULL at the end of the list. */
+  ll_list_t *list;         /**< The list that holds the entry; NULL while it is in none. */
+  u32 type;                /**< Tag of the element type's name. */
+} ll_entry_t;
+
+/**
+ * Initialises a head: no entries, its magic, the tag of @p type.
+ *
+ * A head that is initialised already is refused and left unchanged. A head with any other content is accepted.
+ *
+ * @param list the head; its owner zero-fills it beforehand.
+ * @param type name of the element type, NUL-terminated.
+ */
+EDID_COMPOSER_API bool ll_init(ll_list_t *list, const char *type);
+
+/** Tells whether @p list is initialised at this address. Checks nothing else. Prints an error for a NULL list only. */
+EDID_COMPOSER_API bool ll_is_initialized(const ll_list_t *list);
+
+/** Tells whether @p list was initialised with the name @p type. A mismatch prints nothing; NULL arguments do. */
+EDID_COMPOSER_API bool ll_verify_list_type(const ll_list_t *list, const char *type);
+
+/**
+ * Verifies the whole list: initialised, its size equal to its number of entries, each entry in a list and of the list's
+ * type. The first failure is printed.
+ */
+EDID_COMPOSER_API bool ll_verify_integrity(const ll_list_t *list);
+
+/** @return the number of entries; 0 when @p list is NULL, not initialised or corrupt (which is printed). */
+EDID_COMPOSER_API i32 ll_size(const ll_list_t *list);
+
+/**
+ * Creates an entry that is in no list yet, with a zero-filled payload.
+ *
+ * The caller owns the entry until a list has accepted it, and deletes it with @ref ll_delete_entry if none does.
+ * Two heap allocations: the entry and its payload.
+ *
+ * @param size payload size in bytes, 1 or more.
+ * @param entry receives the entry.
+ * @param data receives the entry's payload, lent.
+ * @param type name of the element type, NUL-terminated.
+ * @return false for a bad argument or a failed allocation; what the outputs then hold must not be used.
+ */
+EDID_COMPOSER_API bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type);
+
+/** Frees an entry that is in no list, and its payload. It does not unlink. */
+EDID_COMPOSER_API bool ll_delete_entry(ll_entry_t *delete_entry);
+
+/** Unlinks and frees the entry at position @p index, 0 being the first. */
+EDID_COMPOSER_API bool ll_delete_entry_at(ll_list_t *list, u32 index);
+
+/** Appends an entry of the list's type; the list then owns it. On failure it stays the caller's. */
+EDID_COMPOSER_API bool ll_add_entry_to_back(ll_list_t *list, ll_entry_t *new_entry);
+
+/** Prepends an entry of the list's type; the list then owns it. On failure it stays the caller's. */
+EDID_COMPOSER_API bool ll_add_entry_to_front(ll_list_t *list, ll_entry_t *new_entry);
+
+/**
+ * Lends the payload of the entry at position @p index.
+ *
+ * @param list the list.
+ * @param index 0 to size - 1.
+ * @param entry_data receives the payload, which the list keeps owning; NULL on failure.
+ */
+EDID_COMPOSER_API bool ll_entry_at(const ll_list_t *list, i32 index, void **entry_data);
+
+/** Frees every entry and leaves the head uninitialised (magic 0), also when an entry could not be freed. */
+EDID_COMPOSER_API bool ll_delete_list(ll_list_t *list);
+
+/**
+ * Appends copies of the entries of @p src_list to @p dst_list, in order.
+ *
+ * Copies made before a failure stay in the destination. Each copy carries its source entry's type tag, so that copying
+ * into a list of another type fails at the first entry.
+ *
+ * @param src_list read only.
+ * @param dst_list an initialised list; what it holds stays ahead of the copies.
+ * @param size payload size in bytes. Lists do not record it: it must be the size the entries were created with.
+ */
+EDID_COMPOSER_API bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size);
+/** @} */
+
+/** @defgroup records EDID records
+ * @{ */
+
+/**
+ * One detailed timing (EDID 1.3, section 3.10.2, table 3.16). Entry of lists of type "detailed_timing_t".
+ *
+ * Written by the decoders and by @ref convert_vic_to_dtd.
+ */
+typedef struct detailed_timing_t {
+  u8 valid;          /**< 1 when the record holds a timing. The report skips, the encoder refuses entries with 0. */
+  u32 pixel_clock;   /**< Pixel clock, Hz. Stored in units of 10 kHz: 0 to 655350000. */
+  u32 h_active;      /**< Horizontal active pixels, 0 to 4095. */
+  u32 h_blanking;    /**< Horizontal blanking pixels, 0 to 4095. */
+  u32 h_sync_offset; /**< Horizontal front porch, pixels, 0 to 1023. */
+  u32 h_sync_width;  /**< Horizontal sync pulse width, pixels, 0 to 1023. */
+  u8 h_border;       /**< Horizontal border, pixels. */
+  u32 v_active;      /**< Vertical active lines, per field when interlaced, 0 to 4095. */
+  u32 v_blanking;    /**< Vertical blanking lines, per field when interlaced, 0 to 4095. */
+  u32 v_sync_offset; /**< Vertical front porch, lines, 0 to 63. */
+  u32 v_sync_width;  /**< Vertical sync pulse width, lines, 0 to 63. */
+  u8 v_border;       /**< Vertical border, lines. */
+  u32 h_image_size;  /**< Horizontal image size, mm, 0 to 4095; 0 when not given. */
+  u32 v_image_size;  /**< Vertical image size, mm, 0 to 4095; 0 when not given. */
+  u8 progressive;    /**< 1 progressive, 0 interlaced. */
+  u8 stereo;         /**< 1 when the descriptor's stereo bits are not 00. Never encoded. */
+  u8 h_sync_positive; /**< 1 when the horizontal sync is positive. */
+  u8 v_sync_positive; /**< 1 when the vertical sync is positive. */
+} detailed_timing_t;
+
+/** One standard timing (EDID 1.3, section 3.9, table 3.15). Entry of lists of type "std_timing_t". */
+typedef struct std_timing_t {
+  u32 h_active;     /**< Horizontal active pixels, 248 to 2288, a multiple of 8. */
+  u32 aspect_ratio; /**< Aspect-ratio code: 0 = 1:1, 1 = 4:3, 2 = 5:4, 3 = 16:9. */
+  u32 refresh_rate; /**< Vertical refresh, Hz, 60 to 123. */
+} std_timing_t;
+
+/** One short video descriptor (CEA-861, section 7.5.1). Entry of lists of type "short_video_desc_t". */
+typedef struct short_video_desc_t {
+  u8 native;  /**< 1 when the descriptor's native bit is set. */
+  u32 vic;    /**< Video identification code (CEA-861, table 4), 1 to 127. */
+  u32 stereo; /**< Mask of the 3D structures (HDMI 1.4a, table H-2) of the mode; see @ref stereo_mask. 0 = no 3D. */
+} short_video_desc_t;
+
+/** Bits of @ref short_video_desc_t::stereo. */
+enum stereo_mask {
+  STEREO_FRAME_PACKING = 0x01,              /**< FP: frame packing. */
+  STEREO_SIDE_BY_SIDE_HALF = 0x02,          /**< SBSH: side-by-side (half). */
+  STEREO_TOP_AND_BOTTOM = 0x04,             /**< TBH: top-and-bottom. */
+  STEREO_FIELD_ALTERNATIVE = 0x08,          /**< FA: field alternative. */
+  STEREO_LINE_ALTERNATIVE = 0x10,           /**< LA: line alternative. */
+  STEREO_SIDE_BY_SIDE_FULL = 0x20,          /**< SBSF: side-by-side (full). */
+  STEREO_L_DEPTH = 0x40,                    /**< LD: L + depth. */
+  STEREO_L_DEPTH_GRAPHICS = 0x80            /**< LDGD: L + depth + graphics + graphics-depth. */
+};
+
+/**
+ * One short audio descriptor (CEA-861, section 7.5.2). Entry of lists of type "short_audio_desc_t".
+ *
+ * Fields that do not apply to a type are 0.
+ */
+typedef struct short_audio_desc_t {
+  u32 type;        /**< Audio format code 1 to 14 (CEA-861, table 37); 16 HE-AAC, 17 HE-AACv2, 18 MPEG Surround for the
+                        extension codes 1 to 3 of format 15; 0 for any other extension code. */
+  u32 channels;    /**< Maximum number of channels, 1 to 8. */
+  u32 frequencies; /**< Sample-rate mask: bits 0 to 6 are 32, 44.1, 48, 88.2, 96, 176.4 and 192 kHz. */
+  u32 pcm_bits;    /**< Type 1: sample-size mask, bits 0 to 2 are 16, 20 and 24 bit. */
+  u32 max_bitrate; /**< Types 2 to 8: maximum bit rate, kHz, a multiple of 8, 0 to 2040. */
+  u32 value;       /**< Types 9 to 13: the format-dependent third byte, as stored. */
+  u32 wma_profile; /**< Type 14: profile, 0 to 7. */
+} short_audio_desc_t;
+
+/**
+ * The decoded form of one display's EDID: the base block and at most one CEA-861 extension.
+ *
+ * Prepared by @ref edid_prepare, filled by the decoders (@ref decode_edid_block_0, @ref decode_edid_extensions) or by the
+ * composer, released by @ref edid_destroy. Must not be copied or moved while prepared (see @ref linked_list).
+ * Offsets below are bytes of the base block (EDID 1.3, table 3.1) or of the extension (CEA-861, table 27); "VSDB" is the
+ * HDMI vendor-specific data block (HDMI 1.4a, section 8.3.2).
+ */
+typedef struct edid_t {
+  /* Base block */
+  u8 valid;           /**< 1 once the header was verified, even if the checksum then failed. */
+  char manufacturer[4]; /**< Three-letter manufacturer ID and NUL (bytes 8-9). */
+  u32 product_code;   /**< Product code, 0 to 65535 (bytes 10-11). */
+  u32 serial_number;  /**< Serial number (bytes 12-15). */
+  u8 week;            /**< Week of manufacture, as stored (byte 16). */
+  u32 year;           /**< Year of manufacture, 1990 to 2245 (byte 17). */
+  u8 version;         /**< EDID version; the decoder requires 1 (byte 18). */
+  u8 revision;        /**< EDID revision; the decoder requires 3 or more (byte 19). */
+  u8 digital;         /**< 1 when the video input is digital (byte 20). */
+  u8 h_size_cm;       /**< Maximum horizontal image size, cm; 0 = undefined (byte 21). */
+  u8 v_size_cm;       /**< Maximum vertical image size, cm; 0 = undefined (byte 22). */
+  u32 gamma;          /**< Gamma as stored: gamma x 100 - 100, 0 to 255 (byte 23). */
+  u8 standby;         /**< 1 when DPMS stand-by is supported (byte 24, bit 7). */
+  u8 suspend;         /**< 1 when DPMS suspend is supported (byte 24, bit 6). */
+  u8 active_off;      /**< 1 when DPMS active-off is supported (byte 24, bit 5). */
+  u8 standard_colorspace; /**< 1 when sRGB is the default colour space (byte 24, bit 2). */
+  u8 preferred_timing; /**< 1 when the first detailed timing is the preferred mode (byte 24, bit 1). */
+  u8 gtf;             /**< 1 when default GTF is supported (byte 24, bit 0). */
+  u32 red_x;          /**< Chromaticity, 10 bits, value / 1024 (bytes 25-34). */
+  u32 red_y;          /**< Chromaticity of red, y. */
+  u32 green_x;        /**< Chromaticity of green, x. */
+  u32 green_y;        /**< Chromaticity of green, y. */
+  u32 blue_x;         /**< Chromaticity of blue, x. */
+  u32 blue_y;         /**< Chromaticity of blue, y. */
+  u32 white_x;        /**< Chromaticity of white, x. */
+  u32 white_y;        /**< Chromaticity of white, y. */
+  u32 est_timings_1;  /**< Established timings I, bit mask (byte 35). */
+  u32 est_timings_2;  /**< Established timings II, bit mask (byte 36). */
+  u32 man_timings;    /**< Manufacturer's reserved timings, bit mask (byte 37). */
+  ll_list_t std_timings; /**< Standard timings, list of @ref std_timing_t in block order (bytes 38-53). */
+  ll_list_t dtd_list; /**< Detailed timings, list of @ref detailed_timing_t: base block first, then extension. */
+  char serial_string[14]; /**< Serial number text of descriptor 0xFF, up to 13 characters and NUL. */
+  char data_string[14]; /**< Text of descriptor 0xFE, up to 13 characters and NUL. */
+  char monitor_name[14]; /**< Monitor name of descriptor 0xFC, up to 13 characters and NUL. */
+  u8 min_v_rate;      /**< Range limits: minimum vertical rate, Hz (descriptor 0xFD). */
+  u8 max_v_rate;      /**< Range limits: maximum vertical rate, Hz. */
+  u8 min_h_rate;      /**< Range limits: minimum horizontal rate, kHz. */
+  u8 max_h_rate;      /**< Range limits: maximum horizontal rate, kHz. */
+  u32 max_pixel_clock; /**< Range limits: maximum pixel clock, MHz, a multiple of 10. */
+  u8 extension_count; /**< Number of extension blocks announced (byte 126). */
+  u8 checksum;        /**< The base block's stored checksum (byte 127). */
+  /* CEA-861 extension */
+  u8 underscan;       /**< 1 when the sink underscans IT formats by default (byte 3, bit 7). */
+  u8 basic_audio;     /**< 1 when basic audio is supported (byte 3, bit 6). */
+  u8 ycbcr_444;       /**< 1 when YCbCr 4:4:4 is supported (byte 3, bit 5). */
+  u8 ycbcr_422;       /**< 1 when YCbCr 4:2:2 is supported (byte 3, bit 4). */
+  ll_list_t video_list; /**< Short video descriptors, list of @ref short_video_desc_t in block order. */
+  ll_list_t audio_list; /**< Short audio descriptors, list of @ref short_audio_desc_t in block order. */
+  u8 speaker[3];      /**< Payload of the speaker allocation data block (CEA-861, table 44). */
+  /* HDMI vendor-specific data block */
+  u8 hdmi_present;    /**< 1 when a VSDB of at least 5 payload bytes was decoded. */
+  u8 physical_address[4]; /**< CEC physical address a.b.c.d, 0 to 15 each; the encoder writes the low nibbles. */
+  u8 dc_48bit;        /**< 1 when 48-bit deep colour is supported. */
+  u8 dc_36bit;        /**< 1 when 36-bit deep colour is supported. */
+  u8 dc_30bit;        /**< 1 when 30-bit deep colour is supported. */
+  u8 dc_y444;         /**< 1 when deep colour is supported in YCbCr 4:4:4 too. */
+  u8 dvi_dual;        /**< 1 when DVI dual-link is supported. */
+  u32 max_tmds_clock; /**< Maximum TMDS clock, MHz, a multiple of 5, 0 to 1275; 0 when not given. */
+  u8 supports_ai;     /**< 1 when ACP, ISRC1 and ISRC2 packets are supported (Supports_AI). */
+  u8 cnc0;            /**< 1 when content type graphics is supported. */
+  u8 cnc1;            /**< 1 when content type photo is supported. */
+  u8 cnc2;            /**< 1 when content type cinema is supported. */
+  u8 cnc3;            /**< 1 when content type game is supported. */
+  u8 hdmi_video_present; /**< 1 when the VSDB carries HDMI video fields (3D and 4Kx2K). */
+  u16 video_latency;  /**< Progressive video latency, ms. 0 when not given; above 500: no valid latency. */
+  u16 audio_latency;  /**< Progressive audio latency, ms. */
+  u16 i_video_latency; /**< Interlaced video latency, ms. */
+  u16 i_audio_latency; /**< Interlaced audio latency, ms. */
+  u8 hdmi_3d_present; /**< 1 when the mandatory 3D formats are supported (HDMI 1.4a, section 8.3.2, 3D_present). */
+  u8 image_size;      /**< Image_Size code, 0 to 3. */
+  u8 hdmi_vic_len;    /**< Number of valid codes in @ref hdmi_vic, 0 to 7. */
+  u32 hdmi_vic[7];    /**< HDMI_VIC codes (HDMI 1.4a, table 8-13): 1 3840x2160p30, 2 3840x2160p25, 3 3840x2160p24,
+                           4 4096x2160p24. */
+  /* Colorimetry data block */
+  u8 xvycc601;        /**< 1 when xvYCC601 is supported (CEA-861, section 7.5.5). */
+  u8 xvycc709;        /**< 1 when xvYCC709 is supported. */
+} edid_t;
+
+/** A video mode as a platform describes one. */
+typedef struct video_mode_t {
+  u32 width;      /**< Active pixels per line. */
+  u32 height;     /**< Active lines per frame: 1080 for 1080i. */
+  u32 interlaced; /**< 1 interlaced; anything else progressive. */
+  u32 refresh;    /**< Whole Hz; the field rate of an interlaced mode. */
+} video_mode_t;
+
+/**
+ * Prepares a record: clears every field and initialises its four lists.
+ *
+ * Must be called on every record before it is decoded into, filled or encoded. A record that still holds lists loses
+ * them: destroy it first.
+ *
+ * @param edid the record, with any content. Must not be NULL.
+ * @return 1 on success. On failure one error line of module `edid_decode_encode`, and 0.
+ */
+EDID_COMPOSER_API u8 edid_prepare(edid_t *edid);
+
+/**
+ * Releases the four lists of a prepared record, once. The other fields keep their values.
+ *
+ * @param edid a prepared record, also one whose decoding failed. Must not be NULL.
+ * @return 1 on success. 0 with one error line when a list is not initialised (nothing is deleted then) or cannot be
+ *         deleted.
+ */
+EDID_COMPOSER_API u8 edid_destroy(edid_t *edid);
+/** @} */
+
+/** @defgroup platform_values Platform values
+ * @{ */
+
+/**
+ * Everything that the platform configuration says about the EDID to compose.
+ *
+ * @ref compose_edid reads one from the configuration tree for each composition. A host that has other sources fills one
+ * itself, once prepared by @ref platform_values_init, and hands it to @ref compose_edid_internal. Ranges are those that
+ * the configuration allows; "tri-state" is 0 off, 1 on, 2 as the downstream sink. Must not be copied or moved while
+ * initialised (see @ref linked_list).
+ */
+typedef struct platform_values_t {
+  ll_list_t audio_list;          /**< Platform audio formats: list of "int" (@ref i32), each a short audio descriptor with
+                                      its byte 1 in bits 0-7, byte 2 in bits 8-15, byte 3 in bits 16-23. */
+  ll_list_t video_50_priority;   /**< Modes to offer on a 50 Hz sink, best first: list of @ref short_video_desc_t. */
+  ll_list_t video_50_additional; /**< Modes that a 50 Hz sink counts as able to show, whatever its EDID says. */
+  ll_list_t video_60_priority;   /**< Modes to offer on a 60 Hz sink, best first. */
+  ll_list_t video_60_additional; /**< Modes that a 60 Hz sink counts as able to show, whatever its EDID says. */
+  i32 modes_4k_x_2k_priority[7]; /**< HDMI_VICs to offer, best first, 1 to 4 each; the first 0 ends the list. */
+  i32 modes_4k_x_2k_addition[7]; /**< HDMI_VICs that the sink counts as able to show; the first 0 ends the list. */
+  i32 native_refresh_rate;       /**< Refresh family when the sink's EDID doesn't tell: 50 or 60. */
+  i32 current_mode_set_to_priority; /**< 1: put the current output mode first. */
+  i32 geometry_limit;            /**< 1: drop modes taller than the sink's tallest short video descriptor. */
+  i32 audio_pass_through;        /**< 0 platform formats, 1 platform and sink formats, 2 sink formats. */
+  i32 underscan;                 /**< 1: declare that IT formats are underscanned. */
+  i32 is_tv;                     /**< 1: the platform is the root of the CEC tree. */
+  i32 dc_30bit;                  /**< 1: offer 30-bit deep colour (36-bit is then offered too). */
+  i32 dc_36bit;                  /**< 1: offer 36-bit deep colour. */
+  i32 tmds_override;             /**< Maximum TMDS clock, MHz, from 25 to 1275; 0 to compute it; 1 to 24 to compute and
+                                      declare it always. */
+  i32 supports_ai;               /**< ACP, ISRC1 and ISRC2 packets, tri-state. */
+  i32 speaker_entry;             /**< Speaker allocation bits (CEA-861, table 44), 1 to 2047. */
+  i32 xvYCC601;                  /**< xvYCC601 colorimetry, tri-state. */
+  i32 xvYCC709;                  /**< xvYCC709 colorimetry, tri-state. */
+  i32 native_bit;                /**< 1: the encoder sets the native bit of the first short video descriptor and of those
+                                      marked native. */
+  u32 product_id;                /**< Product code, 0 to 65535. */
+  u32 serial;                    /**< Serial number. */
+  u32 week;                      /**< Week of manufacture, 0 to 53; 255 for a model year. */
+  u32 year;                      /**< Year of manufacture, 1990 to 2100. */
+  u32 cnc0;                      /**< Content type graphics, tri-state. */
+  u32 cnc1;                      /**< Content type photo, tri-state. */
+  u32 cnc2;                      /**< Content type cinema, tri-state. */
+  u32 cnc3;                      /**< Content type game, tri-state. */
+  char manufacturer_id[4];       /**< Three-letter manufacturer ID and NUL. */
+  char monitor_name[14];         /**< Monitor name, up to 13 characters and NUL. Empty, one character or a leading blank:
+                                      no name descriptor. */
+  char monitor_serial[14];       /**< Serial number text, up to 13 characters and NUL; rules as for the name. */
+  u32 established_timings_1;     /**< Established timings I, bits 0 to 7. 640x480 at 60 Hz is always added. */
+  u32 established_timings_2;     /**< Established timings II, bits 0 to 7. */
+  u32 manufacturer_timings;      /**< Manufacturer's reserved timings, bits 0 to 7. */
+  ll_list_t std_timings;         /**< Standard timings to offer: list of @ref std_timing_t; the first 8 are encoded. */
+} platform_values_t;
+
+/**
+ * Clears a record and initialises its six lists.
+ *
+ * @param values the record, with any content; lists that it still holds are lost.
+ * @return true on success; false with a bug line of module `utility` that names the first list that failed.
+ */
+EDID_COMPOSER_API bool platform_values_init(platform_values_t *values);
+
+/**
+ * Releases the six lists of an initialised record, once.
+ *
+ * @return true on success; false with a bug line that names the first list that could not be deleted. The lists behind it
+ *         then keep their entries.
+ */
+EDID_COMPOSER_API bool platform_values_destroy(platform_values_t *values);
+
+/**
+ * Traces the name of a configuration node, as "label:Name of node is:name". Prints nothing while tracing is off.
+ *
+ * @param node a node handle of the host's configuration tree.
+ * @param label NUL-terminated text.
+ */
+EDID_COMPOSER_API void print_platform_node(u32 node, const char *label);
+/** @} */
+
+/** @defgroup composing Composing an EDID
+ * @{ */
+
+/** The caller's settings of one composition; only read, but for the byte that @ref spa_offset points at. */
+typedef struct compose_cfg_t {
+  video_mode_t hdmi_current_mode; /**< The mode the platform puts out now. Used when the platform's
+                                       current_mode_set_to_priority is 1 and the mode is plausible: height 100 to 8000,
+                                       width 400 to 16000, refresh 20 to 1000, interlaced 0 or 1. */
+  u32 audio_mask;        /**< Audio formats that may be offered: types 1 to 14 are bits 0 to 13; types 16, 17, 18 are
+                              bits 14, 15, 16. All ones: every format. */
+  u32 audio_sink_filter; /**< Exactly 1: offer only audio formats that the sink supports too. */
+  i32 hdmi_3d_mode;      /**< 2: always offer 3D; 1: as the sink; anything else: never. */
+  u32 edid_latency[4];   /**< The platform's own video, audio, interlaced video and interlaced audio latency, ms; added to
+                              the sink's. Above 500: no valid latency. */
+  u8 *spa_offset;        /**< Receives the offset, within the 256 bytes, of the two bytes of the physical address, so that
+                              a host can patch it for each input. May be NULL. */
+  u32 port;              /**< Zero-based number of the platform's input; the physical address uses port + 1, 8 bits. */
+} compose_cfg_t;
+
+/**
+ * Composes the EDID that the platform shows on its input.
+ *
+ * Reads the platform configuration through the host's `config_*` operations. A sink EDID that is missing or malformed is
+ * reported, not refused: the composition goes on with what could be decoded.
+ *
+ * Prints errors and warnings of module `edid_composer`, and, while tracing is on, every decision and both EDIDs in
+ * hexadecimal.
+ *
+ * @param edid_block the sink's EDID, or NULL when there is none. Its first @p edid_bytes bytes are read.
+ * @param edid_bytes its size in bytes; a multiple of 128 other than 0, else the sink's EDID is left out. Block 1 is
+ *        decoded as CEA-861 extension when the base block announces one.
+ * @param new_edid_block the caller's buffer for the new EDID. It may be the buffer of @p edid_block.
+ * @param new_edid_bytes its size in bytes; 256.
+ * @param cfg the settings; not NULL.
+ * @return true when the new EDID was written: base block and CEA-861 extension, 256 bytes. On false the buffer's content
+ *         is undefined, but nothing outside of it was written.
+ */
+EDID_COMPOSER_API bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
+                                    const compose_cfg_t *cfg);
+
+/**
+ * As @ref compose_edid, with platform values that the caller has at hand.
+ *
+ * @param edid_block as for @ref compose_edid.
+ * @param edid_bytes as for @ref compose_edid.
+ * @param new_edid_block as for @ref compose_edid.
+ * @param new_edid_bytes as for @ref compose_edid.
+ * @param cfg as for @ref compose_edid.
+ * @param platform_values an initialised record, which is only read and stays the caller's: several threads may compose
+ *        from one. No configuration is read then. NULL: the configuration is read.
+ * @return as for @ref compose_edid; false also when @p platform_values is not initialised.
+ */
+EDID_COMPOSER_API bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
+                                             const compose_cfg_t *cfg, const platform_values_t *platform_values);
+/** @} */
+
+/** @defgroup inspection Looking at an EDID
+ * @{ */
+
+/**
+ * Decodes an EDID and prints its report. When decoding fails only the error lines are printed.
+ *
+ * @param edid_block the EDID. 128 bytes must be there even when @p size is 0.
+ * @param size its size in bytes, a multiple of 128. From 256 on, block 1 is decoded as CEA-861 extension.
+ * @param brief nonzero for the brief report (identity, video, audio, physical address), 0 for every field.
+ * @param title first line of the report, NUL-terminated; NULL prints as an empty one.
+ */
+EDID_COMPOSER_API void print_edid(const u8 *edid_block, u32 size, u8 brief, const char *title);
+
+/**
+ * Prints an audio mask (see @ref compose_cfg_t::audio_mask) in words, as one line.
+ *
+ * @param mask 0xFFFFFFFF prints "All audio formats supported", 0 prints "No audio formats". Bits 17 to 31 have no name.
+ */
+EDID_COMPOSER_API void print_edid_audio_mask(u32 mask);
+/** @} */
+
+/** @defgroup codec Decoding and encoding
+ * @{ */
+
+/**
+ * Decodes a base block (EDID 1.3, table 3.1) into a record: identity, features, timings and descriptors.
+ *
+ * @param edid_block exactly 128 bytes are read.
+ * @param edid a prepared record; decoding only adds to it.
+ * @return 1 on success. 0, with one error line, at the first hard error: a NULL argument, a record that is not prepared, a
+ *         bad header, checksum or version, a malformed descriptor. The record keeps what was decoded before, and must be
+ *         destroyed all the same.
+ */
+EDID_COMPOSER_API u8 decode_edid_block_0(const u8 *edid_block, edid_t *edid);
+
+/**
+ * Decodes a CEA-861 extension of revision 3 (CEA-861, section 7.5), with the HDMI vendor-specific data block (HDMI 1.4a,
+ * section 8.3.2), into a record.
+ *
+ * @param edid_extension the extension block.
+ * @param length number of bytes there; none is read behind them, and what is missing of a block reads as 0. More than 128
+ *        bytes: detailed timings are looked for in the blocks that follow as well.
+ * @param edid the record that the base block was decoded into; its lists are appended to.
+ * @return 1 on success; 0, with one error line, for a NULL argument, another tag or revision, a bad checksum, or a data
+ *         block that overruns its collection. The record keeps what was decoded before.
+ */
+EDID_COMPOSER_API u8 decode_edid_extensions(const u8 *edid_extension, u32 length, edid_t *edid);
+
+/**
+ * Decodes the three bytes of a short audio descriptor (CEA-861, section 7.5.2).
+ *
+ * @param byte1 format code and number of channels.
+ * @param byte2 sample rates.
+ * @param byte3 depends on the format code.
+ * @param audio the descriptor; cleared first.
+ * @return 1 on success; 0, with one error line, when @p audio is NULL or the format code is 0.
+ */
+EDID_COMPOSER_API u8 decode_edid_short_audio(u8 byte1, u8 byte2, u8 byte3, short_audio_desc_t *audio);
+
+/**
+ * Encodes a record as base block and CEA-861 extension with the HDMI vendor-specific data block.
+ *
+ * At most 8 standard timings, 32 short video descriptors and 10 short audio descriptors are written; more of the latter
+ * two give a warning. What does not fit the extension is not written, and one error line tells how many bytes it needed;
+ * the result does not change by it.
+ *
+ * @param edid_blocks receives the bytes; nothing is written outside of them.
+ * @param size must be 256.
+ * @param edid the record, prepared, with exactly 2 detailed timings. Changed in two places: mandatory 3D structures are
+ *        cleared from its video list's 3D masks, and audio types 16 to 18 become 15. So one record must not be encoded by
+ *        two threads at once.
+ * @param spa_offset receives the offset of the physical address within @p edid_blocks; may be NULL.
+ * @param values its native_bit is read; not NULL.
+ * @return 1 on success; 0 with one error or bug line. For a bad argument the buffer is untouched, otherwise it is partly
+ *         written.
+ */
+EDID_COMPOSER_API u8 encode_edid(u8 *edid_blocks, i32 size, edid_t *edid, u8 *spa_offset, const platform_values_t *values);
+
+/**
+ * Encodes a latency (HDMI 1.4a, section 8.3.2, Video_Latency).
+ *
+ * @param latency_ms milliseconds.
+ * @return latency_ms / 2 + 1; 251, which stands for 500 ms, for 501 to 65534 ms; 255 (not supported) for 65535.
+ */
+EDID_COMPOSER_API u8 encode_edid_latency_value(u16 latency_ms);
+
+/**
+ * Prints a decoded record as a report on standard output.
+ *
+ * @param edid a prepared record.
+ * @param brief nonzero for the brief report, 0 for every field. The long report of a record that is not valid is its title.
+ * @param title first line, NUL-terminated; NULL prints as an empty one.
+ * @return 1; 0 with an error line when @p edid is NULL.
+ */
+EDID_COMPOSER_API u8 print_edid_struct(const edid_t *edid, u8 brief, const char *title);
+/** @} */
+
+/** @defgroup timings Video timings
+ *
+ * Conversions between video identification codes (VICs 1 to 64 of CEA-861, table 4), timings and modes. They answer 1 when
+ * a match was found and 0 otherwise; bad arguments print an error line of module `utility`.
+ * @{ */
+
+/** Fills @p timing with the timing of @p vic, 1 to 64. Any other VIC prints a warning and leaves @p timing unchanged. */
+EDID_COMPOSER_API u8 convert_vic_to_dtd(u32 vic, detailed_timing_t *timing);
+
+/**
+ * Finds the VIC of a detailed timing: equal pixel clock, scan, horizontal active and blanking pixels, vertical active lines
+ * and picture aspect ratio.
+ *
+ * @param edid its monitor size gives the aspect ratio of a timing without image size.
+ * @param timing the timing.
+ * @param vic receives the VIC; 0 when there is none.
+ */
+EDID_COMPOSER_API u8 convert_dtd_to_vic(const edid_t *edid, const detailed_timing_t *timing, u32 *vic);
+
+/** Finds the VIC of a standard timing. @p edid is only tested for NULL. @p vic receives the VIC; 0 when there is none. */
+EDID_COMPOSER_API u8 convert_std_to_vic(const edid_t *edid, const std_timing_t *timing, u32 *vic);
+
+/** Finds the first VIC with the size, scan and whole refresh rate of @p mode. @p vic is untouched when there is none. */
+EDID_COMPOSER_API u8 mode_to_vic(const video_mode_t *mode, u32 *vic);
+
+/**
+ * Classifies a size into an aspect-ratio code: 0 = 1:1, 1 = 4:3, 2 = 5:4, 3 = 16:9.
+ *
+ * @param width pixels, mm or cm.
+ * @param height in the same unit.
+ * @param ratio receives the code; untouched when the size is none of the four.
+ */
+EDID_COMPOSER_API u8 convert_geo_to_ratio(u32 width, u32 height, u32 *ratio);
+
+/**
+ * The refresh rate of a timing: (pixel_clock / (h_active + h_blanking)) / (v_active + v_blanking), each division truncated.
+ *
+ * @return whole Hz, the field rate of an interlaced timing; 0 when a total is 0.
+ */
+EDID_COMPOSER_API u32 calculate_refresh_rate(u32 pixel_clock, u32 h_active, u32 h_blanking, u32 v_active, u32 v_blanking);
+/** @} */
+
+/** @defgroup names Names and printers
+ *
+ * Name functions answer a read-only text, never NULL, valid as long as the library is loaded. Unknown values have a text
+ * too.
+ * @{ */
+
+/** Name of an aspect-ratio code, such as "16:9"; "InvalidRatio" above 3. */
+EDID_COMPOSER_API const char *std_aspect_string(u32 ratio);
+/** Name of an audio type (@ref short_audio_desc_t::type); "AUDIO_TYPE_UNKNOWN" above 18. */
+EDID_COMPOSER_API const char *short_audio_string(u32 type);
+/** Name of an HDMI_VIC, such as "3840x2160p30Hz"; "Unknown Value" for any but 1 to 4. */
+EDID_COMPOSER_API const char *hdmi_vic_string(u32 hdmi_vic);
+/** Name of one bit value (1 << bit) of established timings I; "Unknown Value" for any other value. */
+EDID_COMPOSER_API const char *est_timing_1_string(u32 bit);
+/** Name of one bit value (1 << bit) of established timings II; "Unknown Value" for any other value. */
+EDID_COMPOSER_API const char *est_timing_2_string(u32 bit);
+/** Name of one bit value (1 << bit) of the manufacturer's reserved timings; "Unknown Value" for any other value. */
+EDID_COMPOSER_API const char *man_timing_string(u32 bit);
+/** Name of a VIC, such as "1920x1080p60Hz16x9"; "Unknown Value" for any but 1 to 64. */
+EDID_COMPOSER_API const char *short_video_timing_string(u32 vic);
+
+/**
+ * Writes the names of the set bits of a sample-rate mask, each followed by a blank.
+ *
+ * @param freq_mask see @ref short_audio_desc_t::frequencies. 0 gives " NoFreqSpecified".
+ * @param string receives the text; cleared first.
+ * @param string_len its size in bytes, 17 or more; a longer text is cut.
+ * @return the length of the whole text; 0, with an error line, for a bad argument.
+ */
+EDID_COMPOSER_API int audio_freq_string(u32 freq_mask, char *string, u32 string_len);
+
+/** As @ref audio_freq_string, for a sample-size mask (@ref short_audio_desc_t::pcm_bits). 0 gives " NoBitsSpecified". */
+EDID_COMPOSER_API int audio_pcm_bits_string(u32 bits_mask, char *string, u32 string_len);
+
+/** Prints the speakers of a speaker allocation payload (CEA-861, table 44) as one line. @p byte3 is not used. */
+EDID_COMPOSER_API void print_speaker(u8 byte1, u8 byte2, u8 byte3);
+
+/** Prints a short audio descriptor as one line. NULL prints an error line. */
+EDID_COMPOSER_API void print_audio_structure(const short_audio_desc_t *audio);
+
+/** Prints the short names of a 3D mask's bits, each followed by a blank, without a newline; a single blank for 0. */
+EDID_COMPOSER_API void print_stereo_type(u32 stereo_mask);
+
+/**
+ * Prints a titled list of the timings of an established or manufacturer's timing byte; nothing when @p bits is 0.
+ *
+ * @param bits the byte; bits 7 to 0 are listed.
+ * @param string_func names one bit value: @ref est_timing_1_string, @ref est_timing_2_string or @ref man_timing_string.
+ *        NULL prints a bug line.
+ * @param str the title, NUL-terminated. NULL or empty prints a bug line.
+ */
+EDID_COMPOSER_API void print_est_man_type(u32 bits, const char *(*string_func)(u32), const char *str);
+
+/** For each bit of 3D_Structure_ALL (HDMI 1.4a, table 8-14), the bit of @ref stereo_mask that it stands for, or 0. */
+EDID_COMPOSER_API extern const u32 _3d_struct_all_array[16];
+
+/** The mandatory 3D formats (HDMI 1.4a, section 8.2.3.2): VIC and mask of the structures that 3D_present implies. */
+EDID_COMPOSER_API extern const short_video_desc_t _3d_man_modes[5];
+/** @} */
+
+/** @defgroup getters Configuration getters
+ *
+ * Read single values of the platform configuration, under the domain "platform.software.drivers.vorex.edid.". A problem
+ * never fails a getter: it yields the default or the nearest limit, with a warning of module `utility` if asked for.
+ * @{ */
+
+/**
+ * Reads a text.
+ *
+ * @param key relative to the domain, NUL-terminated.
+ * @param dst receives the text; the caller zero-fills it. A default as long as the field leaves it without a NUL.
+ * @param size its size in bytes.
+ * @param default_val the text to use when the key is absent or holds no text.
+ * @param print_warnings true to warn when the default is used.
+ * @return true when the text came from the configuration.
+ */
+EDID_COMPOSER_API bool get_pc_str(const char *key, char *dst, u32 size, const char *default_val, bool print_warnings);
+
+/**
+ * Reads an unsigned number.
+ *
+ * Limits that contradict each other are a programming error: the process is aborted, in every build type.
+ *
+ * @param key relative to the domain, NUL-terminated.
+ * @param min smallest value allowed.
+ * @param max largest value allowed.
+ * @param default_val used when the key is absent or holds no integer; min <= default_val <= max.
+ * @param print_warnings true to warn when the default or a limit is used.
+ * @return the value, min to max.
+ */
+EDID_COMPOSER_API u32 get_pc_uint(const char *key, u32 min, u32 max, u32 default_val, bool print_warnings);
+
+/** As @ref get_pc_uint, for a signed number. */
+EDID_COMPOSER_API i32 get_pc_int(const char *key, i32 min, i32 max, i32 default_val, bool print_warnings);
+/** @} */
+
+/** @defgroup host Operations that the host supplies
+ *
+ * The platform's configuration: a tree of named nodes that hold integers and strings. The library leaves these eight
+ * operations undefined; the process that loads it defines them. They answer 0 for success.
+ *
+ * A path is a sequence of node names separated by dots, from the root. @p root is always 0. Nodes are known by handles of
+ * the host's choice, which must stay valid for the duration of one call into the library. An operation that answers
+ * another status leaves its output alone.
+ * @{ */
+
+/** Reads the integer at @p path into @p value. Nonzero: no such node, or it holds no integer. */
+EDID_COMPOSER_API int config_get_int(u32 root, const char *path, i32 *value);
+/** Copies what fits of the string at @p path, with its NUL, into the @p size bytes of @p buffer. Nonzero: no string. */
+EDID_COMPOSER_API int config_get_str(u32 root, const char *path, char *buffer, u32 size);
+/** Finds the node at @p path. 2: not found; any other status counts as found. */
+EDID_COMPOSER_API int config_node_find(u32 root, const char *path, u32 *node);
+/** Finds the first child of @p node. 2: no children; any other status counts as found. */
+EDID_COMPOSER_API int config_node_first_child(u32 node, u32 *child);
+/** Finds the node behind @p node. Nonzero: it is the last one. */
+EDID_COMPOSER_API int config_node_next_sibling(u32 node, u32 *sibling);
+/** Copies what fits of the name of @p node (the last component of its path), with its NUL, into @p buffer. */
+EDID_COMPOSER_API int config_node_get_name(u32 node, char *buffer, u32 size);
+/** Reads the integer that @p node holds into @p value. Nonzero: it holds none. */
+EDID_COMPOSER_API int config_node_get_int(u32 node, i32 *value);
+/** Copies what fits of the string that @p node holds, with its NUL, into @p buffer. Nonzero: it holds none. */
+EDID_COMPOSER_API int config_node_get_str(u32 node, char *buffer, u32 size);
+/** @} */
+
+#ifdef __cplusplus
+}
+#endif
+
+#endif /* EDID_COMPOSER_H */

@@ -1,0 +1,372 @@
+#include "linked_list/linked_list.h"
+
+#include <cstdint>
+#include <cstdlib>
+#include <cstring>
+
+#include "diagnostics.h"
+
+namespace edid_composer {
+
+u32 _get_magic_number(const ll_list_t *list) {
+  constexpr u32 key = 0xA0A06060;
+  if (list == nullptr) {
+    LOG_ERROR("list ptr is NULL.%s", "");
+    return 0;
+  }
+  const auto bits = reinterpret_cast<std::uintptr_t>(list);
+  return static_cast<u32>(bits & 0xFFFFFFFF) ^ key;
+}
+
+u32 _calculate_str_checksum(const char *name) {
+  u32 tag = 0;
+  u32 shift = 0;
+  for (; *name != '\0'; ++name) {
+    const auto extended = static_cast<u32>(i32{static_cast<signed char>(*name)});
+    tag ^= extended << shift;
+    shift = (shift + 8) % 32;
+  }
+  return tag;
+}
+
+namespace {
+
+// The checks that both additions share; only their words for a type mismatch differ.
+bool accepts(const site_t &site, const ll_list_t *list, const ll_entry_t *new_entry) {
+  if (list == nullptr) {
+    LOG_ERROR_AS(site, "\"list\" parameter is NULL. list:%p", address(list));
+    return false;
+  }
+  if (!ll_verify_integrity(list)) {
+    LOG_BUG_AS(site, "List failed integrity test.%s", "");
+    return false;
+  }
+  if (new_entry == nullptr) {
+    LOG_ERROR_AS(site, "\"new_entry\" parameter is NULL. new_entry:%p", address(new_entry));
+    return false;
+  }
+  return true;
+}
+
+void report_range(const site_t &site, i32 index, u32 size) {
+  LOG_ERROR_AS(site, "Index Out of Range: Requesting a value outside the range of the list. Index:%d Size:%d", index,
+               size);
+}
+
+}  // namespace
+}  // namespace edid_composer
+
+using edid_composer::_calculate_str_checksum;
+using edid_composer::_get_magic_number;
+using edid_composer::accepts;
+using edid_composer::address;
+using edid_composer::report_range;
+
+bool ll_init(ll_list_t *list, const char *type) {
+  if (list == nullptr) {
+    LOG_ERROR("list ptr is NULL.%s", "");
+    return false;
+  }
+  if (type == nullptr) {
+    LOG_ERROR("\"type\" ptr is NULL. type=%p", address(type));
+    return false;
+  }
+  if (list->magic == _get_magic_number(list)) {
+    LOG_ERROR("List Corruption: This list has already been initialized. Ptr:%p MagicNum:%d", address(list),
+              list->magic);
+    return false;
+  }
+  list->size = 0;
+  list->head = nullptr;
+  list->magic = _get_magic_number(list);
+  list->type = _calculate_str_checksum(type);
+  if (!ll_verify_integrity(list)) {
+    LOG_BUG("Failed verifying the integrity of the list.%s", "");
+    return false;
+  }
+  return true;
+}
+
+bool ll_is_initialized(const ll_list_t *list) {
+  if (list == nullptr) {
+    LOG_ERROR("list ptr is NULL.%s", "");
+    return false;
+  }
+  return list->magic == _get_magic_number(list);
+}
+
+bool ll_verify_list_type(const ll_list_t *list, const char *type) {
+  if (list == nullptr) {
+    LOG_ERROR("list ptr is NULL.%s", "");
+    return false;
+  }
+  if (type == nullptr) {
+    LOG_ERROR("\"type\" ptr is NULL. type=%p", address(type));
+    return false;
+  }
+  return list->type == _calculate_str_checksum(type);
+}
+
+bool ll_verify_integrity(const ll_list_t *list) {
+  if (list == nullptr) {
+    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
+    return false;
+  }
+  if (const u32 magic = _get_magic_number(list); list->magic != magic) {
+    // kept: the stored magic stands under the label ExpectedMagic.
+    LOG_ERROR("Corrupt List: List not initialized. Ptr:%p ExpectedMagic:%d Magic:%d Size:%d Head:%p ", address(list),
+              list->magic, magic, list->size, address(list->head));
+    return false;
+  }
+  if (list->head == nullptr) {
+    if (list->size == 0) return true;
+    LOG_ERROR("Corrupt List: The list's head is NULL, but the size isn't zero. Size:%d", list->size);
+    return false;
+  }
+  if (list->size == 0) {
+    LOG_ERROR("Corrupt List: The list's size is zero, but the head isn't NULL. HeadPtr:%p", address(list->head));
+    return false;
+  }
+
+  const auto size = static_cast<i32>(list->size);
+  i32 counter = 0;
+  const ll_entry_t *entry = list->head;
+  do {
+    if (entry->list == nullptr) {
+      LOG_BUG("Corrupt List: An entry's list attribute is set to NULL. Ptr:%p", address(entry->list));
+      return false;
+    }
+    if (entry->type != list->type) {
+      LOG_BUG("Corrupt List: An entry's type does not match the lists. Count:%d", counter);
+      return false;
+    }
+    ++counter;
+    entry = entry->next;
+  } while (counter < size && entry != nullptr);
+
+  if (entry != nullptr) {
+    LOG_ERROR("Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d "
+              "NextPtr=%p",
+              counter, size, address(entry));
+    return false;
+  }
+  if (counter != size) {
+    // kept: the counted number stands under the label ListSize.
+    LOG_ERROR("Corrupt List: Either the list's size doesn't match the number of entries. ListSize:%d Counted:%d",
+              counter, size);
+    return false;
+  }
+  return true;
+}
+
+i32 ll_size(const ll_list_t *list) {
+  if (list == nullptr) {
+    LOG_ERROR("list ptr is NULL.%s", "");
+    return 0;
+  }
+  if (!ll_verify_integrity(list)) {
+    LOG_BUG("Failed integrity test. list:%p", address(list));
+    return 0;
+  }
+  return static_cast<i32>(list->size);
+}
+
+bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type) {
+  if (size < 1) {
+    LOG_ERROR("Create entry called with an invalid size. size:%d", size);
+    return false;
+  }
+  if (entry == nullptr) {
+    LOG_ERROR("\"entry\" pointer is NULL. entry:%p", address(entry));
+    return false;
+  }
+  if (data == nullptr) {
+    LOG_ERROR("\"data\" pointer is NULL. data:%p", address(data));
+    return false;
+  }
+  if (type == nullptr) {
+    LOG_ERROR("\"type\" pointer is NULL. type:%p", address(type));
+    return false;
+  }
+  *entry = nullptr;
+  *data = nullptr;
+
+  auto *const created = static_cast<ll_entry_t *>(std::calloc(1, sizeof(ll_entry_t)));
+  if (created == nullptr) {
+    LOG_BUG("calloc failed to allocate memory for the entry. ptr:%p", address(entry));
+    return false;
+  }
+  created->data = std::calloc(1, static_cast<std::size_t>(size));
+  if (created->data == nullptr) {
+    LOG_BUG("calloc failed to allocate memory for the data storage. ptr:%p", address(data));
+    std::free(created);
+    return false;
+  }
+  created->type = _calculate_str_checksum(type);
+  *entry = created;
+  *data = created->data;
+  return true;
+}
+
+bool ll_delete_entry(ll_entry_t *delete_entry) {
+  if (delete_entry == nullptr) {
+    LOG_ERROR("\"delete_entry\" parameter is NULL. delete_entry:%p", address(delete_entry));
+    return false;
+  }
+  std::free(delete_entry->data);
+  delete_entry->data = nullptr;
+  delete_entry->next = nullptr;
+  delete_entry->list = nullptr;
+  std::free(delete_entry);
+  return true;
+}
+
+bool ll_delete_entry_at(ll_list_t *list, u32 index) {
+  if (list == nullptr) {
+    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
+    return false;
+  }
+  if (!ll_verify_integrity(list)) {
+    LOG_BUG("List failed integrity test.%s", "");
+    return false;
+  }
+  if (index >= list->size) {
+    report_range(HERE, static_cast<i32>(index), list->size);
+    return false;
+  }
+
+  ll_entry_t **link = &list->head;
+  for (; index > 0; --index) link = &(*link)->next;
+  ll_entry_t *const victim = *link;
+  *link = victim->next;
+  victim->list = nullptr;
+  if (!ll_delete_entry(victim)) {
+    LOG_ERROR("Failed deleting entry.%s", "");
+    return false;
+  }
+  --list->size;
+  if (!ll_verify_integrity(list)) {
+    LOG_BUG("List failed the integrity check. list:%p", address(list));
+    return false;
+  }
+  return true;
+}
+
+bool ll_add_entry_to_back(ll_list_t *list, ll_entry_t *new_entry) {
+  if (!accepts(HERE, list, new_entry)) return false;
+  if (list->type != new_entry->type) {
+    LOG_BUG("This entry represents a different type and cannot be added to this list. List:0x%08X Entry:0x%08X",
+            list->type, new_entry->type);
+    return false;
+  }
+  ll_entry_t **link = &list->head;
+  while (*link != nullptr) link = &(*link)->next;
+  *link = new_entry;
+  new_entry->list = list;
+  ++list->size;
+  return true;
+}
+
+bool ll_add_entry_to_front(ll_list_t *list, ll_entry_t *new_entry) {
+  if (!accepts(HERE, list, new_entry)) return false;
+  if (list->type != new_entry->type) {
+    // kept: "tothis".
+    LOG_BUG("This entry represents a different type and cannot be added tothis list. List:0x%08X Entry:0x%08X",
+            list->type, new_entry->type);
+    return false;
+  }
+  new_entry->next = list->head;
+  list->head = new_entry;
+  new_entry->list = list;
+  ++list->size;
+  return true;
+}
+
+bool ll_entry_at(const ll_list_t *list, i32 index, void **entry_data) {
+  if (entry_data == nullptr) {
+    LOG_ERROR("\"entry_data\" parameter is NULL. entry_data:%p", address(entry_data));
+    return false;
+  }
+  *entry_data = nullptr;
+  if (list == nullptr) {
+    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
+    return false;
+  }
+  if (!ll_verify_integrity(list)) {
+    LOG_BUG("List failed integrity test.%s", "");
+    return false;
+  }
+  if (index < 0 || index >= static_cast<i32>(list->size)) {
+    report_range(HERE, index, list->size);
+    return false;
+  }
+  const ll_entry_t *entry = list->head;
+  for (; index > 0; --index) entry = entry->next;
+  *entry_data = entry->data;
+  return true;
+}
+
+bool ll_delete_list(ll_list_t *list) {
+  if (list == nullptr) {
+    LOG_ERROR("list ptr is NULL.%s", "");
+    return false;
+  }
+  if (!ll_verify_integrity(list)) {
+    LOG_BUG("Failed verifying integrity of the list. list:%p", address(list));
+    return false;
+  }
+  bool deleted = true;
+  for (ll_entry_t *entry = list->head; entry != nullptr;) {
+    ll_entry_t *const next = entry->next;
+    entry->list = nullptr;
+    if (!ll_delete_entry(entry)) {
+      LOG_BUG("Failed deleting an entry during list deletion. ptr:%p", address(entry));
+      deleted = false;
+    }
+    entry = next;
+  }
+  list->size = 0;
+  list->head = nullptr;
+  list->magic = 0;
+  return deleted;
+}
+
+bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size) {
+  if (src_list == nullptr) {
+    LOG_ERROR("\"src_list\" parameter is NULL. src_list:%p", address(src_list));
+    return false;
+  }
+  if (dst_list == nullptr) {
+    LOG_ERROR("\"dst_list\" parameter is NULL. dst_list:%p", address(dst_list));
+    return false;
+  }
+  if (!ll_verify_integrity(src_list)) {
+    LOG_BUG("Source list failed integrity test.%s", "");
+    return false;
+  }
+  if (!ll_verify_integrity(dst_list)) {
+    LOG_BUG("Destination list failed integrity test.%s", "");
+    return false;
+  }
+  // Counted, not followed to the end: a list that is copied onto itself grows while it is read.
+  const ll_entry_t *source = src_list->head;
+  for (u32 remaining = src_list->size; remaining > 0; --remaining, source = source->next) {
+    ll_entry_t *copy = nullptr;
+    void *payload = nullptr;
+    if (!ll_create_entry(static_cast<i32>(size), &copy, &payload, "")) {
+      LOG_BUG("Failed creating entry for the destination list.%s", "");
+      return false;
+    }
+    copy->type = source->type;
+    std::memcpy(payload, source->data, size);
+    if (!ll_add_entry_to_back(dst_list, copy)) {
+      if (ll_delete_entry(copy)) {
+        LOG_BUG("Failed adding entry to back of the destination list.%s", "");
+      } else {
+        LOG_BUG("Failed deleting entry.%s", "");
+      }
+      return false;
+    }
+  }
+  return true;
+}
