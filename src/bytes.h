@@ -24,9 +24,7 @@ class byte_view_t {
     return contains(offset) ? byte_view_t(data_ + offset, size_ - offset) : byte_view_t(data_, 0);
   }
 
-  constexpr u32 little_endian_16(u32 offset) const {
-    return u32{(*this)[offset]} | u32{(*this)[offset + 1]} << 8;
-  }
+  constexpr u32 little_endian_16(u32 offset) const { return u32{(*this)[offset]} | u32{(*this)[offset + 1]} << 8; }
   constexpr u32 little_endian_32(u32 offset) const {
     return little_endian_16(offset) | little_endian_16(offset + 2) << 16;
   }
@@ -34,7 +32,8 @@ class byte_view_t {
 
   /// Copies @p count bytes from @p offset on.
   void copy(u32 offset, u8 *destination, u32 count) const {
-    for (u32 i = 0; i < count; ++i) destination[i] = (*this)[offset + i];
+    for (u32 i = 0; i < count; ++i)
+      destination[i] = (*this)[offset + i];
   }
 
  private:
@@ -43,7 +42,9 @@ class byte_view_t {
 };
 
 /// The low 8 bits of a number.
-constexpr u8 low_byte(u32 value) { return static_cast<u8>(value & 0xFF); }
+constexpr u8 low_byte(u32 value) {
+  return static_cast<u8>(value & 0xFF);
+}
 
 /// Writes bytes one behind the other into a buffer of fixed size.
 class byte_writer_t {
@@ -56,7 +57,8 @@ class byte_writer_t {
 
   constexpr void put(u8 value) { put_at(position_++, value); }
   constexpr void put(const u8 *values, u32 count) {
-    for (u32 i = 0; i < count; ++i) put(values[i]);
+    for (u32 i = 0; i < count; ++i)
+      put(values[i]);
   }
   constexpr void put_little_endian_16(u32 value) {
     put(low_byte(value));

@@ -22,10 +22,14 @@ struct site_t {
 [[gnu::format(printf, 2, 3)]] void log_trace(const site_t &site, const char *format, ...);
 
 /// For "%p", which takes pointers to void only.
-inline const void *address(const void *pointer) { return pointer; }
+inline const void *address(const void *pointer) {
+  return pointer;
+}
 
 /// A C boolean as text.
-inline const char *true_or_false(bool value) { return value ? "true" : "false"; }
+inline const char *true_or_false(bool value) {
+  return value ? "true" : "false";
+}
 
 }  // namespace edid_composer
 

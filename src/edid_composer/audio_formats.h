@@ -5,8 +5,8 @@
 
 namespace edid_composer {
 
-/// Appends to @p ret_list the platform's and the sink's formats by the platform's pass-through mode, within the masks, and
-/// basic audio in any case.
+/// Appends to @p ret_list the platform's and the sink's formats by the platform's pass-through mode, within the masks,
+/// and basic audio in any case.
 u32 _filter_audio_formats(const edid_t *edid, u32 audio_mask, u8 audio_sink_filter, ll_list_t *ret_list,
                           const platform_values_t *platform_values);
 

@@ -5,7 +5,8 @@
 
 namespace edid_composer {
 
-/// Decodes one 18-byte descriptor (EDID 1.3, section 3.10): a detailed timing goes to dtd_list, the others to their fields.
+/// Decodes one 18-byte descriptor (EDID 1.3, section 3.10): a detailed timing goes to dtd_list, the others to their
+/// fields.
 u8 _decode_edid_dtd(const byte_view_t &dtd, edid_t *edid);
 
 /// Appends one standard timing (EDID 1.3, section 3.9) to std_timings, unless the pair of bytes marks an unused slot.

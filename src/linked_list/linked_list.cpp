@@ -145,9 +145,10 @@ bool ll_verify_integrity(const ll_list_t *list) {
   } while (counter < size && entry != nullptr);
 
   if (entry != nullptr) {
-    LOG_ERROR("Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d "
-              "NextPtr=%p",
-              counter, size, address(entry));
+    LOG_ERROR(
+        "Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d "
+        "NextPtr=%p",
+        counter, size, address(entry));
     return false;
   }
   if (counter != size) {
@@ -236,7 +237,8 @@ bool ll_delete_entry_at(ll_list_t *list, u32 index) {
   }
 
   ll_entry_t **link = &list->head;
-  for (; index > 0; --index) link = &(*link)->next;
+  for (; index > 0; --index)
+    link = &(*link)->next;
   ll_entry_t *const victim = *link;
   *link = victim->next;
   victim->list = nullptr;
@@ -260,7 +262,8 @@ bool ll_add_entry_to_back(ll_list_t *list, ll_entry_t *new_entry) {
     return false;
   }
   ll_entry_t **link = &list->head;
-  while (*link != nullptr) link = &(*link)->next;
+  while (*link != nullptr)
+    link = &(*link)->next;
   *link = new_entry;
   new_entry->list = list;
   ++list->size;
@@ -301,7 +304,8 @@ bool ll_entry_at(const ll_list_t *list, i32 index, void **entry_data) {
     return false;
   }
   const ll_entry_t *entry = list->head;
-  for (; index > 0; --index) entry = entry->next;
+  for (; index > 0; --index)
+    entry = entry->next;
   *entry_data = entry->data;
   return true;
 }

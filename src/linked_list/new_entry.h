@@ -21,9 +21,8 @@ struct new_entry_texts_t {
 };
 
 /// The wording of most operations, also of some that add to the front.
-inline constexpr new_entry_texts_t new_entry_texts{"Failed creating entry.",
-                                                   "Failed adding entry to the back of the list.",
-                                                   "Failed deleting entry."};
+inline constexpr new_entry_texts_t new_entry_texts{
+    "Failed creating entry.", "Failed adding entry to the back of the list.", "Failed deleting entry."};
 
 /// An entry that is in no list yet, whatever its element type.
 class untyped_new_entry_t {

@@ -2,8 +2,8 @@
 //
 //   for (auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list))) ...
 //
-// compares the list's type tag with the element type's name and the pointer with NULL, reports what is wrong in the name
-// of the walking function, and goes through the entries from front to back.
+// compares the list's type tag with the element type's name and the pointer with NULL, reports what is wrong in the
+// name of the walking function, and goes through the entries from front to back.
 #pragma once
 
 #include <type_traits>

@@ -6,7 +6,7 @@
 namespace edid_composer {
 
 struct vic_timing_t {
-  u32 vic; ///< What a search that ends at this row answers.
+  u32 vic;  ///< What a search that ends at this row answers.
   detailed_timing_t timing;
 };
 

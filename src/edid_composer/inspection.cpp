@@ -1,0 +1,70 @@
+#include <cstdio>
+
+#include "diagnostics.h"
+#include "edid_decode_encode/checksum.h"
+
+namespace edid_composer {
+namespace {
+
+constexpr u32 smallest_size = block_size;
+constexpr u32 largest_size = 2 * block_size;
+
+/// The formats of an audio mask, from bit 0 on. kept: the enhanced AC-3 of bit 9 is called as the AC-3 of bit 1.
+constexpr const char *audio_mask_names[] = {
+    "pcm ", "ac3 ",    "mpeg1 ", "mp3 ", "mpeg2 ",   "aac ",    "dts ",     "atrac ",         "dsd ",
+    "ac3 ", "dts_hd ", "mlp ",   "dst ", "wma_pro ", "he_aac ", "he_aac2 ", "mpeg_surround ",
+};
+
+bool decode(const site_t &site, const u8 *edid_block, u32 size, edid_t *edid) {
+  if (decode_edid_block_0(edid_block, edid) != 1) {
+    LOG_ERROR_AS(site, "Failed decoding EDID block 0.");
+    return false;
+  }
+  if (size >= largest_size && decode_edid_extensions(edid_block + block_size, size - block_size, edid) != 1) {
+    LOG_ERROR_AS(site, "Failed decoding EDID block 1.");
+    return false;
+  }
+  return true;
+}
+
+}  // namespace
+}  // namespace edid_composer
+
+using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
+
+void print_edid(const u8 *edid_block, u32 size, u8 brief, const char *title) {
+  if (edid_block == nullptr) {
+    LOG_ERROR("\"edid_block\" memory block parameter is NULL. Exiting. edid_block:%p", address(edid_block));
+    return;
+  }
+  if (size % block_size != 0) {
+    LOG_ERROR("Edid size is not an valid value. edid_bytes=%d Range=(%d-%d)", size, smallest_size, largest_size);
+    return;
+  }
+  edid_t edid;
+  if (edid_prepare(&edid) != 1) {
+    LOG_ERROR("Failed preparing edid.");
+    return;
+  }
+  if (decode(HERE, edid_block, size, &edid) && print_edid_struct(&edid, brief, title) != 1) {
+    LOG_WARNING("Failed printing edid.");
+  }
+  if (edid_destroy(&edid) != 1) LOG_ERROR("Failed cleaning up edid.");
+}
+
+void print_edid_audio_mask(u32 mask) {
+  constexpr u32 all_formats = 0xFFFFFFFF;
+  std::printf("EDID: Audio mask: 0x%08X => ", mask);
+  if (mask == all_formats) {
+    std::printf("All audio formats supported");
+  } else if (mask == 0) {
+    std::printf("No audio formats");
+  } else {
+    u32 bit = 1;
+    for (const char *name : audio_mask_names) {
+      if ((mask & bit) != 0) std::printf("%s", name);
+      bit <<= 1;
+    }
+  }
+  std::printf("\n");
+}

@@ -1,0 +1,214 @@
+// The road of one composition, from the caller's arguments to the bytes of the new EDID.
+#include "diagnostics.h"
+#include "edid_composer/audio_formats.h"
+#include "edid_composer/modes_4k_x_2k.h"
+#include "edid_composer/platform_values_reader.h"
+#include "edid_composer/population.h"
+#include "edid_composer/raw_dump.h"
+#include "edid_composer/video_modes.h"
+#include "edid_decode_encode/checksum.h"
+#include "linked_list/element_types.h"
+
+namespace edid_composer {
+namespace {
+
+constexpr u32 smallest_size = block_size;
+constexpr u32 largest_size = 2 * block_size;
+
+/// The caller's arguments.
+struct request_t {
+  const u8 *edid_block;
+  u32 edid_bytes;
+  u8 *new_edid_block;
+  u32 new_edid_bytes;
+  const compose_cfg_t *cfg;
+  const platform_values_t *platform_values;
+};
+
+/// The records of one composition. They start zero-filled, so that one that was never prepared is destroyed cleanly.
+struct workspace_t {
+  platform_values_t platform_values{};
+  edid_t edid{};
+  edid_t new_edid{};
+  ll_list_t modes{};
+};
+
+/// A sink's EDID that can't be read is left out, not refused.
+bool is_sink_usable(const site_t &site, const request_t &request) {
+  bool usable = true;
+  if (request.edid_block == nullptr) {
+    usable = false;
+    LOG_TRACE_AS(site,
+                 "\"edid_block\" memory block parameter is NULL. Skipping edid reading and proceeding with creation. "
+                 "edid_block:%p",
+                 address(request.edid_block));
+  }
+  if (request.edid_bytes == 0 || request.edid_bytes % block_size != 0) {
+    usable = false;
+    LOG_TRACE_AS(site,
+                 "Edid is not an valid value. edid_bytes=%d Range=(%d-%d) Skipping edid reading and proceeding with "
+                 "creation.",
+                 request.edid_bytes, smallest_size, largest_size);
+  }
+  return usable;
+}
+
+bool is_output_valid(const site_t &site, const request_t &request) {
+  if (request.new_edid_block == nullptr) {
+    LOG_ERROR_AS(site, "\"new_edid_block\" memory block parameter is NULL. Unable to proceed. new_edid_block:%p",
+                 address(request.new_edid_block));
+    return false;
+  }
+  if (request.new_edid_bytes < smallest_size || request.new_edid_bytes > largest_size) {
+    LOG_ERROR_AS(site, "New EDID size is not an valid value. Unable to proceed. edid_bytes=%d Expected=%d",
+                 request.new_edid_bytes, largest_size);
+    return false;
+  }
+  if (request.cfg == nullptr) {
+    LOG_ERROR_AS(site, "cfg is NULL. Unable to proceed. cfg : %p.", address(request.cfg));
+    return false;
+  }
+  return true;
+}
+
+bool prepare(const site_t &site, workspace_t *work) {
+  if (edid_prepare(&work->edid) != 1) {
+    LOG_ERROR_AS(site, "Failed preparing edid.");
+    return false;
+  }
+  if (!init_list<short_video_desc_t>(&work->modes)) {
+    LOG_ERROR_AS(site, "Failed initializing modes.");
+    return false;
+  }
+  if (edid_prepare(&work->new_edid) != 1) {
+    LOG_ERROR_AS(site, "Failed preparing new edid.");
+    return false;
+  }
+  return true;
+}
+
+void decode_sink(const site_t &site, const request_t &request, edid_t *edid) {
+  LOG_TRACE_AS(site, "Decode EDID Block %d", 0);
+  _dump_raw_edid_block(request.edid_block, 1);
+  if (decode_edid_block_0(request.edid_block, edid) != 1) {
+    LOG_ERROR_AS(site, "Failed decoding the edid block 0. Continuing.");
+    return;
+  }
+  if (edid->extension_count == 0) return;
+  // A sink may announce an extension that it doesn't have.
+  const u32 length = request.edid_bytes - block_size;
+  const u8 *const extension = request.edid_block + block_size;
+  LOG_TRACE_AS(site, "Decode EDID Block 1");
+  _dump_raw_edid_block(extension, length >= block_size ? 1 : 0);
+  if (decode_edid_extensions(extension, length, edid) != 1) {
+    LOG_ERROR_AS(site, "Failed decoding the extension. Continuing.");
+  }
+}
+
+/// The stages, each from its inputs into the new record or the list of modes.
+bool run_stages(const site_t &site, const request_t &request, const platform_values_t *values, u8 port,
+                workspace_t *work) {
+  const compose_cfg_t *const cfg = request.cfg;
+  if (_filter_video_modes(&work->edid, cfg, &work->modes, values) != 1) {
+    LOG_ERROR_AS(site, "Failed filtering the video modes.");
+    return false;
+  }
+  if (_filter_4k_modes(&work->edid, &work->new_edid, values) != 1) {
+    LOG_ERROR_AS(site, "Failed filtering the 4k x 2k video modes.");
+    return false;
+  }
+  const u8 sink_filter = cfg->audio_sink_filter == 1 ? 1 : 0;
+  if (_filter_audio_formats(&work->edid, cfg->audio_mask, sink_filter, &work->new_edid.audio_list, values) != 1) {
+    LOG_ERROR_AS(site, "Failed filtering the audio formats.");
+    return false;
+  }
+  if (_populate_new_edid(&work->new_edid, &work->modes, &work->edid, port, cfg->hdmi_3d_mode, cfg->edid_latency,
+                         values) != 1) {
+    LOG_ERROR_AS(site, "Failed populating the new edid.");
+    return false;
+  }
+  if (encode_edid(request.new_edid_block, static_cast<i32>(request.new_edid_bytes), &work->new_edid, cfg->spa_offset,
+                  values) != 1) {
+    LOG_ERROR_AS(site, "Failed encoding the new edid.");
+    return false;
+  }
+  return true;
+}
+
+/// Decodes the result again: what the decoders trace of it is the point.
+void trace_result(const site_t &site, const u8 *new_edid_block) {
+  if (!debug_enabled()) return;
+  LOG_TRACE_AS(site, "New EDID...");
+  _dump_raw_edid_block(new_edid_block, 2);
+  edid_t edid{};
+  if (edid_prepare(&edid) != 1) {
+    LOG_WARNING_AS(site, "edid_prepare failed.");
+    return;
+  }
+  if (decode_edid_block_0(new_edid_block, &edid) != 1) {
+    LOG_WARNING_AS(site, "Failed decoding the new edid block 0.");
+  } else if (decode_edid_extensions(new_edid_block + block_size, block_size, &edid) != 1) {
+    LOG_WARNING_AS(site, "Failed decoding the new edid extension.");
+  }
+  if (edid_destroy(&edid) != 1) LOG_WARNING_AS(site, "Failed to destroy the debug edid.");
+}
+
+bool compose(const site_t &site, const request_t &request, bool sink_usable, workspace_t *work) {
+  const platform_values_t *values = request.platform_values;
+  if (values == nullptr) {
+    values = &work->platform_values;
+    if (!_read_platform_values(&work->platform_values)) {
+      LOG_ERROR_AS(site, "Failed trying to read the platform config file.");
+      return false;
+    }
+  }
+  const auto port = static_cast<u8>((request.cfg->port + 1) & 0xFF);
+  if (!prepare(site, work)) return false;
+  if (sink_usable) {
+    decode_sink(site, request, &work->edid);
+  } else {
+    LOG_TRACE_AS(site, "Valid edid not available. Continuing composing edid. Passed in edid:%p size:%d bytes",
+                 address(request.edid_block), request.edid_bytes);
+  }
+  if (!run_stages(site, request, values, port, work)) return false;
+  trace_result(site, request.new_edid_block);
+  return true;
+}
+
+/// All of it, always, in this order; what fails here doesn't change the result.
+void clean_up(const site_t &site, workspace_t *work) {
+  if (edid_destroy(&work->edid) != 1) LOG_ERROR_AS(site, "Failed cleaning up edid.");
+  if (edid_destroy(&work->new_edid) != 1) LOG_ERROR_AS(site, "Failed cleaning up new_edid.");
+  if (!ll_delete_list(&work->modes)) LOG_ERROR_AS(site, "Failed cleaning up video list.");
+  platform_values_destroy(&work->platform_values);
+}
+
+}  // namespace
+}  // namespace edid_composer
+
+using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
+
+bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
+                  const compose_cfg_t *cfg) {
+  return compose_edid_internal(edid_block, edid_bytes, new_edid_block, new_edid_bytes, cfg, nullptr);
+}
+
+bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
+                           const compose_cfg_t *cfg, const platform_values_t *platform_values) {
+  const request_t request{edid_block, edid_bytes, new_edid_block, new_edid_bytes, cfg, platform_values};
+  const bool sink_usable = is_sink_usable(HERE, request);
+  if (!is_output_valid(HERE, request)) return false;
+
+  workspace_t work;
+  if (!platform_values_init(&work.platform_values)) {
+    LOG_ERROR("Failed initializing platfrom values.");
+    return false;
+  }
+  if (platform_values != nullptr && !ll_is_initialized(&platform_values->audio_list)) {
+    LOG_ERROR("The passed in platform_values has not been initialized.");
+    return false;
+  }
+  const bool composed = compose(HERE, request, sink_usable, &work);
+  clean_up(HERE, &work);
+  return composed;
+}

@@ -1,0 +1,12 @@
+#include "edid_decode_encode/checksum.h"
+
+namespace edid_composer {
+
+u8 _calculate_checksum(const byte_view_t &block) {
+  u32 sum = 0;
+  for (u32 offset = 0; offset < checksum_offset; ++offset)
+    sum += block[offset];
+  return low_byte(0x100 - (sum & 0xFF));
+}
+
+}  // namespace edid_composer

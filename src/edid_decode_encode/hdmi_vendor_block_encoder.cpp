@@ -1,0 +1,106 @@
+#include "edid_decode_encode/hdmi_vendor_block_encoder.h"
+
+#include <algorithm>
+
+#include "edid_decode_encode/cea_extension_layout.h"
+#include "edid_decode_encode/checksum.h"
+
+namespace edid_composer {
+namespace {
+
+namespace layout = hdmi_vendor_block;
+
+/// Clears the structures that 3D_present implies for the mode, so that they aren't written one by one.
+void clear_mandatory_structures(short_video_desc_t *video) {
+  for (const auto &mandatory : _3d_man_modes) {
+    if (mandatory.vic == video->vic) {
+      video->stereo &= ~mandatory.stereo;
+      return;
+    }
+  }
+}
+
+/// Writes the 2D_VIC_order entries of one mode.
+void encode_3d_structures(const site_t &site, u32 index, u32 stereo, byte_writer_t *block) {
+  for (const auto &structure : layout::structures_3d) {
+    if ((stereo & structure.stereo) == 0) continue;
+    const u8 order = low_byte(index << layout::index_shift | structure.code);
+    block->put(order);
+    if (structure.code == layout::side_by_side_half) {
+      constexpr u8 detail = 0;
+      block->put(detail);
+      LOG_TRACE_AS(site, "order[%d] %s, %02x, %02x", index, structure.name, order, detail);
+    } else {
+      LOG_TRACE_AS(site, "order[%d] %s, %02x", index, structure.name, order);
+    }
+  }
+}
+
+bool encode_3d_modes(const site_t &site, edid_t *edid, byte_writer_t *block) {
+  const i32 count = std::min(ll_size(&edid->video_list), layout::most_3d_modes);
+  for (i32 i = 0; i < count; ++i) {
+    void *payload = nullptr;
+    if (!ll_entry_at(&edid->video_list, i, &payload)) {
+      LOG_ERROR_AS(site, "Failed trying to obtain index #%d list.", i);
+      return false;
+    }
+    auto *const video = static_cast<short_video_desc_t *>(payload);
+    clear_mandatory_structures(video);
+    encode_3d_structures(site, static_cast<u32>(i), video->stereo, block);
+  }
+  return true;
+}
+
+/// The flags byte, and the latencies that it announces.
+void encode_latencies(const edid_t &edid, byte_writer_t *block) {
+  const bool interlaced = edid.i_video_latency != 0 || edid.i_audio_latency != 0;
+  const bool progressive = edid.video_latency != 0 || edid.audio_latency != 0 || interlaced;
+  u32 flags = encode_flags(layout::content_flags, edid);
+  if (progressive) flags |= layout::latency_present;
+  if (interlaced) flags |= layout::i_latency_present;
+  block->put(low_byte(flags));
+  if (progressive) {
+    block->put(encode_edid_latency_value(edid.video_latency));
+    block->put(encode_edid_latency_value(edid.audio_latency));
+  }
+  if (interlaced) {
+    block->put(encode_edid_latency_value(edid.i_video_latency));
+    block->put(encode_edid_latency_value(edid.i_audio_latency));
+  }
+}
+
+/// The HDMI video fields: 3D and 4Kx2K.
+bool encode_video(const site_t &site, edid_t *edid, byte_writer_t *block) {
+  const u32 present = edid->hdmi_3d_present != 0 ? layout::present_3d : 0U;
+  block->put(low_byte(present | (edid->image_size & layout::image_size_mask) << layout::image_size_shift));
+  const u32 lengths = block->reserve();
+  const u32 vics = std::min<u32>(edid->hdmi_vic_len, layout::most_vics);
+  for (u32 i = 0; i < vics; ++i)
+    block->put(low_byte(edid->hdmi_vic[i]));
+
+  const u32 begin_3d = block->position();
+  if (edid->hdmi_3d_present != 0 && !encode_3d_modes(site, edid, block)) return false;
+  const u32 length_3d = block->position() - begin_3d;
+  block->put_at(lengths, low_byte(vics << layout::vic_length_shift | (length_3d & layout::length_3d_mask)));
+  return true;
+}
+
+}  // namespace
+
+bool encode_hdmi_vendor_block(const site_t &site, edid_t *edid, byte_writer_t *extension, u8 *spa_offset) {
+  const u32 header = extension->reserve();
+  extension->put(layout::oui_bytes, sizeof layout::oui_bytes);
+  if (spa_offset != nullptr) *spa_offset = low_byte(block_size + extension->position());
+  const u8 *const address = edid->physical_address;
+  extension->put(low_byte((address[0] & 0x0FU) << 4 | (address[1] & 0x0FU)));
+  extension->put(low_byte((address[2] & 0x0FU) << 4 | (address[3] & 0x0FU)));
+  extension->put(encode_flags(layout::support_flags, *edid));
+  extension->put(low_byte(edid->max_tmds_clock / layout::max_tmds_clock_unit));
+  encode_latencies(*edid, extension);
+  if (edid->hdmi_video_present != 0 && !encode_video(site, edid, extension)) return false;
+  const u32 length = extension->position() - header - 1;
+  extension->put_at(header, data_block::header(data_block::vendor_specific, length));
+  return true;
+}
+
+}  // namespace edid_composer

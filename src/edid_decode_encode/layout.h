@@ -1,0 +1,64 @@
+// What the decoder and the encoder agree on when a byte holds several fields: tables of fields and their bits.
+#pragma once
+
+#include "bytes.h"
+
+namespace edid_composer {
+
+/// A boolean of the record and the bit that it has in a byte.
+struct flag_t {
+  u8 edid_t::*field;
+  u8 mask;
+};
+
+template <u32 count>
+void decode_flags(const flag_t (&flags)[count], u8 byte, edid_t *edid) {
+  for (const auto &flag : flags)
+    edid->*flag.field = (byte & flag.mask) != 0 ? 1 : 0;
+}
+
+template <u32 count>
+u8 encode_flags(const flag_t (&flags)[count], const edid_t &edid) {
+  u32 byte = 0;
+  for (const auto &flag : flags)
+    byte |= edid.*flag.field != 0 ? flag.mask : 0U;
+  return low_byte(byte);
+}
+
+/// Bits of a byte.
+struct bit_field_t {
+  u8 byte;
+  u8 shift;
+  u8 width;
+
+  constexpr u32 mask() const { return (1U << width) - 1; }
+};
+
+/// A number whose low bits and high bits stand in different bytes.
+template <typename record_t>
+struct split_field_t {
+  u32 record_t::*field;
+  bit_field_t low;
+  bit_field_t high;
+};
+
+template <typename record_t, u32 count>
+void decode_split_fields(const split_field_t<record_t> (&fields)[count], const byte_view_t &bytes, record_t *record) {
+  for (const auto &[field, low, high] : fields) {
+    const u32 low_bits = u32{bytes[low.byte]} >> low.shift & low.mask();
+    const u32 high_bits = u32{bytes[high.byte]} >> high.shift & high.mask();
+    record->*field = high_bits << low.width | low_bits;
+  }
+}
+
+/// Adds the fields to bytes that hold 0 where the fields go.
+template <typename record_t, u32 count>
+void encode_split_fields(const split_field_t<record_t> (&fields)[count], const record_t &record, u8 *bytes) {
+  for (const auto &[field, low, high] : fields) {
+    const u32 value = record.*field;
+    bytes[low.byte] = low_byte(bytes[low.byte] | (value & low.mask()) << low.shift);
+    bytes[high.byte] = low_byte(bytes[high.byte] | (value >> low.width & high.mask()) << high.shift);
+  }
+}
+
+}  // namespace edid_composer
