@@ -14,7 +14,7 @@
 namespace edid_composer {
 namespace {
 
-constexpr u32 megahertz = 1000000;
+constexpr std::int64_t megahertz = 1000000;
 
 void set_identity(const site_t &site, const platform_values_t &values, edid_t *edid) {
   edid->product_code = values.product_id;
@@ -139,7 +139,7 @@ u32 deep_color_factor(const edid_t &edid) {
 
 /// The clock in MHz that the offered modes need; 0 when it needn't be declared.
 u32 needed_tmds_clock(const platform_values_t &values, const ll_list_t *video_list, const edid_t &edid) {
-  constexpr u32 undeclared_below = 165 * megahertz;
+  constexpr std::int64_t undeclared_below = 165 * megahertz;
   constexpr std::int64_t clock_of_4k_x_2k = 297 * megahertz;
   const u32 factor = deep_color_factor(edid);
   const u32 pixel_clock = _maximum_pixel_clock(video_list);

@@ -13,11 +13,11 @@ constexpr u16 latency_ms(u8 value) {
 }
 
 void decode_physical_address(const byte_view_t &block, edid_t *edid) {
-  for (u32 i = 0; i < 2; ++i) {
-    const u8 byte = block[layout::physical_address + i];
-    edid->physical_address[2 * i] = static_cast<u8>(byte >> 4);
-    edid->physical_address[2 * i + 1] = byte & 0x0F;
-  }
+  u8 *const address = edid->physical_address;
+  address[0] = block[layout::physical_address] >> 4;
+  address[1] = block[layout::physical_address] & 0x0F;
+  address[2] = block[layout::physical_address + 1] >> 4;
+  address[3] = block[layout::physical_address + 1] & 0x0F;
 }
 
 /// Answers the offset behind the latency fields.
