@@ -12,12 +12,21 @@ if(EDID_COMPOSER_SANITIZE)
   add_link_options(-fsanitize=address,undefined)
 endif()
 
+if(EDID_COMPOSER_SANITIZE_THREAD)
+  add_compile_options(-fsanitize=thread -fno-omit-frame-pointer)
+  add_link_options(-fsanitize=thread)
+endif()
+
+if(EDID_COMPOSER_FUZZ)
+  add_compile_options(-fsanitize=fuzzer-no-link)
+endif()
+
 # The library itself: a C ABI outside, no exceptions, no run-time type information, nothing visible but what is exported.
 add_library(edid_composer_library_flags INTERFACE)
 target_compile_options(
   edid_composer_library_flags INTERFACE -fno-exceptions -fno-rtti -fno-threadsafe-statics -fvisibility=hidden
                                         -fvisibility-inlines-hidden -fstack-protector-strong)
-if(NOT EDID_COMPOSER_SANITIZE)
+if(NOT EDID_COMPOSER_SANITIZE AND NOT EDID_COMPOSER_SANITIZE_THREAD)
   target_compile_options(edid_composer_library_flags INTERFACE $<$<NOT:$<CONFIG:Debug>>:-U_FORTIFY_SOURCE
                                                                -D_FORTIFY_SOURCE=2>)
 endif()

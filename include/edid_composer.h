@@ -12,12 +12,12 @@
  *   are no error codes and no exceptions: each failure is reported once, where it is detected, by one line on standard
  *   output (see @ref debug_enable for the four kinds of line).
  * - **Ownership.** Records are provided by the caller. All heap memory is list entries and their payloads, owned by the
- *   list that holds them and released by the record's own destroy operation. Nothing survives a call but what the caller
- *   was given.
+ *   list that holds them and released by the record's own destroy operation. Nothing survives a call but what the
+ * caller was given.
  * - **Threads.** The library keeps no state but the debug switch. Every operation may run on any thread, and on several
  *   threads at once as long as they work on different records and buffers. Lines that several threads print may
- *   interleave. Composing also calls the host's eight `config_*` operations: whether those may run at once is the host's
- *   affair.
+ *   interleave. Composing also calls the host's eight `config_*` operations: whether those may run at once is the
+ * host's affair.
  * - **Units.** Pixel clocks are in hertz, refresh rates in whole hertz (truncated), latencies in milliseconds.
  *
  * Standards: EDID 1.3 is "VESA Enhanced EDID Standard, Release A, Revision 1"; CEA-861 is CEA-861-D; HDMI is the "High-
@@ -64,7 +64,8 @@ typedef int32_t i32;  /**< Signed 32-bit integer. */
 /**
  * Turns tracing on or off for the whole process. It is off until the first call.
  *
- * The switch may be changed from any thread at any time; a change takes effect on the next line written. Prints nothing.
+ * The switch may be changed from any thread at any time; a change takes effect on the next line written. Prints
+ * nothing.
  *
  * @param enable true to write debug traces and dumps, false to write errors, warnings, bugs and reports only.
  */
@@ -84,14 +85,14 @@ EDID_COMPOSER_API extern const char *const gVersion;
 /** @defgroup linked_list Typed linked list
  *
  * The singly linked list that holds every collection. A head carries a magic number made from its own address, and head
- * and entries carry a tag made from the name of their element type, so that a head that was never initialised, was moved
- * or was overwritten, and an entry of the wrong type, are reported instead of followed. Nearly every operation verifies
- * the whole list.
+ * and entries carry a tag made from the name of their element type, so that a head that was never initialised, was
+ * moved or was overwritten, and an entry of the wrong type, are reported instead of followed. Nearly every operation
+ * verifies the whole list.
  *
  * A head must never be copied by value or moved: at another address it is not initialised.
  *
- * All operations answer true on success. Each failure prints one error or bug line of module `linked_list`. A list may be
- * used by one thread at a time.
+ * All operations answer true on success. Each failure prints one error or bug line of module `linked_list`. A list may
+ * be used by one thread at a time.
  * @{ */
 
 struct ll_entry_t;
@@ -192,32 +193,32 @@ EDID_COMPOSER_API bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_li
  * @{ */
 
 /**
- * One detailed timing (EDID 1.3, section 3.10.2, table 3.16). Entry of lists of type "detailed_timing_t".
+ * One detailed timing (EDID 1.3, section 3.10.2). Entry of lists of type "detailed_timing_t".
  *
  * Written by the decoders and by @ref convert_vic_to_dtd.
  */
 typedef struct detailed_timing_t {
-  u8 valid;          /**< 1 when the record holds a timing. The report skips, the encoder refuses entries with 0. */
-  u32 pixel_clock;   /**< Pixel clock, Hz. Stored in units of 10 kHz: 0 to 655350000. */
-  u32 h_active;      /**< Horizontal active pixels, 0 to 4095. */
-  u32 h_blanking;    /**< Horizontal blanking pixels, 0 to 4095. */
-  u32 h_sync_offset; /**< Horizontal front porch, pixels, 0 to 1023. */
-  u32 h_sync_width;  /**< Horizontal sync pulse width, pixels, 0 to 1023. */
-  u8 h_border;       /**< Horizontal border, pixels. */
-  u32 v_active;      /**< Vertical active lines, per field when interlaced, 0 to 4095. */
-  u32 v_blanking;    /**< Vertical blanking lines, per field when interlaced, 0 to 4095. */
-  u32 v_sync_offset; /**< Vertical front porch, lines, 0 to 63. */
-  u32 v_sync_width;  /**< Vertical sync pulse width, lines, 0 to 63. */
-  u8 v_border;       /**< Vertical border, lines. */
-  u32 h_image_size;  /**< Horizontal image size, mm, 0 to 4095; 0 when not given. */
-  u32 v_image_size;  /**< Vertical image size, mm, 0 to 4095; 0 when not given. */
-  u8 progressive;    /**< 1 progressive, 0 interlaced. */
-  u8 stereo;         /**< 1 when the descriptor's stereo bits are not 00. Never encoded. */
+  u8 valid;           /**< 1 when the record holds a timing. The report skips, the encoder refuses entries with 0. */
+  u32 pixel_clock;    /**< Pixel clock, Hz. Stored in units of 10 kHz: 0 to 655350000. */
+  u32 h_active;       /**< Horizontal active pixels, 0 to 4095. */
+  u32 h_blanking;     /**< Horizontal blanking pixels, 0 to 4095. */
+  u32 h_sync_offset;  /**< Horizontal front porch, pixels, 0 to 1023. */
+  u32 h_sync_width;   /**< Horizontal sync pulse width, pixels, 0 to 1023. */
+  u8 h_border;        /**< Horizontal border, pixels. */
+  u32 v_active;       /**< Vertical active lines, per field when interlaced, 0 to 4095. */
+  u32 v_blanking;     /**< Vertical blanking lines, per field when interlaced, 0 to 4095. */
+  u32 v_sync_offset;  /**< Vertical front porch, lines, 0 to 63. */
+  u32 v_sync_width;   /**< Vertical sync pulse width, lines, 0 to 63. */
+  u8 v_border;        /**< Vertical border, lines. */
+  u32 h_image_size;   /**< Horizontal image size, mm, 0 to 4095; 0 when not given. */
+  u32 v_image_size;   /**< Vertical image size, mm, 0 to 4095; 0 when not given. */
+  u8 progressive;     /**< 1 progressive, 0 interlaced. */
+  u8 stereo;          /**< 1 when the descriptor's stereo bits are not 00. Never encoded. */
   u8 h_sync_positive; /**< 1 when the horizontal sync is positive. */
   u8 v_sync_positive; /**< 1 when the vertical sync is positive. */
 } detailed_timing_t;
 
-/** One standard timing (EDID 1.3, section 3.9, table 3.15). Entry of lists of type "std_timing_t". */
+/** One standard timing (EDID 1.3, section 3.9). Entry of lists of type "std_timing_t". */
 typedef struct std_timing_t {
   u32 h_active;     /**< Horizontal active pixels, 248 to 2288, a multiple of 8. */
   u32 aspect_ratio; /**< Aspect-ratio code: 0 = 1:1, 1 = 4:3, 2 = 5:4, 3 = 16:9. */
@@ -227,20 +228,20 @@ typedef struct std_timing_t {
 /** One short video descriptor (CEA-861, section 7.5.1). Entry of lists of type "short_video_desc_t". */
 typedef struct short_video_desc_t {
   u8 native;  /**< 1 when the descriptor's native bit is set. */
-  u32 vic;    /**< Video identification code (CEA-861, table 4), 1 to 127. */
-  u32 stereo; /**< Mask of the 3D structures (HDMI 1.4a, table H-2) of the mode; see @ref stereo_mask. 0 = no 3D. */
+  u32 vic;    /**< Video identification code (CEA-861, section 4), 1 to 127. */
+  u32 stereo; /**< Mask of the 3D structures (HDMI 1.4a, appendix H) of the mode; see @ref stereo_mask. 0 = no 3D. */
 } short_video_desc_t;
 
 /** Bits of @ref short_video_desc_t::stereo. */
 enum stereo_mask {
-  STEREO_FRAME_PACKING = 0x01,              /**< FP: frame packing. */
-  STEREO_SIDE_BY_SIDE_HALF = 0x02,          /**< SBSH: side-by-side (half). */
-  STEREO_TOP_AND_BOTTOM = 0x04,             /**< TBH: top-and-bottom. */
-  STEREO_FIELD_ALTERNATIVE = 0x08,          /**< FA: field alternative. */
-  STEREO_LINE_ALTERNATIVE = 0x10,           /**< LA: line alternative. */
-  STEREO_SIDE_BY_SIDE_FULL = 0x20,          /**< SBSF: side-by-side (full). */
-  STEREO_L_DEPTH = 0x40,                    /**< LD: L + depth. */
-  STEREO_L_DEPTH_GRAPHICS = 0x80            /**< LDGD: L + depth + graphics + graphics-depth. */
+  STEREO_FRAME_PACKING = 0x01,     /**< FP: frame packing. */
+  STEREO_SIDE_BY_SIDE_HALF = 0x02, /**< SBSH: side-by-side (half). */
+  STEREO_TOP_AND_BOTTOM = 0x04,    /**< TBH: top-and-bottom. */
+  STEREO_FIELD_ALTERNATIVE = 0x08, /**< FA: field alternative. */
+  STEREO_LINE_ALTERNATIVE = 0x10,  /**< LA: line alternative. */
+  STEREO_SIDE_BY_SIDE_FULL = 0x20, /**< SBSF: side-by-side (full). */
+  STEREO_L_DEPTH = 0x40,           /**< LD: L + depth. */
+  STEREO_L_DEPTH_GRAPHICS = 0x80   /**< LDGD: L + depth + graphics + graphics-depth. */
 };
 
 /**
@@ -249,8 +250,8 @@ enum stereo_mask {
  * Fields that do not apply to a type are 0.
  */
 typedef struct short_audio_desc_t {
-  u32 type;        /**< Audio format code 1 to 14 (CEA-861, table 37); 16 HE-AAC, 17 HE-AACv2, 18 MPEG Surround for the
-                        extension codes 1 to 3 of format 15; 0 for any other extension code. */
+  u32 type; /**< Audio format code 1 to 14 (CEA-861, section 7.5.2); 16 HE-AAC, 17 HE-AACv2, 18 MPEG Surround for the
+                 extension codes 1 to 3 of format 15; 0 for any other extension code. */
   u32 channels;    /**< Maximum number of channels, 1 to 8. */
   u32 frequencies; /**< Sample-rate mask: bits 0 to 6 are 32, 44.1, 48, 88.2, 96, 176.4 and 192 kHz. */
   u32 pcm_bits;    /**< Type 1: sample-size mask, bits 0 to 2 are 16, 20 and 24 bit. */
@@ -262,89 +263,89 @@ typedef struct short_audio_desc_t {
 /**
  * The decoded form of one display's EDID: the base block and at most one CEA-861 extension.
  *
- * Prepared by @ref edid_prepare, filled by the decoders (@ref decode_edid_block_0, @ref decode_edid_extensions) or by the
- * composer, released by @ref edid_destroy. Must not be copied or moved while prepared (see @ref linked_list).
- * Offsets below are bytes of the base block (EDID 1.3, table 3.1) or of the extension (CEA-861, table 27); "VSDB" is the
- * HDMI vendor-specific data block (HDMI 1.4a, section 8.3.2).
+ * Prepared by @ref edid_prepare, filled by the decoders (@ref decode_edid_block_0, @ref decode_edid_extensions) or by
+ * the composer, released by @ref edid_destroy. Must not be copied or moved while prepared (see @ref linked_list).
+ * Offsets below are bytes of the base block (EDID 1.3, section 3) or of the extension (CEA-861, section 7.5); "VSDB" is
+ * the HDMI vendor-specific data block (HDMI 1.4a, section 8.3.2).
  */
 typedef struct edid_t {
   /* Base block */
-  u8 valid;           /**< 1 once the header was verified, even if the checksum then failed. */
-  char manufacturer[4]; /**< Three-letter manufacturer ID and NUL (bytes 8-9). */
-  u32 product_code;   /**< Product code, 0 to 65535 (bytes 10-11). */
-  u32 serial_number;  /**< Serial number (bytes 12-15). */
-  u8 week;            /**< Week of manufacture, as stored (byte 16). */
-  u32 year;           /**< Year of manufacture, 1990 to 2245 (byte 17). */
-  u8 version;         /**< EDID version; the decoder requires 1 (byte 18). */
-  u8 revision;        /**< EDID revision; the decoder requires 3 or more (byte 19). */
-  u8 digital;         /**< 1 when the video input is digital (byte 20). */
-  u8 h_size_cm;       /**< Maximum horizontal image size, cm; 0 = undefined (byte 21). */
-  u8 v_size_cm;       /**< Maximum vertical image size, cm; 0 = undefined (byte 22). */
-  u32 gamma;          /**< Gamma as stored: gamma x 100 - 100, 0 to 255 (byte 23). */
-  u8 standby;         /**< 1 when DPMS stand-by is supported (byte 24, bit 7). */
-  u8 suspend;         /**< 1 when DPMS suspend is supported (byte 24, bit 6). */
-  u8 active_off;      /**< 1 when DPMS active-off is supported (byte 24, bit 5). */
+  u8 valid;               /**< 1 once the header was verified, even if the checksum then failed. */
+  char manufacturer[4];   /**< Three-letter manufacturer ID and NUL (bytes 8-9). */
+  u32 product_code;       /**< Product code, 0 to 65535 (bytes 10-11). */
+  u32 serial_number;      /**< Serial number (bytes 12-15). */
+  u8 week;                /**< Week of manufacture, as stored (byte 16). */
+  u32 year;               /**< Year of manufacture, 1990 to 2245 (byte 17). */
+  u8 version;             /**< EDID version; the decoder requires 1 (byte 18). */
+  u8 revision;            /**< EDID revision; the decoder requires 3 or more (byte 19). */
+  u8 digital;             /**< 1 when the video input is digital (byte 20). */
+  u8 h_size_cm;           /**< Maximum horizontal image size, cm; 0 = undefined (byte 21). */
+  u8 v_size_cm;           /**< Maximum vertical image size, cm; 0 = undefined (byte 22). */
+  u32 gamma;              /**< Gamma as stored: gamma x 100 - 100, 0 to 255 (byte 23). */
+  u8 standby;             /**< 1 when DPMS stand-by is supported (byte 24, bit 7). */
+  u8 suspend;             /**< 1 when DPMS suspend is supported (byte 24, bit 6). */
+  u8 active_off;          /**< 1 when DPMS active-off is supported (byte 24, bit 5). */
   u8 standard_colorspace; /**< 1 when sRGB is the default colour space (byte 24, bit 2). */
-  u8 preferred_timing; /**< 1 when the first detailed timing is the preferred mode (byte 24, bit 1). */
-  u8 gtf;             /**< 1 when default GTF is supported (byte 24, bit 0). */
-  u32 red_x;          /**< Chromaticity, 10 bits, value / 1024 (bytes 25-34). */
-  u32 red_y;          /**< Chromaticity of red, y. */
-  u32 green_x;        /**< Chromaticity of green, x. */
-  u32 green_y;        /**< Chromaticity of green, y. */
-  u32 blue_x;         /**< Chromaticity of blue, x. */
-  u32 blue_y;         /**< Chromaticity of blue, y. */
-  u32 white_x;        /**< Chromaticity of white, x. */
-  u32 white_y;        /**< Chromaticity of white, y. */
-  u32 est_timings_1;  /**< Established timings I, bit mask (byte 35). */
-  u32 est_timings_2;  /**< Established timings II, bit mask (byte 36). */
-  u32 man_timings;    /**< Manufacturer's reserved timings, bit mask (byte 37). */
-  ll_list_t std_timings; /**< Standard timings, list of @ref std_timing_t in block order (bytes 38-53). */
-  ll_list_t dtd_list; /**< Detailed timings, list of @ref detailed_timing_t: base block first, then extension. */
+  u8 preferred_timing;    /**< 1 when the first detailed timing is the preferred mode (byte 24, bit 1). */
+  u8 gtf;                 /**< 1 when default GTF is supported (byte 24, bit 0). */
+  u32 red_x;              /**< Chromaticity, 10 bits, value / 1024 (bytes 25-34). */
+  u32 red_y;              /**< Chromaticity of red, y. */
+  u32 green_x;            /**< Chromaticity of green, x. */
+  u32 green_y;            /**< Chromaticity of green, y. */
+  u32 blue_x;             /**< Chromaticity of blue, x. */
+  u32 blue_y;             /**< Chromaticity of blue, y. */
+  u32 white_x;            /**< Chromaticity of white, x. */
+  u32 white_y;            /**< Chromaticity of white, y. */
+  u32 est_timings_1;      /**< Established timings I, bit mask (byte 35). */
+  u32 est_timings_2;      /**< Established timings II, bit mask (byte 36). */
+  u32 man_timings;        /**< Manufacturer's reserved timings, bit mask (byte 37). */
+  ll_list_t std_timings;  /**< Standard timings, list of @ref std_timing_t in block order (bytes 38-53). */
+  ll_list_t dtd_list;     /**< Detailed timings, list of @ref detailed_timing_t, base block first, then extension. */
   char serial_string[14]; /**< Serial number text of descriptor 0xFF, up to 13 characters and NUL. */
-  char data_string[14]; /**< Text of descriptor 0xFE, up to 13 characters and NUL. */
-  char monitor_name[14]; /**< Monitor name of descriptor 0xFC, up to 13 characters and NUL. */
-  u8 min_v_rate;      /**< Range limits: minimum vertical rate, Hz (descriptor 0xFD). */
-  u8 max_v_rate;      /**< Range limits: maximum vertical rate, Hz. */
-  u8 min_h_rate;      /**< Range limits: minimum horizontal rate, kHz. */
-  u8 max_h_rate;      /**< Range limits: maximum horizontal rate, kHz. */
-  u32 max_pixel_clock; /**< Range limits: maximum pixel clock, MHz, a multiple of 10. */
-  u8 extension_count; /**< Number of extension blocks announced (byte 126). */
-  u8 checksum;        /**< The base block's stored checksum (byte 127). */
+  char data_string[14];   /**< Text of descriptor 0xFE, up to 13 characters and NUL. */
+  char monitor_name[14];  /**< Monitor name of descriptor 0xFC, up to 13 characters and NUL. */
+  u8 min_v_rate;          /**< Range limits: minimum vertical rate, Hz (descriptor 0xFD). */
+  u8 max_v_rate;          /**< Range limits: maximum vertical rate, Hz. */
+  u8 min_h_rate;          /**< Range limits: minimum horizontal rate, kHz. */
+  u8 max_h_rate;          /**< Range limits: maximum horizontal rate, kHz. */
+  u32 max_pixel_clock;    /**< Range limits: maximum pixel clock, MHz, a multiple of 10. */
+  u8 extension_count;     /**< Number of extension blocks announced (byte 126). */
+  u8 checksum;            /**< The base block's stored checksum (byte 127). */
   /* CEA-861 extension */
-  u8 underscan;       /**< 1 when the sink underscans IT formats by default (byte 3, bit 7). */
-  u8 basic_audio;     /**< 1 when basic audio is supported (byte 3, bit 6). */
-  u8 ycbcr_444;       /**< 1 when YCbCr 4:4:4 is supported (byte 3, bit 5). */
-  u8 ycbcr_422;       /**< 1 when YCbCr 4:2:2 is supported (byte 3, bit 4). */
+  u8 underscan;         /**< 1 when the sink underscans IT formats by default (byte 3, bit 7). */
+  u8 basic_audio;       /**< 1 when basic audio is supported (byte 3, bit 6). */
+  u8 ycbcr_444;         /**< 1 when YCbCr 4:4:4 is supported (byte 3, bit 5). */
+  u8 ycbcr_422;         /**< 1 when YCbCr 4:2:2 is supported (byte 3, bit 4). */
   ll_list_t video_list; /**< Short video descriptors, list of @ref short_video_desc_t in block order. */
   ll_list_t audio_list; /**< Short audio descriptors, list of @ref short_audio_desc_t in block order. */
-  u8 speaker[3];      /**< Payload of the speaker allocation data block (CEA-861, table 44). */
+  u8 speaker[3];        /**< Payload of the speaker allocation data block (CEA-861, section 7.5.3). */
   /* HDMI vendor-specific data block */
-  u8 hdmi_present;    /**< 1 when a VSDB of at least 5 payload bytes was decoded. */
+  u8 hdmi_present;        /**< 1 when a VSDB of at least 5 payload bytes was decoded. */
   u8 physical_address[4]; /**< CEC physical address a.b.c.d, 0 to 15 each; the encoder writes the low nibbles. */
-  u8 dc_48bit;        /**< 1 when 48-bit deep colour is supported. */
-  u8 dc_36bit;        /**< 1 when 36-bit deep colour is supported. */
-  u8 dc_30bit;        /**< 1 when 30-bit deep colour is supported. */
-  u8 dc_y444;         /**< 1 when deep colour is supported in YCbCr 4:4:4 too. */
-  u8 dvi_dual;        /**< 1 when DVI dual-link is supported. */
-  u32 max_tmds_clock; /**< Maximum TMDS clock, MHz, a multiple of 5, 0 to 1275; 0 when not given. */
-  u8 supports_ai;     /**< 1 when ACP, ISRC1 and ISRC2 packets are supported (Supports_AI). */
-  u8 cnc0;            /**< 1 when content type graphics is supported. */
-  u8 cnc1;            /**< 1 when content type photo is supported. */
-  u8 cnc2;            /**< 1 when content type cinema is supported. */
-  u8 cnc3;            /**< 1 when content type game is supported. */
-  u8 hdmi_video_present; /**< 1 when the VSDB carries HDMI video fields (3D and 4Kx2K). */
-  u16 video_latency;  /**< Progressive video latency, ms. 0 when not given; above 500: no valid latency. */
-  u16 audio_latency;  /**< Progressive audio latency, ms. */
-  u16 i_video_latency; /**< Interlaced video latency, ms. */
-  u16 i_audio_latency; /**< Interlaced audio latency, ms. */
-  u8 hdmi_3d_present; /**< 1 when the mandatory 3D formats are supported (HDMI 1.4a, section 8.3.2, 3D_present). */
-  u8 image_size;      /**< Image_Size code, 0 to 3. */
-  u8 hdmi_vic_len;    /**< Number of valid codes in @ref hdmi_vic, 0 to 7. */
-  u32 hdmi_vic[7];    /**< HDMI_VIC codes (HDMI 1.4a, table 8-13): 1 3840x2160p30, 2 3840x2160p25, 3 3840x2160p24,
-                           4 4096x2160p24. */
+  u8 dc_48bit;            /**< 1 when 48-bit deep colour is supported. */
+  u8 dc_36bit;            /**< 1 when 36-bit deep colour is supported. */
+  u8 dc_30bit;            /**< 1 when 30-bit deep colour is supported. */
+  u8 dc_y444;             /**< 1 when deep colour is supported in YCbCr 4:4:4 too. */
+  u8 dvi_dual;            /**< 1 when DVI dual-link is supported. */
+  u32 max_tmds_clock;     /**< Maximum TMDS clock, MHz, a multiple of 5, 0 to 1275; 0 when not given. */
+  u8 supports_ai;         /**< 1 when ACP, ISRC1 and ISRC2 packets are supported (Supports_AI). */
+  u8 cnc0;                /**< 1 when content type graphics is supported. */
+  u8 cnc1;                /**< 1 when content type photo is supported. */
+  u8 cnc2;                /**< 1 when content type cinema is supported. */
+  u8 cnc3;                /**< 1 when content type game is supported. */
+  u8 hdmi_video_present;  /**< 1 when the VSDB carries HDMI video fields (3D and 4Kx2K). */
+  u16 video_latency;      /**< Progressive video latency, ms. 0 when not given; above 500: no valid latency. */
+  u16 audio_latency;      /**< Progressive audio latency, ms. */
+  u16 i_video_latency;    /**< Interlaced video latency, ms. */
+  u16 i_audio_latency;    /**< Interlaced audio latency, ms. */
+  u8 hdmi_3d_present;     /**< 1 when the mandatory 3D formats are supported (HDMI 1.4a, section 8.3.2, 3D_present). */
+  u8 image_size;          /**< Image_Size code, 0 to 3. */
+  u8 hdmi_vic_len;        /**< Number of valid codes in @ref hdmi_vic, 0 to 7. */
+  u32 hdmi_vic[7]; /**< HDMI_VIC codes (HDMI 1.4a, section 8.2.3): 1 3840x2160p30, 2 3840x2160p25, 3 3840x2160p24,
+                        4 4096x2160p24. */
   /* Colorimetry data block */
-  u8 xvycc601;        /**< 1 when xvYCC601 is supported (CEA-861, section 7.5.5). */
-  u8 xvycc709;        /**< 1 when xvYCC709 is supported. */
+  u8 xvycc601; /**< 1 when xvYCC601 is supported (CEA-861, section 7.5.5). */
+  u8 xvycc709; /**< 1 when xvYCC709 is supported. */
 } edid_t;
 
 /** A video mode as a platform describes one. */
@@ -388,46 +389,46 @@ EDID_COMPOSER_API u8 edid_destroy(edid_t *edid);
  * initialised (see @ref linked_list).
  */
 typedef struct platform_values_t {
-  ll_list_t audio_list;          /**< Platform audio formats: list of "int" (@ref i32), each a short audio descriptor with
-                                      its byte 1 in bits 0-7, byte 2 in bits 8-15, byte 3 in bits 16-23. */
-  ll_list_t video_50_priority;   /**< Modes to offer on a 50 Hz sink, best first: list of @ref short_video_desc_t. */
-  ll_list_t video_50_additional; /**< Modes that a 50 Hz sink counts as able to show, whatever its EDID says. */
-  ll_list_t video_60_priority;   /**< Modes to offer on a 60 Hz sink, best first. */
-  ll_list_t video_60_additional; /**< Modes that a 60 Hz sink counts as able to show, whatever its EDID says. */
-  i32 modes_4k_x_2k_priority[7]; /**< HDMI_VICs to offer, best first, 1 to 4 each; the first 0 ends the list. */
-  i32 modes_4k_x_2k_addition[7]; /**< HDMI_VICs that the sink counts as able to show; the first 0 ends the list. */
-  i32 native_refresh_rate;       /**< Refresh family when the sink's EDID doesn't tell: 50 or 60. */
+  ll_list_t audio_list;        /**< Platform audio formats: list of "int" (@ref i32), each a short audio descriptor with
+                                    its byte 1 in bits 0-7, byte 2 in bits 8-15, byte 3 in bits 16-23. */
+  ll_list_t video_50_priority; /**< Modes to offer on a 50 Hz sink, best first: list of @ref short_video_desc_t. */
+  ll_list_t video_50_additional;    /**< Modes that a 50 Hz sink counts as able to show, whatever its EDID says. */
+  ll_list_t video_60_priority;      /**< Modes to offer on a 60 Hz sink, best first. */
+  ll_list_t video_60_additional;    /**< Modes that a 60 Hz sink counts as able to show, whatever its EDID says. */
+  i32 modes_4k_x_2k_priority[7];    /**< HDMI_VICs to offer, best first, 1 to 4 each; the first 0 ends the list. */
+  i32 modes_4k_x_2k_addition[7];    /**< HDMI_VICs that the sink counts as able to show; the first 0 ends the list. */
+  i32 native_refresh_rate;          /**< Refresh family when the sink's EDID doesn't tell: 50 or 60. */
   i32 current_mode_set_to_priority; /**< 1: put the current output mode first. */
-  i32 geometry_limit;            /**< 1: drop modes taller than the sink's tallest short video descriptor. */
-  i32 audio_pass_through;        /**< 0 platform formats, 1 platform and sink formats, 2 sink formats. */
-  i32 underscan;                 /**< 1: declare that IT formats are underscanned. */
-  i32 is_tv;                     /**< 1: the platform is the root of the CEC tree. */
-  i32 dc_30bit;                  /**< 1: offer 30-bit deep colour (36-bit is then offered too). */
-  i32 dc_36bit;                  /**< 1: offer 36-bit deep colour. */
-  i32 tmds_override;             /**< Maximum TMDS clock, MHz, from 25 to 1275; 0 to compute it; 1 to 24 to compute and
-                                      declare it always. */
-  i32 supports_ai;               /**< ACP, ISRC1 and ISRC2 packets, tri-state. */
-  i32 speaker_entry;             /**< Speaker allocation bits (CEA-861, table 44), 1 to 2047. */
-  i32 xvYCC601;                  /**< xvYCC601 colorimetry, tri-state. */
-  i32 xvYCC709;                  /**< xvYCC709 colorimetry, tri-state. */
-  i32 native_bit;                /**< 1: the encoder sets the native bit of the first short video descriptor and of those
-                                      marked native. */
-  u32 product_id;                /**< Product code, 0 to 65535. */
-  u32 serial;                    /**< Serial number. */
-  u32 week;                      /**< Week of manufacture, 0 to 53; 255 for a model year. */
-  u32 year;                      /**< Year of manufacture, 1990 to 2100. */
-  u32 cnc0;                      /**< Content type graphics, tri-state. */
-  u32 cnc1;                      /**< Content type photo, tri-state. */
-  u32 cnc2;                      /**< Content type cinema, tri-state. */
-  u32 cnc3;                      /**< Content type game, tri-state. */
-  char manufacturer_id[4];       /**< Three-letter manufacturer ID and NUL. */
-  char monitor_name[14];         /**< Monitor name, up to 13 characters and NUL. Empty, one character or a leading blank:
-                                      no name descriptor. */
-  char monitor_serial[14];       /**< Serial number text, up to 13 characters and NUL; rules as for the name. */
-  u32 established_timings_1;     /**< Established timings I, bits 0 to 7. 640x480 at 60 Hz is always added. */
-  u32 established_timings_2;     /**< Established timings II, bits 0 to 7. */
-  u32 manufacturer_timings;      /**< Manufacturer's reserved timings, bits 0 to 7. */
-  ll_list_t std_timings;         /**< Standard timings to offer: list of @ref std_timing_t; the first 8 are encoded. */
+  i32 geometry_limit;               /**< 1: drop modes taller than the sink's tallest short video descriptor. */
+  i32 audio_pass_through;           /**< 0 platform formats, 1 platform and sink formats, 2 sink formats. */
+  i32 underscan;                    /**< 1: declare that IT formats are underscanned. */
+  i32 is_tv;                        /**< 1: the platform is the root of the CEC tree. */
+  i32 dc_30bit;                     /**< 1: offer 30-bit deep colour (36-bit is then offered too). */
+  i32 dc_36bit;                     /**< 1: offer 36-bit deep colour. */
+  i32 tmds_override;         /**< Maximum TMDS clock, MHz, from 25 to 1275; 0 to compute it; 1 to 24 to compute and
+                                  declare it always. */
+  i32 supports_ai;           /**< ACP, ISRC1 and ISRC2 packets, tri-state. */
+  i32 speaker_entry;         /**< Speaker allocation bits (CEA-861, section 7.5.3), 1 to 2047. */
+  i32 xvYCC601;              /**< xvYCC601 colorimetry, tri-state. */
+  i32 xvYCC709;              /**< xvYCC709 colorimetry, tri-state. */
+  i32 native_bit;            /**< 1: the encoder sets the native bit of the first short video descriptor and of those
+                                  marked native. */
+  u32 product_id;            /**< Product code, 0 to 65535. */
+  u32 serial;                /**< Serial number. */
+  u32 week;                  /**< Week of manufacture, 0 to 53; 255 for a model year. */
+  u32 year;                  /**< Year of manufacture, 1990 to 2100. */
+  u32 cnc0;                  /**< Content type graphics, tri-state. */
+  u32 cnc1;                  /**< Content type photo, tri-state. */
+  u32 cnc2;                  /**< Content type cinema, tri-state. */
+  u32 cnc3;                  /**< Content type game, tri-state. */
+  char manufacturer_id[4];   /**< Three-letter manufacturer ID and NUL. */
+  char monitor_name[14];     /**< Monitor name, up to 13 characters and NUL. Empty, one character or a leading blank:
+                                  no name descriptor. */
+  char monitor_serial[14];   /**< Serial number text, up to 13 characters and NUL; rules as for the name. */
+  u32 established_timings_1; /**< Established timings I, bits 0 to 7. 640x480 at 60 Hz is always added. */
+  u32 established_timings_2; /**< Established timings II, bits 0 to 7. */
+  u32 manufacturer_timings;  /**< Manufacturer's reserved timings, bits 0 to 7. */
+  ll_list_t std_timings;     /**< Standard timings to offer: list of @ref std_timing_t; the first 8 are encoded. */
 } platform_values_t;
 
 /**
@@ -441,8 +442,8 @@ EDID_COMPOSER_API bool platform_values_init(platform_values_t *values);
 /**
  * Releases the six lists of an initialised record, once.
  *
- * @return true on success; false with a bug line that names the first list that could not be deleted. The lists behind it
- *         then keep their entries.
+ * @return true on success; false with a bug line that names the first list that could not be deleted. The lists behind
+ * it then keep their entries.
  */
 EDID_COMPOSER_API bool platform_values_destroy(platform_values_t *values);
 
@@ -458,7 +459,7 @@ EDID_COMPOSER_API void print_platform_node(u32 node, const char *label);
 /** @defgroup composing Composing an EDID
  * @{ */
 
-/** The caller's settings of one composition; only read, but for the byte that @ref spa_offset points at. */
+/** The caller's settings of one composition; only read, but for the byte at @ref compose_cfg_t::spa_offset. */
 typedef struct compose_cfg_t {
   video_mode_t hdmi_current_mode; /**< The mode the platform puts out now. Used when the platform's
                                        current_mode_set_to_priority is 1 and the mode is plausible: height 100 to 8000,
@@ -467,18 +468,18 @@ typedef struct compose_cfg_t {
                               bits 14, 15, 16. All ones: every format. */
   u32 audio_sink_filter; /**< Exactly 1: offer only audio formats that the sink supports too. */
   i32 hdmi_3d_mode;      /**< 2: always offer 3D; 1: as the sink; anything else: never. */
-  u32 edid_latency[4];   /**< The platform's own video, audio, interlaced video and interlaced audio latency, ms; added to
-                              the sink's. Above 500: no valid latency. */
-  u8 *spa_offset;        /**< Receives the offset, within the 256 bytes, of the two bytes of the physical address, so that
-                              a host can patch it for each input. May be NULL. */
-  u32 port;              /**< Zero-based number of the platform's input; the physical address uses port + 1, 8 bits. */
+  u32 edid_latency[4]; /**< The platform's own video, audio, interlaced video and interlaced audio latency, ms; added to
+                            the sink's. Above 500: no valid latency. */
+  u8 *spa_offset;      /**< Receives the offset, within the 256 bytes, of the two bytes of the physical address, so that
+                            a host can patch it for each input. May be NULL. */
+  u32 port;            /**< Zero-based number of the platform's input; the physical address uses port + 1, 8 bits. */
 } compose_cfg_t;
 
 /**
  * Composes the EDID that the platform shows on its input.
  *
- * Reads the platform configuration through the host's `config_*` operations. A sink EDID that is missing or malformed is
- * reported, not refused: the composition goes on with what could be decoded.
+ * Reads the platform configuration through the host's `config_*` operations. A sink EDID that is missing or malformed
+ * is reported, not refused: the composition goes on with what could be decoded.
  *
  * Prints errors and warnings of module `edid_composer`, and, while tracing is on, every decision and both EDIDs in
  * hexadecimal.
@@ -489,8 +490,8 @@ typedef struct compose_cfg_t {
  * @param new_edid_block the caller's buffer for the new EDID. It may be the buffer of @p edid_block.
  * @param new_edid_bytes its size in bytes; 256.
  * @param cfg the settings; not NULL.
- * @return true when the new EDID was written: base block and CEA-861 extension, 256 bytes. On false the buffer's content
- *         is undefined, but nothing outside of it was written.
+ * @return true when the new EDID was written: base block and CEA-861 extension, 256 bytes. On false the buffer's
+ * content is undefined, but nothing outside of it was written.
  */
 EDID_COMPOSER_API bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
                                     const compose_cfg_t *cfg);
@@ -507,8 +508,9 @@ EDID_COMPOSER_API bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *ne
  *        from one. No configuration is read then. NULL: the configuration is read.
  * @return as for @ref compose_edid; false also when @p platform_values is not initialised.
  */
-EDID_COMPOSER_API bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
-                                             const compose_cfg_t *cfg, const platform_values_t *platform_values);
+EDID_COMPOSER_API bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block,
+                                             u32 new_edid_bytes, const compose_cfg_t *cfg,
+                                             const platform_values_t *platform_values);
 /** @} */
 
 /** @defgroup inspection Looking at an EDID
@@ -536,23 +538,23 @@ EDID_COMPOSER_API void print_edid_audio_mask(u32 mask);
  * @{ */
 
 /**
- * Decodes a base block (EDID 1.3, table 3.1) into a record: identity, features, timings and descriptors.
+ * Decodes a base block (EDID 1.3, section 3) into a record: identity, features, timings and descriptors.
  *
  * @param edid_block exactly 128 bytes are read.
  * @param edid a prepared record; decoding only adds to it.
- * @return 1 on success. 0, with one error line, at the first hard error: a NULL argument, a record that is not prepared, a
- *         bad header, checksum or version, a malformed descriptor. The record keeps what was decoded before, and must be
- *         destroyed all the same.
+ * @return 1 on success. 0, with one error line, at the first hard error: a NULL argument, a record that is not
+ * prepared, a bad header, checksum or version, a malformed descriptor. The record keeps what was decoded before, and
+ * must be destroyed all the same.
  */
 EDID_COMPOSER_API u8 decode_edid_block_0(const u8 *edid_block, edid_t *edid);
 
 /**
- * Decodes a CEA-861 extension of revision 3 (CEA-861, section 7.5), with the HDMI vendor-specific data block (HDMI 1.4a,
- * section 8.3.2), into a record.
+ * Decodes a CEA-861 extension of revision 3 (CEA-861, section 7.5), with the HDMI vendor-specific data block
+ * (HDMI 1.4a, section 8.3.2), into a record.
  *
  * @param edid_extension the extension block.
- * @param length number of bytes there; none is read behind them, and what is missing of a block reads as 0. More than 128
- *        bytes: detailed timings are looked for in the blocks that follow as well.
+ * @param length number of bytes there; none is read behind them, and what is missing of a block reads as 0. More than
+ * 128 bytes: detailed timings are looked for in the blocks that follow as well.
  * @param edid the record that the base block was decoded into; its lists are appended to.
  * @return 1 on success; 0, with one error line, for a NULL argument, another tag or revision, a bad checksum, or a data
  *         block that overruns its collection. The record keeps what was decoded before.
@@ -574,20 +576,21 @@ EDID_COMPOSER_API u8 decode_edid_short_audio(u8 byte1, u8 byte2, u8 byte3, short
  * Encodes a record as base block and CEA-861 extension with the HDMI vendor-specific data block.
  *
  * At most 8 standard timings, 32 short video descriptors and 10 short audio descriptors are written; more of the latter
- * two give a warning. What does not fit the extension is not written, and one error line tells how many bytes it needed;
- * the result does not change by it.
+ * two give a warning. What does not fit the extension is not written, and one error line tells how many bytes it
+ * needed; the result does not change by it.
  *
  * @param edid_blocks receives the bytes; nothing is written outside of them.
  * @param size must be 256.
  * @param edid the record, prepared, with exactly 2 detailed timings. Changed in two places: mandatory 3D structures are
- *        cleared from its video list's 3D masks, and audio types 16 to 18 become 15. So one record must not be encoded by
- *        two threads at once.
+ *        cleared from its video list's 3D masks, and audio types 16 to 18 become 15. So one record must not be encoded
+ * by two threads at once.
  * @param spa_offset receives the offset of the physical address within @p edid_blocks; may be NULL.
  * @param values its native_bit is read; not NULL.
- * @return 1 on success; 0 with one error or bug line. For a bad argument the buffer is untouched, otherwise it is partly
- *         written.
+ * @return 1 on success; 0 with one error or bug line. For a bad argument the buffer is untouched, otherwise it is
+ * partly written.
  */
-EDID_COMPOSER_API u8 encode_edid(u8 *edid_blocks, i32 size, edid_t *edid, u8 *spa_offset, const platform_values_t *values);
+EDID_COMPOSER_API u8 encode_edid(u8 *edid_blocks, i32 size, edid_t *edid, u8 *spa_offset,
+                                 const platform_values_t *values);
 
 /**
  * Encodes a latency (HDMI 1.4a, section 8.3.2, Video_Latency).
@@ -601,7 +604,8 @@ EDID_COMPOSER_API u8 encode_edid_latency_value(u16 latency_ms);
  * Prints a decoded record as a report on standard output.
  *
  * @param edid a prepared record.
- * @param brief nonzero for the brief report, 0 for every field. The long report of a record that is not valid is its title.
+ * @param brief nonzero for the brief report, 0 for every field. The long report of a record that is not valid is its
+ * title.
  * @param title first line, NUL-terminated; NULL prints as an empty one.
  * @return 1; 0 with an error line when @p edid is NULL.
  */
@@ -610,16 +614,17 @@ EDID_COMPOSER_API u8 print_edid_struct(const edid_t *edid, u8 brief, const char 
 
 /** @defgroup timings Video timings
  *
- * Conversions between video identification codes (VICs 1 to 64 of CEA-861, table 4), timings and modes. They answer 1 when
- * a match was found and 0 otherwise; bad arguments print an error line of module `utility`.
+ * Conversions between video identification codes (VICs 1 to 64 of CEA-861, section 4), timings and modes. They answer 1
+ * when a match was found and 0 otherwise; bad arguments print an error line of module `utility`.
  * @{ */
 
-/** Fills @p timing with the timing of @p vic, 1 to 64. Any other VIC prints a warning and leaves @p timing unchanged. */
+/** Fills @p timing with the timing of @p vic, 1 to 64. Any other VIC prints a warning and leaves @p timing unchanged.
+ */
 EDID_COMPOSER_API u8 convert_vic_to_dtd(u32 vic, detailed_timing_t *timing);
 
 /**
- * Finds the VIC of a detailed timing: equal pixel clock, scan, horizontal active and blanking pixels, vertical active lines
- * and picture aspect ratio.
+ * Finds the VIC of a detailed timing: equal pixel clock, scan, horizontal active and blanking pixels, vertical active
+ * lines and picture aspect ratio.
  *
  * @param edid its monitor size gives the aspect ratio of a timing without image size.
  * @param timing the timing.
@@ -627,10 +632,12 @@ EDID_COMPOSER_API u8 convert_vic_to_dtd(u32 vic, detailed_timing_t *timing);
  */
 EDID_COMPOSER_API u8 convert_dtd_to_vic(const edid_t *edid, const detailed_timing_t *timing, u32 *vic);
 
-/** Finds the VIC of a standard timing. @p edid is only tested for NULL. @p vic receives the VIC; 0 when there is none. */
+/** Finds the VIC of a standard timing. @p edid is only tested for NULL. @p vic receives the VIC; 0 when there is none.
+ */
 EDID_COMPOSER_API u8 convert_std_to_vic(const edid_t *edid, const std_timing_t *timing, u32 *vic);
 
-/** Finds the first VIC with the size, scan and whole refresh rate of @p mode. @p vic is untouched when there is none. */
+/** Finds the first VIC with the size, scan and whole refresh rate of @p mode. @p vic is untouched when there is none.
+ */
 EDID_COMPOSER_API u8 mode_to_vic(const video_mode_t *mode, u32 *vic);
 
 /**
@@ -643,17 +650,19 @@ EDID_COMPOSER_API u8 mode_to_vic(const video_mode_t *mode, u32 *vic);
 EDID_COMPOSER_API u8 convert_geo_to_ratio(u32 width, u32 height, u32 *ratio);
 
 /**
- * The refresh rate of a timing: (pixel_clock / (h_active + h_blanking)) / (v_active + v_blanking), each division truncated.
+ * The refresh rate of a timing: (pixel_clock / (h_active + h_blanking)) / (v_active + v_blanking), each division
+ * truncated.
  *
  * @return whole Hz, the field rate of an interlaced timing; 0 when a total is 0.
  */
-EDID_COMPOSER_API u32 calculate_refresh_rate(u32 pixel_clock, u32 h_active, u32 h_blanking, u32 v_active, u32 v_blanking);
+EDID_COMPOSER_API u32 calculate_refresh_rate(u32 pixel_clock, u32 h_active, u32 h_blanking, u32 v_active,
+                                             u32 v_blanking);
 /** @} */
 
 /** @defgroup names Names and printers
  *
- * Name functions answer a read-only text, never NULL, valid as long as the library is loaded. Unknown values have a text
- * too.
+ * Name functions answer a read-only text, never NULL, valid as long as the library is loaded. Unknown values have a
+ * text too.
  * @{ */
 
 /** Name of an aspect-ratio code, such as "16:9"; "InvalidRatio" above 3. */
@@ -681,10 +690,11 @@ EDID_COMPOSER_API const char *short_video_timing_string(u32 vic);
  */
 EDID_COMPOSER_API int audio_freq_string(u32 freq_mask, char *string, u32 string_len);
 
-/** As @ref audio_freq_string, for a sample-size mask (@ref short_audio_desc_t::pcm_bits). 0 gives " NoBitsSpecified". */
+/** As @ref audio_freq_string, for a sample-size mask (@ref short_audio_desc_t::pcm_bits). 0 gives " NoBitsSpecified".
+ */
 EDID_COMPOSER_API int audio_pcm_bits_string(u32 bits_mask, char *string, u32 string_len);
 
-/** Prints the speakers of a speaker allocation payload (CEA-861, table 44) as one line. @p byte3 is not used. */
+/** Prints the speakers of a speaker allocation payload (CEA-861, section 7.5.3) as one line. @p byte3 is not used. */
 EDID_COMPOSER_API void print_speaker(u8 byte1, u8 byte2, u8 byte3);
 
 /** Prints a short audio descriptor as one line. NULL prints an error line. */
@@ -703,10 +713,11 @@ EDID_COMPOSER_API void print_stereo_type(u32 stereo_mask);
  */
 EDID_COMPOSER_API void print_est_man_type(u32 bits, const char *(*string_func)(u32), const char *str);
 
-/** For each bit of 3D_Structure_ALL (HDMI 1.4a, table 8-14), the bit of @ref stereo_mask that it stands for, or 0. */
+/** For each bit of 3D_Structure_ALL (HDMI 1.4a, section 8.3.2), the bit of @ref stereo_mask that it stands for, or 0.
+ */
 EDID_COMPOSER_API extern const u32 _3d_struct_all_array[16];
 
-/** The mandatory 3D formats (HDMI 1.4a, section 8.2.3.2): VIC and mask of the structures that 3D_present implies. */
+/** The mandatory 3D formats (HDMI 1.4a, section 8.2.3): VIC and mask of the structures that 3D_present implies. */
 EDID_COMPOSER_API extern const short_video_desc_t _3d_man_modes[5];
 /** @} */
 
@@ -751,8 +762,8 @@ EDID_COMPOSER_API i32 get_pc_int(const char *key, i32 min, i32 max, i32 default_
  * The platform's configuration: a tree of named nodes that hold integers and strings. The library leaves these eight
  * operations undefined; the process that loads it defines them. They answer 0 for success.
  *
- * A path is a sequence of node names separated by dots, from the root. @p root is always 0. Nodes are known by handles of
- * the host's choice, which must stay valid for the duration of one call into the library. An operation that answers
+ * A path is a sequence of node names separated by dots, from the root. @p root is always 0. Nodes are known by handles
+ * of the host's choice, which must stay valid for the duration of one call into the library. An operation that answers
  * another status leaves its output alone.
  * @{ */
 

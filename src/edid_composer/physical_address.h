@@ -1,4 +1,4 @@
-// The physical address of a platform's input (CEC, section 8.7; HDMI 1.4a, section 8.7.2).
+// The physical address of a platform's input (HDMI 1.4a, section 8.7).
 #pragma once
 
 #include "diagnostics.h"

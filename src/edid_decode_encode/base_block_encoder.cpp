@@ -98,7 +98,7 @@ bool encode_timings(const site_t &site, const edid_t &edid, byte_writer_t *block
   return true;
 }
 
-/// Range limits (EDID 1.3, table 3.26), when all five are known.
+/// Range limits (EDID 1.3, section 3.10.3), when all five are known.
 void encode_range_limits(const edid_t &edid, byte_writer_t *block) {
   namespace layout = display_descriptor;
   if (edid.min_v_rate == 0 || edid.max_v_rate == 0 || edid.min_h_rate == 0 || edid.max_h_rate == 0 ||

@@ -1,4 +1,4 @@
-// Encoding of the base block (EDID 1.3, table 3.1).
+// Encoding of the base block (EDID 1.3, section 3).
 #pragma once
 
 #include "diagnostics.h"

@@ -1,4 +1,4 @@
-// The base block (EDID 1.3, table 3.1).
+// The base block (EDID 1.3, section 3).
 #pragma once
 
 #include "edid_decode_encode/layout.h"

@@ -30,7 +30,7 @@ inline constexpr flag_t support_flags[] = {
 
 }  // namespace cea_extension
 
-/// The header byte of a data block and what stands behind it (CEA-861, tables 36 to 46).
+/// The header byte of a data block and what stands behind it (CEA-861, section 7.5).
 namespace data_block {
 
 inline constexpr u32 tag_shift = 5;
@@ -130,7 +130,7 @@ inline constexpr u32 most_vics = 7;
 /// Only the first 16 short video descriptors can be given 3D structures.
 inline constexpr i32 most_3d_modes = 16;
 
-/// 3D_Structure (table H-2): its code in a 2D_VIC_order entry, its bit in the record's mask, its name in traces. In the
+/// 3D_Structure (appendix H): its code in a 2D_VIC_order entry, its bit in the record's mask, its name in traces. In the
 /// order in which a mode's structures are written.
 struct structure_3d_t {
   u32 code;

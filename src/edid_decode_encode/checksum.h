@@ -1,4 +1,4 @@
-// The checksum of an EDID block (EDID 1.3, table 3.1, byte 127).
+// The checksum of an EDID block (EDID 1.3, section 3).
 #pragma once
 
 #include "bytes.h"

@@ -7,7 +7,7 @@ namespace edid_composer {
 
 inline constexpr u32 descriptor_size = 18;
 
-/// A detailed timing (table 3.16).
+/// A detailed timing (section 3.10.2).
 namespace detailed_timing {
 
 inline constexpr u32 pixel_clock = 0;  ///< In units of 10 kHz, little-endian.
@@ -39,7 +39,7 @@ inline constexpr split_field_t<detailed_timing_t> split_fields[] = {
 
 }  // namespace detailed_timing
 
-/// A display descriptor (table 3.18 and following): its pixel clock is 0.
+/// A display descriptor (section 3.10.3): its pixel clock is 0.
 namespace display_descriptor {
 
 inline constexpr u32 zero_1 = 2;
@@ -60,7 +60,7 @@ inline constexpr u8 manufacturer_0 = 0x00;
 inline constexpr u8 line_feed = 0x0A;
 inline constexpr u8 blank = 0x20;
 
-/// Range limits (table 3.26).
+/// Range limits.
 inline constexpr u32 min_v_rate = 5;
 inline constexpr u32 max_v_rate = 6;
 inline constexpr u32 min_h_rate = 7;

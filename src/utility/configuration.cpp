@@ -4,7 +4,6 @@
 #undef NDEBUG
 #include <cassert>
 #include <cstdio>
-#include <cstring>
 
 #include "diagnostics.h"
 
@@ -69,8 +68,8 @@ bool get_pc_str(const char *key, char *dst, u32 size, const char *default_val, b
     LOG_WARNING("Error trying to read \"%s\" from the platform config. Using:%s", path.text(), default_val);
   }
   // kept: no NUL is written behind the default.
-  const std::size_t length = std::strlen(default_val);
-  std::memcpy(dst, default_val, length < size ? length : size);
+  for (u32 i = 0; i < size && default_val[i] != '\0'; ++i)
+    dst[i] = default_val[i];
   return false;
 }
 

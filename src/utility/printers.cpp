@@ -20,7 +20,7 @@ constexpr bit_name_t sample_rate_names[] = {
 
 constexpr bit_name_t sample_size_names[] = {{0x01, "16bits "}, {0x02, "20bits "}, {0x04, "24bits "}};
 
-// Bytes 1 and 2 of the payload as one number (CEA-861, table 44).
+// Bytes 1 and 2 of the payload as one number (CEA-861, section 7.5.3).
 constexpr bit_name_t speaker_names[] = {
     {0x001, "FL/FR"},    {0x002, " LFE"},     {0x004, " FC"},      {0x008, " RL/RR"},
     {0x010, " RC"},      {0x020, " FLC/FRC"}, {0x040, " RLC/RRC"}, {0x080, " FLW/FRW"},

@@ -1,4 +1,4 @@
-// The table of video timings (CEA-861, table 4), the one place where a VIC's timing is told.
+// The table of video timings (CEA-861, section 4), the one place where a VIC's timing is told.
 #pragma once
 
 #include "edid_composer.h"

@@ -1,0 +1,124 @@
+// Whole compositions: settings, a configuration tree and a sink from one input.
+#include <array>
+#include <string>
+
+#include "fuzz_input.h"
+#include "fuzz_target.h"
+#include "sink_bytes.h"
+#include "support/configuration_tree.h"
+
+namespace {
+
+constexpr std::array<const char *, 25> scalar_keys = {
+    "native_refresh_rate",
+    "current_mode_set_to_priority",
+    "audio.pass_through",
+    "underscan",
+    "is_tv",
+    "geometry_limit",
+    "dc_30bit",
+    "dc_36bit",
+    "tmds_override",
+    "supports_ai",
+    "speaker_entry",
+    "xvYCC601",
+    "xvYCC709",
+    "native_bit",
+    "product_id",
+    "serial",
+    "week",
+    "year",
+    "CNC0",
+    "CNC1",
+    "CNC2",
+    "CNC3",
+    "manufacturer_id",
+    "monitor_name",
+    "monitor_serial",
+};
+
+constexpr std::array<const char *, 10> list_keys = {
+    "50_hz_priority_list",   "50_hz_addition_list",   "60_hz_priority_list",   "60_hz_addition_list",
+    "4k_x_2k_priority_list", "4k_x_2k_addition_list", "established_timings_1", "established_timings_2",
+    "manufacturer_timings",  "standard_timings",
+};
+
+/// The many entries that a valid configuration has, before the fuzzer's own.
+void add_modes(fuzz::fuzz_input_t *input, test_support::configuration_tree_t *tree) {
+  constexpr std::array<const char *, 5> flags = {"", " FP", " FP TBH", " SBSH", " FP TBH SBSH"};
+  for (u32 count = input->below(48); count > 0; --count) {
+    const std::string mode = std::to_string(1 + input->below(64)) + flags[input->below(flags.size())];
+    tree->add(input->flag() ? "60_hz_priority_list" : "50_hz_priority_list", mode);
+    tree->add(input->flag() ? "60_hz_addition_list" : "50_hz_addition_list", mode);
+  }
+  for (u32 count = input->below(27); count > 0; --count) {
+    tree->set(std::string("audio.entry_") + static_cast<char>('a' + count - 1), input->number() & 0xFFFFFF);
+  }
+}
+
+void add_anything(fuzz::fuzz_input_t *input, test_support::configuration_tree_t *tree) {
+  for (u32 count = input->below(40); count > 0; --count) {
+    const bool is_list = input->flag();
+    const bool is_text = input->flag();
+    const std::string key =
+        is_list ? list_keys[input->below(list_keys.size())] : scalar_keys[input->below(scalar_keys.size())];
+    if (is_list && is_text) {
+      tree->add(key, input->text(40));
+    } else if (is_list) {
+      tree->add(key, static_cast<i32>(input->flag() ? input->below(9) : input->number()));
+    } else if (is_text) {
+      tree->set(key, input->text(40));
+    } else {
+      tree->set(key, static_cast<i32>(input->flag() ? input->below(3) : input->number()));
+    }
+  }
+}
+
+compose_cfg_t settings(fuzz::fuzz_input_t *input, u8 *spa_offset) {
+  constexpr std::array<video_mode_t, 4> modes = {
+      video_mode_t{1920, 1080, 0, 60}, {1920, 1080, 1, 50}, {720, 480, 1, 60}, {1366, 768, 0, 60}};
+  compose_cfg_t cfg{};
+  cfg.hdmi_current_mode = modes[input->below(modes.size())];
+  cfg.audio_mask = input->flag() ? 0xFFFFFFFF : input->number();
+  cfg.audio_sink_filter = input->below(3);
+  cfg.hdmi_3d_mode = static_cast<i32>(input->below(4)) - 1;
+  for (u32 &latency : cfg.edid_latency)
+    latency = input->flag() ? input->below(600) : input->number();
+  cfg.spa_offset = spa_offset;
+  cfg.port = input->flag() ? input->below(15) : input->number();
+  return cfg;
+}
+
+}  // namespace
+
+int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
+  constexpr std::size_t longest_sink = 512;
+  constexpr u32 edid_size = 256;
+  fuzz::fuzz_input_t input(data, size);
+  const u8 options = input.byte();
+  debug_enable((options & 1) != 0);
+  u8 spa_offset = 0;
+  const compose_cfg_t cfg = settings(&input, (options & 2) != 0 ? &spa_offset : nullptr);
+  test_support::configuration_tree_t tree;
+  if ((options & 4) != 0) tree.fill_completely();
+  if ((options & 8) != 0) add_modes(&input, &tree);
+  add_anything(&input, &tree);
+  auto sink = input.rest(longest_sink);
+  if ((options & 16) != 0 && sink.size >= fuzz::block_size) fuzz::mend_base_block(sink.bytes.get());
+  if ((options & 32) != 0 && sink.size >= 2 * fuzz::block_size) {
+    fuzz::mend_extension(sink.bytes.get() + fuzz::block_size);
+  }
+
+  const auto composed = input.block(edid_size);
+  if (!compose_edid(sink.bytes.get(), sink.size, composed.bytes.get(), edid_size, &cfg)) return 0;
+  u32 sum = 0;
+  for (u32 i = fuzz::block_size; i < edid_size; ++i)
+    sum += composed.bytes[i];
+  FUZZ_REQUIRE(sum % 256 == 0);
+  if (cfg.spa_offset != nullptr) FUZZ_REQUIRE(spa_offset > fuzz::block_size && spa_offset < edid_size - 2);
+
+  const auto again = input.block(edid_size);
+  FUZZ_REQUIRE(compose_edid(sink.bytes.get(), sink.size, again.bytes.get(), edid_size, &cfg));
+  FUZZ_REQUIRE(std::memcmp(composed.bytes.get(), again.bytes.get(), edid_size) == 0);
+  return 0;
+}

@@ -1,0 +1,127 @@
+#include "atomic_file.h"
+
+#include <fcntl.h>
+#include <stdlib.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+#include <filesystem>
+#include <memory>
+
+#include "bad_input.h"
+#include "file_descriptor.h"
+
+namespace edid_cli {
+namespace {
+
+[[noreturn]] void refuse(const std::string &name) {
+  throw bad_input_t(name + ": cannot write: " + std::strerror(errno));
+}
+
+/// The permissions of a new file, as the user's mask has them.
+mode_t default_mode() {
+  const mode_t mask = umask(0);
+  umask(mask);
+  return 0666 & ~mask;
+}
+
+std::string directory_of(const std::string &file) {
+  const std::string directory = std::filesystem::path(file).parent_path();
+  return directory.empty() ? "." : directory;
+}
+
+/// A file beside the target that is removed again unless it has taken the target's place.
+class temporary_file_t {
+ public:
+  explicit temporary_file_t(const std::string &target)
+      : target_(target),
+        path_(directory_of(target) + "/.edid-composer.XXXXXX"),
+        descriptor_(mkostemp(path_.data(), O_CLOEXEC)) {
+    if (!descriptor_.is_open()) {
+      refuse(target_);
+    }
+  }
+  ~temporary_file_t() {
+    if (!is_in_place_) {
+      unlink(path_.c_str());
+    }
+  }
+  temporary_file_t(const temporary_file_t &) = delete;
+  temporary_file_t &operator=(const temporary_file_t &) = delete;
+
+  void write(std::span<const u8> bytes, mode_t mode) {
+    write_all(descriptor_.get(), bytes, target_);
+    if (fchmod(descriptor_.get(), mode) != 0 || fsync(descriptor_.get()) != 0 || !descriptor_.close()) {
+      refuse(target_);
+    }
+  }
+
+  void take_the_place_of_the_target() {
+    if (std::rename(path_.c_str(), target_.c_str()) != 0) {
+      refuse(target_);
+    }
+    is_in_place_ = true;
+  }
+
+ private:
+  std::string target_;
+  std::string path_;
+  file_descriptor_t descriptor_;
+  bool is_in_place_ = false;
+};
+
+void write_directly(const std::string &file, std::span<const u8> bytes) {
+  file_descriptor_t descriptor(open(file.c_str(), O_WRONLY | O_CLOEXEC));
+  if (!descriptor.is_open()) {
+    refuse(file);
+  }
+  write_all(descriptor.get(), bytes, file);
+  if (!descriptor.close()) {
+    refuse(file);
+  }
+}
+
+/// A link is followed: what it points at is replaced, not the link.
+std::string resolve(const std::string &file) {
+  const std::unique_ptr<char, decltype(&free)> path(realpath(file.c_str(), nullptr), free);
+  return path == nullptr ? file : std::string(path.get());
+}
+
+/// The new directory entry outlives a power failure. Some file systems can't do this; the file itself is safe by then.
+void flush_directory_of(const std::string &file) {
+  const file_descriptor_t descriptor(open(directory_of(file).c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+  if (descriptor.is_open()) {
+    static_cast<void>(fsync(descriptor.get()));
+  }
+}
+
+}  // namespace
+
+void write_all(int descriptor, std::span<const u8> bytes, const std::string &name) {
+  while (!bytes.empty()) {
+    const ssize_t size = write(descriptor, bytes.data(), bytes.size());
+    if (size < 0 && errno != EINTR) {
+      refuse(name);
+    }
+    bytes = bytes.subspan(size < 0 ? 0 : static_cast<std::size_t>(size));
+  }
+}
+
+void write_file_atomically(const std::string &file, std::span<const u8> bytes) {
+  struct stat existing {};
+  const bool exists = stat(file.c_str(), &existing) == 0;
+  if (exists && !S_ISREG(existing.st_mode)) {
+    write_directly(file, bytes);
+    return;
+  }
+  const std::string target = resolve(file);
+  temporary_file_t temporary(target);
+  temporary.write(bytes, exists ? existing.st_mode & 0777 : default_mode());
+  temporary.take_the_place_of_the_target();
+  flush_directory_of(target);
+}
+
+}  // namespace edid_cli

@@ -1,0 +1,19 @@
+// Bytes written as hexadecimal text.
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "edid_composer.h"
+
+namespace edid_cli {
+
+/// Reads pairs of hexadecimal digits. White space and commas separate them where wanted, "0x" may stand before a group,
+/// and
+/// "#" begins a comment that ends with its line.
+///
+/// Throws bad_input_t, which begins with @p name and the number of the line.
+std::vector<u8> parse_hex_text(std::string_view text, const std::string &name);
+
+}  // namespace edid_cli

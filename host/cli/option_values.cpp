@@ -1,0 +1,66 @@
+#include "option_values.h"
+
+#include <string>
+
+#include "bad_input.h"
+#include "whole_number.h"
+
+namespace edid_cli {
+namespace {
+
+constexpr u32 max_port = 14;
+constexpr u32 max_latency_ms = 65535;
+
+[[noreturn]] void refuse(std::string_view text, const std::string &expected) {
+  throw bad_input_t("\"" + std::string(text) + "\" is not " + expected);
+}
+
+}  // namespace
+
+u32 parse_mask(std::string_view text) {
+  const bool hexadecimal = text.starts_with("0x") || text.starts_with("0X");
+  const auto mask = hexadecimal ? parse_whole_number(text.substr(2), 16) : parse_whole_number(text);
+  if (!mask) {
+    refuse(text, "a number of 32 bits, decimal or 0x hexadecimal");
+  }
+  return *mask;
+}
+
+u32 parse_port(std::string_view text) {
+  const auto port = parse_whole_number(text);
+  if (!port || *port > max_port) {
+    refuse(text, "a port from 0 to 14");
+  }
+  return *port;
+}
+
+i32 parse_3d_mode(std::string_view text) {
+  if (text == "off") {
+    return no_3d_mode;
+  }
+  if (text == "sink") {
+    return follow_sink_3d_mode;
+  }
+  if (text == "on") {
+    return always_3d_mode;
+  }
+  refuse(text, "off, sink or on");
+}
+
+latency_t parse_latency(std::string_view text) {
+  latency_t latency{};
+  std::string_view rest = text;
+  for (std::size_t field = 0; field < latency.size(); ++field) {
+    const bool is_last = field + 1 == latency.size();
+    const std::size_t end = is_last ? rest.size() : rest.find(',');
+    const auto milliseconds = parse_whole_number(rest.substr(0, end));
+    if (!milliseconds || *milliseconds > max_latency_ms || end == std::string_view::npos) {
+      refuse(text, "four latencies from 0 to 65535 ms, separated by commas");
+    }
+    latency[field] = *milliseconds;
+    rest.remove_prefix(is_last ? end : end + 1);
+  }
+  return latency;
+}
+
+}  // namespace edid_cli

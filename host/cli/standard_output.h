@@ -1,0 +1,24 @@
+// Where the library's output goes: it prints on C's standard output.
+#pragma once
+
+#include "file_descriptor.h"
+
+namespace edid_cli {
+
+/// While it lives, standard output goes to where another descriptor points.
+class standard_output_redirect_t {
+ public:
+  /// Throws bad_input_t when the system has no descriptors left.
+  explicit standard_output_redirect_t(int target);
+  ~standard_output_redirect_t();
+  standard_output_redirect_t(const standard_output_redirect_t &) = delete;
+  standard_output_redirect_t &operator=(const standard_output_redirect_t &) = delete;
+
+ private:
+  file_descriptor_t original_;
+};
+
+/// Writes out what is buffered. Throws bad_input_t when any of the output could not be written.
+void flush_standard_output();
+
+}  // namespace edid_cli

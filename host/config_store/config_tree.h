@@ -1,0 +1,74 @@
+// The configuration tree: named nodes that hold an integer, a text or children, found by path or by handle.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace edid_config_store {
+
+/// A handle is the node's position in the tree's node table; the root is 0.
+using node_handle_t = std::uint32_t;
+inline constexpr node_handle_t root_handle = 0;
+
+enum class node_kind_t : std::uint8_t { branch, integer, text };
+
+/// Built once with the add operations, then sealed by build_index() and only read.
+class config_tree_t {
+ public:
+  config_tree_t();
+
+  /// Appends a child to @p parent. @p name is unique among its siblings and not empty.
+  node_handle_t add_branch(node_handle_t parent, std::string_view name);
+  void add_integer(node_handle_t parent, std::string_view name, std::int32_t number);
+  void add_text(node_handle_t parent, std::string_view name, std::string_view text);
+
+  /// Makes the nodes added so far known to find().
+  void build_index();
+
+  /// Finds the node at a path from the root; the empty path is the root. Takes the same time for any size of the tree.
+  std::optional<node_handle_t> find(std::string_view path) const;
+
+  std::optional<node_handle_t> first_child(node_handle_t node) const;
+  std::optional<node_handle_t> next_sibling(node_handle_t node) const;
+
+  /// What a node is and holds. Views live as long as the tree; for a handle of no node there is nothing.
+  std::optional<std::string_view> path(node_handle_t node) const;
+  std::optional<std::string_view> name(node_handle_t node) const;
+  std::optional<std::int32_t> integer(node_handle_t node) const;
+  std::optional<std::string_view> text(node_handle_t node) const;
+
+ private:
+  static constexpr node_handle_t no_node = 0xFFFFFFFF;
+
+  /// A stretch of characters_.
+  struct span_t {
+    std::uint32_t offset = 0;
+    std::uint32_t length = 0;
+  };
+
+  struct node_t {
+    node_kind_t kind = node_kind_t::branch;
+    std::int32_t number = 0;
+    span_t path;  ///< The name is its end.
+    std::uint32_t name_length = 0;
+    span_t text;
+    node_handle_t first_child = no_node;
+    node_handle_t last_child = no_node;
+    node_handle_t next_sibling = no_node;
+  };
+
+  node_handle_t add(node_handle_t parent, std::string_view name, node_kind_t kind);
+  span_t store(std::string_view characters);
+  std::string_view view(span_t span) const;
+  const node_t *at(node_handle_t node) const;
+
+  std::vector<node_t> nodes_;
+  std::string characters_;
+  /// Open addressing by the path's hash, with at least half of the slots free. Its size is a power of two.
+  std::vector<node_handle_t> index_;
+};
+
+}  // namespace edid_config_store

@@ -1,0 +1,38 @@
+#!/bin/sh
+# The long runs: each fuzz target for a while (default 30 minutes), more random properties, and the tests under valgrind.
+# usage: scripts/soak.sh [SECONDS PER FUZZ TARGET] [TARGET...]
+set -eu
+cd "$(dirname "$0")/.."
+. scripts/install_packages.sh
+
+seconds=${1:-1800}
+[ $# -gt 0 ] && shift
+targets=${*:-base_block extension print compose encode}
+echo "Fuzzing ($targets) for $seconds seconds each, then random properties and valgrind; takes the sum and 20 minutes."
+install_packages build-essential cmake ninja-build clang libclang-rt-14-dev libgtest-dev libgmock-dev valgrind
+
+cmake --preset fuzz
+for target in $targets; do
+  cmake --build --preset fuzz --target "fuzz_$target"
+done
+corpus=build/fuzz/corpus
+findings=build/fuzz/findings
+for target in $targets; do
+  mkdir -p "$corpus/$target" "$findings/$target"
+  echo "fuzz_$target"
+  build/fuzz/bin/"fuzz_$target" -max_total_time="$seconds" -timeout=10 -max_len=2048 -print_final_stats=1 \
+    -artifact_prefix="$findings/$target/" "$corpus/$target" "fuzz/seeds/$target" 2>"$corpus/$target.log" || {
+    tail -40 "$corpus/$target.log" >&2
+    exit 1
+  }
+  grep -E 'DONE|number_of_executed_units|average_exec' "$corpus/$target.log"
+done
+
+cmake --preset release
+cmake --build --preset release
+EDID_COMPOSER_PROPERTY_RUNS=20000 build/release/bin/property_tests --gtest_brief=1
+for suite in unit_tests end_to_end_tests; do
+  valgrind --quiet --error-exitcode=1 --leak-check=full --errors-for-leak-kinds=definite,indirect \
+    build/release/bin/$suite --gtest_brief=1 --gtest_filter='-*DeathTest*'
+done
+echo 'Soaked without a finding.'

@@ -1,0 +1,22 @@
+#!/bin/sh
+# Builds everything and runs every test: optimised, and with AddressSanitizer and UndefinedBehaviorSanitizer.
+# Needs a Debian 12 machine, and root or sudo if one of the packages below is missing.
+# With CI=true in the environment, compiler warnings are errors.
+set -eu
+cd "$(dirname "$0")/.."
+. scripts/install_packages.sh
+
+echo 'Building everything twice (optimised, with sanitizers) and running all tests; takes 3 to 12 minutes.'
+install_packages build-essential cmake ninja-build git libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev
+
+warnings_are_errors=OFF
+if [ "${CI:-}" = true ]; then
+  warnings_are_errors=ON
+fi
+
+for preset in release asan; do
+  cmake --preset "$preset" -DBUILD_TESTING=ON -DEDID_COMPOSER_WERROR="$warnings_are_errors"
+  cmake --build --preset "$preset"
+  ctest --preset "$preset" -j "$(nproc)"
+done
+echo 'All tests passed.'

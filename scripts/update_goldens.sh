@@ -1,0 +1,20 @@
+#!/bin/sh
+# Composes every golden case anew and writes tests/end_to_end/golden. What changed is then to be reviewed like code:
+# git diff tests/end_to_end/golden
+# Needs a Debian 12 machine, and root or sudo if one of the packages below is missing.
+set -eu
+cd "$(dirname "$0")/.."
+. scripts/install_packages.sh
+
+echo 'Building the library and the golden maker, and making the goldens anew; takes 1 to 5 minutes.'
+install_packages build-essential cmake ninja-build libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev
+
+build() {
+  cmake --preset release -DBUILD_TESTING=ON && cmake --build --preset release --target golden_maker
+}
+mkdir -p build
+if ! build >build/goldens.log 2>&1; then
+  cat build/goldens.log >&2
+  exit 1
+fi
+build/release/bin/golden_maker

@@ -1,0 +1,97 @@
+#!/usr/bin/env python3
+"""Holds what is written of the configuration's keys to what the library does.
+
+The tables of platform-configuration.md and the list of edid-platform.toml(5) name every key that the library reads and
+no other; limits and defaults are compared with those that it names itself when values are missing, too small and too
+large.
+"""
+
+import argparse
+import pathlib
+import re
+import sys
+
+import markdown
+import platform_keys
+import scratch as scratch_folder
+
+RANGE = re.compile(r"(-?\d+) to (-?\d+)")
+SMALLEST, LARGEST = -2147483648, 4294967295
+
+
+def of_markdown(text):
+    """Each key's limits and default as a table tells them; None where it tells no number."""
+    keys = {}
+    for table in markdown.tables(text):
+        for row in table:
+            if "Key" not in row:
+                continue
+            limits = RANGE.fullmatch(row["Limits"])
+            is_number = row["Type"] == "integer" and limits is not None
+            keys[row["Key"].split("`")[1]] = (limits[1], limits[2], row["Default"]) if is_number else None
+    return keys
+
+
+def of_man_page(text):
+    """The same from a manual page: an item for each key, and a sentence behind it."""
+    keys = {}
+    for name, sentence in re.findall(r"^\.It Ic (\S+)\n(.*)$", text, re.MULTILINE):
+        number = re.match(rf"Integer, {RANGE.pattern}; default (\S+)\.$", sentence)
+        keys[name] = (number[1], number[2], number[3]) if number else None
+    return keys
+
+
+def of_library(scratch):
+    """The same as the library tells it, of itself."""
+    asked = platform_keys.asked_for(scratch)
+    numbers = [path for path, (kind, _) in asked.items() if kind == "number"]
+    limits = {}
+    for value in (SMALLEST, 2147483647, LARGEST):
+        text = "".join(f"{path} = {value}\n" for path in numbers)
+        limits.update(platform_keys.limits(platform_keys.compose(scratch, text)[1]))
+    keys = {}
+    for path, (kind, default) in asked.items():
+        # A number that nothing is too large for is unsigned and may be any.
+        low, high = limits.get(path, ("0", str(LARGEST)))
+        keys[path.removeprefix(f"{platform_keys.DOMAIN}.")] = (low, high, default) if kind == "number" else None
+    return keys
+
+
+def problems(documented, library, name):
+    audio_entries = {key for key in documented if platform_keys.AUDIO_ENTRY.fullmatch(f"{platform_keys.DOMAIN}.{key}")}
+    if not audio_entries:
+        yield f"{name}: the audio entries are missing"
+    for key in sorted(library.keys() - documented.keys()):
+        yield f"{name}: {key} is missing"
+    for key in sorted(documented.keys() - library.keys() - audio_entries):
+        yield f"{name}: {key} is read by nobody"
+    for key in sorted(documented.keys() & library.keys()):
+        if documented[key] != library[key]:
+            yield f"{name}: {key} is documented as {documented[key]}, but is {library[key]}"
+
+
+def main():
+    parser = argparse.ArgumentParser(description=__doc__)
+    parser.add_argument("--source", type=pathlib.Path, required=True)
+    parser.add_argument("--prefix", type=pathlib.Path, required=True)
+    parser.add_argument("--libdir", default="lib")
+    arguments = parser.parse_args()
+
+    documents = {
+        "docs/platform-configuration.md": of_markdown,
+        "docs/man/edid-platform.toml.5": of_man_page,
+    }
+    with scratch_folder.Scratch(arguments.source, arguments.prefix, arguments.libdir) as scratch:
+        library = of_library(scratch)
+    found = []
+    for name, reader in documents.items():
+        found += problems(reader((arguments.source / name).read_text()), library, name)
+    for problem in found:
+        print(problem, file=sys.stderr)
+    numbers = sum(1 for value in library.values() if value)
+    print(f"{len(library)} keys, {numbers} of them numbers with limits and default: {len(found)} problems")
+    return 1 if found else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())

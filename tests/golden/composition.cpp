@@ -1,0 +1,95 @@
+#include "composition.h"
+
+#include <algorithm>
+#include <fstream>
+#include <sstream>
+#include <stdexcept>
+
+#include "annotation.h"
+#include "config_store.h"
+#include "support/hex_text.h"
+#include "support/output_capture.h"
+#include "text_format.h"
+
+namespace golden {
+namespace {
+
+void load_platform(const std::string &name) {
+  const bool loaded = name == "default" ? config_store_load_default()
+                                        : config_store_load_file((platforms_directory() / (name + ".toml")).c_str());
+  if (!loaded) throw std::runtime_error(config_store_error());
+}
+
+compose_cfg_t settings_of(const golden_case_t &golden_case, u8 *address_offset) {
+  compose_cfg_t settings{};
+  settings.hdmi_current_mode = golden_case.current_mode;
+  settings.audio_mask = golden_case.audio_mask;
+  settings.audio_sink_filter = golden_case.audio_sink_filter ? 1 : 0;
+  settings.hdmi_3d_mode = golden_case.hdmi_3d_mode;
+  std::copy(golden_case.latency_ms.begin(), golden_case.latency_ms.end(), settings.edid_latency);
+  settings.spa_offset = address_offset;
+  settings.port = golden_case.port;
+  return settings;
+}
+
+std::string report_of(const golden_case_t &golden_case, const std::vector<u8> &edid, bool brief) {
+  return test_support::output_of(
+      [&] { print_edid(edid.data(), static_cast<u32>(edid.size()), brief ? 1 : 0, golden_case.name().c_str()); });
+}
+
+std::string hex_of(const golden_case_t &golden_case, const composition_t &composition) {
+  return format("# What the platform \"%s\" shows for the sink \"%s\".\n", golden_case.platform, golden_case.sink) +
+         "# " + golden_case.settings() + "\n" +
+         format("# The physical address stands at byte %u.\n\n", composition.address_offset) +
+         annotated(composition.edid);
+}
+
+}  // namespace
+
+std::filesystem::path sinks_directory() {
+  return std::filesystem::path(EXAMPLES_DIRECTORY) / "sinks";
+}
+
+std::filesystem::path platforms_directory() {
+  return std::filesystem::path(EXAMPLES_DIRECTORY) / "platforms";
+}
+
+std::filesystem::path golden_directory() {
+  return GOLDEN_DIRECTORY;
+}
+
+composition_t composed(const golden_case_t &golden_case, bool tracing) {
+  constexpr u32 edid_size = 256;
+  load_platform(golden_case.platform);
+  const std::vector<u8> sink =
+      test_support::bytes_of_hex_file((sinks_directory() / (std::string(golden_case.sink) + ".txt")).string());
+  composition_t composition;
+  composition.edid.resize(edid_size);
+  const compose_cfg_t settings = settings_of(golden_case, &composition.address_offset);
+
+  bool done = false;
+  const auto compose = [&] {
+    done = compose_edid(sink.data(), static_cast<u32>(sink.size()), composition.edid.data(), edid_size, &settings);
+  };
+  composition.log = tracing ? test_support::traced_output_of(compose) : test_support::output_of(compose);
+  if (!done) throw std::runtime_error(golden_case.name() + ": the library refused\n" + composition.log);
+  return composition;
+}
+
+std::map<std::string, std::string> golden_texts(const golden_case_t &golden_case) {
+  const composition_t composition = composed(golden_case, true);
+  return {{golden_case.name() + ".hex", hex_of(golden_case, composition)},
+          {golden_case.name() + ".brief.txt", report_of(golden_case, composition.edid, true)},
+          {golden_case.name() + ".report.txt", report_of(golden_case, composition.edid, false)},
+          {golden_case.name() + ".trace.txt", composition.log}};
+}
+
+std::string content_of(const std::filesystem::path &file) {
+  std::ifstream stream(file, std::ios::binary);
+  std::ostringstream content;
+  content << stream.rdbuf();
+  if (!stream) throw std::runtime_error("cannot read " + file.string());
+  return content.str();
+}
+
+}  // namespace golden

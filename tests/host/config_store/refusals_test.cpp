@@ -1,0 +1,178 @@
+// What is refused, with which error, and that nothing of it arrives.
+#include "config_store/store_fixture.h"
+#include "support/temporary_directory.h"
+
+namespace host_test {
+namespace {
+
+struct refusal_case_t {
+  const char *name;
+  std::string document;
+  std::string error;
+};
+
+void PrintTo(const refusal_case_t &tested, std::ostream *stream) {
+  *stream << tested.name;
+}
+
+std::string nested_tables(int depth) {
+  std::string document = "[t";
+  for (int level = 1; level < depth; ++level) {
+    document += ".t";
+  }
+  return document + "]\n";
+}
+
+std::string repeated(const std::string &text, int times) {
+  std::string result;
+  for (int count = 0; count < times; ++count) {
+    result += text;
+  }
+  return result;
+}
+
+const std::string only_these = " cannot be stored; use an integer, a string, a boolean, an array or a table";
+
+class ConfigRefusal : public ConfigStore, public testing::WithParamInterface<refusal_case_t> {};
+
+TEST_P(ConfigRefusal, NamesLineColumnAndKey) {
+  EXPECT_EQ(refusal_of(GetParam().document), GetParam().error);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Values, ConfigRefusal,
+    testing::Values(
+        refusal_case_t{"Float", "a = 1.5\n", "test.toml:1:5: a: a floating-point number" + only_these},
+        refusal_case_t{"NotANumber", "\na = nan\n", "test.toml:2:5: a: a floating-point number" + only_these},
+        refusal_case_t{"Date", "[x]\nday = 2024-02-29\n", "test.toml:2:7: x.day: a date" + only_these},
+        refusal_case_t{"Time", "[x]\nat = 07:30:00\n", "test.toml:2:6: x.at: a time" + only_these},
+        refusal_case_t{"DateAndTime", "at = 2024-02-29T07:30:00Z\n", "test.toml:1:6: at: a date and time" + only_these},
+        refusal_case_t{"FloatInAList", "[x]\nlist = [1, 2.5]\n",
+                       "test.toml:2:12: x.list.1: a floating-point number" + only_these},
+        refusal_case_t{"TooLarge", "[x.y]\nserial = 4294967296\n",
+                       "test.toml:2:10: x.y.serial: 4294967296 does not fit 32 bits (-2147483648 to 4294967295)"},
+        refusal_case_t{"TooSmall", "a = -2147483649\n",
+                       "test.toml:1:5: a: -2147483649 does not fit 32 bits (-2147483648 to 4294967295)"},
+        refusal_case_t{"NulInAString", "a = \"x\\u0000y\"\n", "test.toml:1:5: a: the string holds a NUL character"}),
+    [](const auto &tested) { return tested.param.name; });
+
+INSTANTIATE_TEST_SUITE_P(
+    Keys, ConfigRefusal,
+    testing::Values(
+        refusal_case_t{"Empty", "[x]\n\"\" = 1\n", "test.toml:2:1: x.: an empty key cannot be looked up"},
+        refusal_case_t{
+            "WithADot", "[x]\n\"audio.mode\" = 1\n",
+            "test.toml:2:1: x.audio.mode: a key with a dot in it cannot be looked up, since dots separate the "
+            "names of a path"},
+        refusal_case_t{"WithAControlCharacter", "\"a\\nb\" = 1\n",
+                       "test.toml:1:1: a\\nb: a key with a control character in it cannot be looked up"},
+        refusal_case_t{"PathTooLong", repeated("a", 256) + " = 1\n",
+                       "test.toml:1:1: " + repeated("a", 256) + ": the path is longer than 255 characters"},
+        refusal_case_t{"NestedTooDeep", nested_tables(65),
+                       "test.toml:1:130: t" + repeated(".t", 64) + ": tables and arrays are nested more than 64 deep"},
+        refusal_case_t{"WithoutEnd", "\na" + repeated(".a", 100000) + " = 1\n",
+                       "test.toml:2:1: more than 128 dots in one line"}),
+    [](const auto &tested) { return tested.param.name; });
+
+TEST_F(ConfigStore, TheDeepestNestingAndTheLongestPathAreAccepted) {
+  EXPECT_TRUE(load(nested_tables(64))) << config_store_error();
+  EXPECT_TRUE(load(repeated("a", 255) + " = 1\n")) << config_store_error();
+  EXPECT_EQ(integer_at(repeated("a", 255)), 1);
+}
+
+struct malformed_case_t {
+  const char *name;
+  std::string document;
+  std::string position;  ///< How the error begins.
+};
+
+void PrintTo(const malformed_case_t &tested, std::ostream *stream) {
+  *stream << tested.name;
+}
+
+class MalformedDocument : public ConfigStore, public testing::WithParamInterface<malformed_case_t> {};
+
+TEST_P(MalformedDocument, IsRefusedInOneLineThatBeginsWithThePosition) {
+  const std::string error = refusal_of(GetParam().document);
+  EXPECT_EQ(error.substr(0, GetParam().position.size()), GetParam().position);
+  EXPECT_GT(error.size(), GetParam().position.size());
+  EXPECT_EQ(error.find('\n'), std::string::npos) << error;
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Documents, MalformedDocument,
+    testing::Values(malformed_case_t{"TwoValues", "a = 1\nb = 5 5\n", "test.toml:2:7: "},
+                    malformed_case_t{"DuplicateKey", "a = 1\na = 2\n", "test.toml:2:"},
+                    malformed_case_t{"UnclosedString", "a = \"x\n", "test.toml:1:"},
+                    malformed_case_t{"UnclosedTable", "[a\n", "test.toml:1:"},
+                    malformed_case_t{"UnclosedArray", "a = [1,\n", "test.toml:1:"},
+                    malformed_case_t{"MissingValue", "a =\n", "test.toml:1:"},
+                    malformed_case_t{"NumberBeyond64Bits", "a = 99999999999999999999\n", "test.toml:1:"},
+                    malformed_case_t{"WrongWord", "a = tru\n", "test.toml:1:"},
+                    malformed_case_t{"InvalidUtf8", "a = \"\xFF\"\n", "test.toml:1:"},
+                    malformed_case_t{"NulByte", std::string("a = 1\n\0b = 2\n", 13), "test.toml:2:"}),
+    [](const auto &tested) { return tested.param.name; });
+
+TEST_F(ConfigStore, AFailedLoadLeavesTheTreeAsItWas) {
+  ASSERT_TRUE(load("keep = 1\n[list]\nb = 1\na = 2\n"));
+  u32 node = 0;
+  ASSERT_EQ(config_node_find(0, "list", &node), 0);
+  EXPECT_NE(refusal_of("keep = 2\nbad = 1.5\n"), "");
+  EXPECT_NE(refusal_of("keep = 3\nbad =\n"), "");
+  EXPECT_FALSE(config_store_load_file("/nonexistent/platform.toml"));
+  EXPECT_EQ(integer_at("keep"), 1);
+  EXPECT_EQ(integer_at("bad"), std::nullopt);
+  u32 same_node = 0;
+  EXPECT_EQ(config_node_find(0, "list", &same_node), 0);
+  EXPECT_EQ(same_node, node);
+  EXPECT_EQ(children_of("list"), (std::vector<std::string>{"b", "a"}));
+}
+
+TEST_F(ConfigStore, ASuccessfulLoadClearsTheError) {
+  EXPECT_NE(refusal_of("a =\n"), "");
+  EXPECT_TRUE(load("a = 1\n"));
+  EXPECT_STREQ(config_store_error(), "");
+}
+
+TEST_F(ConfigStore, AMissingFileIsRefused) {
+  EXPECT_FALSE(config_store_load_file("/nonexistent/platform.toml"));
+  EXPECT_STREQ(config_store_error(), "/nonexistent/platform.toml: No such file or directory");
+}
+
+TEST_F(ConfigStore, ADirectoryIsRefused) {
+  const temporary_directory_t directory;
+  const std::string path = directory.path("");
+  EXPECT_FALSE(config_store_load_file(path.c_str()));
+  EXPECT_EQ(config_store_error(), path + ": Is a directory");
+}
+
+TEST_F(ConfigStore, AMalformedFileIsCalledByItsName) {
+  const temporary_directory_t directory;
+  const std::string file = directory.write("box.toml", "[edid]\nweek = 1.5\n");
+  EXPECT_FALSE(config_store_load_file(file.c_str()));
+  EXPECT_EQ(config_store_error(), file + ":2:8: edid.week: a floating-point number" + only_these);
+}
+
+TEST_F(ConfigStore, ADocumentOfMoreThanOneMebibyteIsRefused) {
+  const std::string comments = repeated("# " + std::string(61, '-') + "\n", 16384);
+  ASSERT_EQ(comments.size(), 1024U * 1024U);
+  EXPECT_TRUE(load(comments)) << config_store_error();
+  EXPECT_EQ(refusal_of(comments + "\n"), "test.toml: larger than 1 MiB");
+}
+
+TEST_F(ConfigStore, AFileWithoutEndIsRefused) {
+  EXPECT_FALSE(config_store_load_file("/dev/zero"));
+  EXPECT_STREQ(config_store_error(), "/dev/zero: larger than 1 MiB");
+}
+
+TEST_F(ConfigStore, MissingArgumentsAreRefused) {
+  EXPECT_FALSE(config_store_load_file(nullptr));
+  EXPECT_STREQ(config_store_error(), "no file name given");
+  EXPECT_FALSE(config_store_load_text(nullptr, 0, document_name));
+  EXPECT_STREQ(config_store_error(), "no text or no name given");
+  EXPECT_FALSE(config_store_load_text("", 0, nullptr));
+  EXPECT_STREQ(config_store_error(), "no text or no name given");
+}
+
+}  // namespace
+}  // namespace host_test

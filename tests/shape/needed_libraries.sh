@@ -1,0 +1,20 @@
+#!/bin/bash
+# The library has a SONAME and needs the C library only: no C++ run-time library, no libgcc_s.
+# Usage: needed_libraries.sh LIBRARY SONAME
+. "$(dirname "$0")/reporting.sh"
+library=$1
+soname=$2
+
+dynamic=$(readelf -dW "$library") || fail "readelf cannot read $library"
+actual_soname=$(echo "$dynamic" | sed -n 's/.*(SONAME).*\[\(.*\)\]/\1/p')
+[ "$actual_soname" = "$soname" ] || fail "the SONAME is '$actual_soname', not '$soname'"
+skip_with_sanitizers "the library needs the sanitizers' run-time libraries (its SONAME, $soname, is right)"
+
+needed=$(echo "$dynamic" | sed -n 's/.*(NEEDED).*\[\(.*\)\]/\1/p')
+[ "$needed" = libc.so.6 ] || fail "needed libraries are not just libc.so.6:
+$needed"
+
+loaded=$(ldd "$library" | awk '{print $1}' | grep -Ev '^(linux-vdso|linux-gate|.*/ld-linux.*)') || fail "ldd lists nothing"
+[ "$loaded" = libc.so.6 ] || fail "libraries loaded with it are not just libc.so.6:
+$loaded"
+echo "$soname needs $needed"

@@ -1,0 +1,23 @@
+#include "support/memory_image.h"
+
+namespace test_support {
+
+std::string image_of_entries(const ll_list_t &list, std::size_t payload_size) {
+  std::string image;
+  for (const ll_entry_t *entry = list.head; entry != nullptr; entry = entry->next) {
+    image += image_of(*entry);
+    image.append(static_cast<const char *>(entry->data), payload_size);
+  }
+  return image;
+}
+
+std::string image_of_all(const platform_values_t &values) {
+  std::string image = image_of(values) + image_of_entries(values.audio_list, sizeof(i32));
+  for (const ll_list_t *list : {&values.video_50_priority, &values.video_50_additional, &values.video_60_priority,
+                                &values.video_60_additional}) {
+    image += image_of_entries(*list, sizeof(short_video_desc_t));
+  }
+  return image + image_of_entries(values.std_timings, sizeof(std_timing_t));
+}
+
+}  // namespace test_support
