@@ -74,6 +74,22 @@ TEST(LongReport, PrintsTheHeightOfStandardTimingsByTheirAspectRatio) {
                  "\t1280xp60\n"));
 }
 
+TEST(LongReport, PrintsImageSizesInWholeInchesToo) {
+  scoped_edid_t edid;
+  edid->valid = 1;
+  detailed_timing_t timing = test_support::timing_of_vic(16);
+  timing.h_image_size = 254;
+  timing.v_image_size = 253;
+  append(edid->dtd_list, timing);
+  timing.h_image_size = 4095;
+  timing.v_image_size = 26;
+  append(edid->dtd_list, timing);
+  const std::string report = report_of(edid.get(), 0);
+  EXPECT_EQ(test_support::count_of(report, "\tH image size:    254 mm (10 in)\n\tV image size:    253 mm (9 in)\n"), 1);
+  EXPECT_EQ(test_support::count_of(report, "\tH image size:    4095 mm (161 in)\n\tV image size:    26 mm (1 in)\n"),
+            1);
+}
+
 TEST(LongReport, PrintsThe3dSectionOnlyWithMandatory3d) {
   reported_record_t record;
   record->hdmi_3d_present = 0;
