@@ -31,8 +31,8 @@ u32 _calculate_str_checksum(const char *name) {
 
 namespace {
 
-// The checks that both additions share; only their words for a type mismatch differ.
-bool accepts(const site_t &site, const ll_list_t *list, const ll_entry_t *new_entry) {
+// What every operation on entries asks of its list.
+bool is_sound(const site_t &site, const ll_list_t *list) {
   if (list == nullptr) {
     LOG_ERROR_AS(site, "\"list\" parameter is NULL. list:%p", address(list));
     return false;
@@ -41,6 +41,12 @@ bool accepts(const site_t &site, const ll_list_t *list, const ll_entry_t *new_en
     LOG_BUG_AS(site, "List failed integrity test.%s", "");
     return false;
   }
+  return true;
+}
+
+// The checks that both additions share; only their words for a type mismatch differ.
+bool accepts(const site_t &site, const ll_list_t *list, const ll_entry_t *new_entry) {
+  if (!is_sound(HERE_AS(site), list)) return false;
   if (new_entry == nullptr) {
     LOG_ERROR_AS(site, "\"new_entry\" parameter is NULL. new_entry:%p", address(new_entry));
     return false;
@@ -60,6 +66,7 @@ using edid_composer::_calculate_str_checksum;
 using edid_composer::_get_magic_number;
 using edid_composer::accepts;
 using edid_composer::address;
+using edid_composer::is_sound;
 using edid_composer::report_range;
 
 bool ll_init(ll_list_t *list, const char *type) {
@@ -223,14 +230,7 @@ bool ll_delete_entry(ll_entry_t *delete_entry) {
 }
 
 bool ll_delete_entry_at(ll_list_t *list, u32 index) {
-  if (list == nullptr) {
-    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
-    return false;
-  }
-  if (!ll_verify_integrity(list)) {
-    LOG_BUG("List failed integrity test.%s", "");
-    return false;
-  }
+  if (!is_sound(HERE, list)) return false;
   if (index >= list->size) {
     report_range(HERE, static_cast<i32>(index), list->size);
     return false;
@@ -291,14 +291,7 @@ bool ll_entry_at(const ll_list_t *list, i32 index, void **entry_data) {
     return false;
   }
   *entry_data = nullptr;
-  if (list == nullptr) {
-    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
-    return false;
-  }
-  if (!ll_verify_integrity(list)) {
-    LOG_BUG("List failed integrity test.%s", "");
-    return false;
-  }
+  if (!is_sound(HERE, list)) return false;
   if (index < 0 || index >= static_cast<i32>(list->size)) {
     report_range(HERE, index, list->size);
     return false;

@@ -6,6 +6,24 @@
 namespace edid_composer {
 namespace {
 
+/// What both searches for the VIC of a sink's timing begin with.
+bool begin_search(const site_t &site, const edid_t *edid, const void *timing, u32 *vic) {
+  if (vic == nullptr) {
+    LOG_ERROR_AS(site, "\"vic\" parameter is NULL. vic:%p", address(vic));
+    return false;
+  }
+  *vic = 0;
+  if (edid == nullptr) {
+    LOG_ERROR_AS(site, "\"edid\" parameter is NULL. edid:%p", address(edid));
+    return false;
+  }
+  if (timing == nullptr) {
+    LOG_ERROR_AS(site, "\"timing\" parameter is NULL. timing:%p", address(timing));
+    return false;
+  }
+  return true;
+}
+
 /// An aspect-ratio code's two numbers: a size has it when width x denominator / numerator is the height.
 struct aspect_ratio_t {
   u32 numerator;
@@ -150,19 +168,7 @@ u8 convert_vic_to_dtd(u32 vic, detailed_timing_t *timing) {
 }
 
 u8 convert_dtd_to_vic(const edid_t *edid, const detailed_timing_t *timing, u32 *vic) {
-  if (vic == nullptr) {
-    LOG_ERROR("\"vic\" parameter is NULL. vic:%p", address(vic));
-    return 0;
-  }
-  *vic = 0;
-  if (edid == nullptr) {
-    LOG_ERROR("\"edid\" parameter is NULL. edid:%p", address(edid));
-    return 0;
-  }
-  if (timing == nullptr) {
-    LOG_ERROR("\"timing\" parameter is NULL. timing:%p", address(timing));
-    return 0;
-  }
+  if (!begin_search(HERE, edid, timing, vic)) return 0;
   for (u32 index = 0; index < g_vic_dtd_size; ++index) {
     u32 row_ratio = 0;
     u32 timing_ratio = 0;
@@ -197,19 +203,7 @@ u8 mode_to_vic(const video_mode_t *mode, u32 *vic) {
 }
 
 u8 convert_std_to_vic(const edid_t *edid, const std_timing_t *timing, u32 *vic) {
-  if (vic == nullptr) {
-    LOG_ERROR("\"vic\" parameter is NULL. vic:%p", address(vic));
-    return 0;
-  }
-  *vic = 0;
-  if (edid == nullptr) {
-    LOG_ERROR("\"edid\" parameter is NULL. edid:%p", address(edid));
-    return 0;
-  }
-  if (timing == nullptr) {
-    LOG_ERROR("\"timing\" parameter is NULL. timing:%p", address(timing));
-    return 0;
-  }
+  if (!begin_search(HERE, edid, timing, vic)) return 0;
   video_mode_t mode{};
   if (standard_mode(HERE, *timing, &mode)) {
     if (mode_to_vic(&mode, vic) == 1) return 1;
