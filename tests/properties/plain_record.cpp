@@ -1,6 +1,5 @@
 #include "plain_record.h"
 
-#include "support/memory_image.h"
 #include "support/records.h"
 
 namespace properties {
@@ -17,14 +16,6 @@ void add_entries(codec_test::fields_t &fields, const std::string &name, const st
   for (std::size_t i = 0; i < elements.size(); ++i) {
     fields.merge(codec_test::prefixed(name + "[" + std::to_string(i) + "].", codec_test::fields_of(elements[i])));
   }
-}
-
-template <typename element_t>
-std::string image_of_elements(const std::vector<element_t> &elements) {
-  std::string image = "|";
-  for (const element_t &element : elements)
-    image += test_support::image_of(element);
-  return image;
 }
 
 }  // namespace
@@ -50,11 +41,6 @@ codec_test::fields_t fields_of(const plain_record_t &record) {
   add_entries(fields, "video_list", record.video);
   add_entries(fields, "audio_list", record.audio);
   return fields;
-}
-
-std::string image_of(const plain_record_t &record) {
-  return test_support::image_of(record.scalars) + image_of_elements(record.std_timings) +
-         image_of_elements(record.timings) + image_of_elements(record.video) + image_of_elements(record.audio);
 }
 
 }  // namespace properties

@@ -24,9 +24,6 @@ void write_to(edid_t *edid, const plain_record_t &record);
 /// By name, as codec_test::fields_of() gives them.
 codec_test::fields_t fields_of(const plain_record_t &record);
 
-/// All bytes, to see whether anything changed.
-std::string image_of(const plain_record_t &record);
-
 /// A record that the encoder accepts: two detailed timings, every field within the range that its documentation gives.
 plain_record_t random_record(random_source_t &random);
 

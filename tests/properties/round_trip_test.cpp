@@ -48,9 +48,13 @@ codec_test::fields_t decoded(const bytes_t &bytes, bool with_extension) {
 plain_record_t expected_of(const encoding_t &encoding, std::set<std::string> *applied) {
   plain_record_t expected = encoding.record;
   for (const exception_t &exception : exceptions()) {
-    const std::string before = image_of(expected);
+    if (applied->count(exception.name) != 0) {
+      exception.apply(encoding, expected);
+      continue;
+    }
+    const codec_test::fields_t before = fields_of(expected);
     exception.apply(encoding, expected);
-    if (image_of(expected) != before) applied->insert(exception.name);
+    if (fields_of(expected) != before) applied->insert(exception.name);
   }
   return expected;
 }

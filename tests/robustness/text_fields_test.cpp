@@ -1,6 +1,7 @@
 // Texts of platform values that fill their fields to the last byte, so that no NUL ends them.
 #include <gtest/gtest.h>
 
+#include <cstddef>
 #include <cstring>
 #include <string>
 
@@ -57,6 +58,11 @@ TEST_F(FullTextFields, AreCopiedIntoTheRecordAndNotBehindItsFields) {
 
 TEST_F(FullTextFields, AreTracedToTheirEnd) {
   test_support::scoped_edid_t edid;
+  // No byte behind the two fields ends a text by chance: neither the padding nor the next member.
+  constexpr std::size_t behind_manufacturer = offsetof(edid_t, manufacturer) + sizeof edid->manufacturer;
+  std::memset(reinterpret_cast<char *>(edid.get()) + behind_manufacturer, 'X',
+              offsetof(edid_t, product_code) - behind_manufacturer);
+  edid->min_v_rate = 'X';
   const std::string output = test_support::traced_output_of([&] { populate(edid); });
   const std::string expected = test_support::trace_line("_populate_new_edid", "\tManufacturer ID = ABCD") +
                                test_support::trace_line("_populate_new_edid", "\tMonitor Name    = Name of 14 byt");

@@ -19,7 +19,7 @@ std::string image_of(const object_t &object) {
 /// The bytes of a list's entries and their payloads, which are @p payload_size bytes each.
 std::string image_of_entries(const ll_list_t &list, std::size_t payload_size);
 
-/// The bytes of the record, of all entries of its lists and of their payloads.
+/// The bytes of the record, of all entries of its lists and of their payloads without padding.
 std::string image_of_all(const platform_values_t &values);
 
 }  // namespace test_support
