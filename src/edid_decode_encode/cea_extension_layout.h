@@ -130,8 +130,8 @@ inline constexpr u32 most_vics = 7;
 /// Only the first 16 short video descriptors can be given 3D structures.
 inline constexpr i32 most_3d_modes = 16;
 
-/// 3D_Structure (appendix H): its code in a 2D_VIC_order entry, its bit in the record's mask, its name in traces. In the
-/// order in which a mode's structures are written.
+/// 3D_Structure (appendix H): its code in a 2D_VIC_order entry, its bit in the record's mask, its name in traces. In
+/// the order in which a mode's structures are written.
 struct structure_3d_t {
   u32 code;
   u32 stereo;

@@ -5,7 +5,8 @@
 
 namespace edid_composer {
 
-/// Writes the 18 bytes of a detailed timing (EDID 1.3, section 3.10.2); answers 1, or 0 when the timing can't be encoded.
+/// Writes the 18 bytes of a detailed timing (EDID 1.3, section 3.10.2); answers 1, or 0 when the timing can't be
+/// encoded.
 u8 _encode_edid_dtd(u8 *dtd_block, const detailed_timing_t *timing);
 
 /// Writes the 3 bytes of a short audio descriptor (CEA-861, section 7.5.2); answers 1, or 0 when the type has none.
