@@ -7,7 +7,7 @@ set -eu
 cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 
-echo 'Building everything twice (optimised, with sanitizers) and running all tests; takes 5 to 12 minutes.'
+echo 'Building everything twice (optimised, with sanitizers) and running all tests; takes 5 to 15 minutes.'
 install_packages build-essential cmake ninja-build git libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev \
   edid-decode python3 doxygen groff-base man-db pkg-config
 
