@@ -1,8 +1,5 @@
 #include "edid_decode_encode/base_block_encoder.h"
 
-#include <algorithm>
-#include <cstring>
-
 #include "edid_decode_encode/base_block_layout.h"
 #include "edid_decode_encode/checksum.h"
 #include "edid_decode_encode/descriptor_encoder.h"
