@@ -19,7 +19,7 @@ enum pass_through_t : i32 {
 
 void trace_audio(const site_t &site, const char *label, const short_audio_desc_t &audio) {
   if (!debug_enabled()) return;
-  LOG_TRACE_AS(site, "%s", label);
+  log_trace(HERE_AS(site), "%s", label);
   print_audio_structure(&audio);
 }
 

@@ -138,7 +138,7 @@ bool run_stages(const site_t &site, const request_t &request, const platform_val
 /// Decodes the result again: what the decoders trace of it is the point.
 void trace_result(const site_t &site, const u8 *new_edid_block) {
   if (!debug_enabled()) return;
-  LOG_TRACE_AS(site, "New EDID...");
+  log_trace(HERE_AS(site), "New EDID...");
   _dump_raw_edid_block(new_edid_block, 2);
   edid_t edid{};
   if (edid_prepare(&edid) != 1) {

@@ -123,8 +123,8 @@ void print_platform_node(u32 node, const char *label) {
   if (!debug_enabled()) return;
   char name[edid_composer::node_name_size] = "";
   if (config_node_get_name(node, name, sizeof name) == 0) {
-    LOG_TRACE("%s:Name of node is:%s", label, name);
+    edid_composer::log_trace(HERE, "%s:Name of node is:%s", label, name);
   } else {
-    LOG_TRACE("%s:Failed trying to get name", label);
+    edid_composer::log_trace(HERE, "%s:Failed trying to get name", label);
   }
 }

@@ -81,11 +81,11 @@ bool prioritize(const site_t &site, i32 rate, const ll_list_t *list, const ll_li
     return false;
   }
   if (debug_enabled()) {
-    LOG_TRACE_AS(site, "\tPrioritization List:");
+    log_trace(HERE_AS(site), "\tPrioritization List:");
     for (const auto &video : walk<const short_video_desc_t>(LIST_AS(site, list)))
       print_mode(video, not_native_column);
-    LOG_TRACE_AS(site, "Prioritize the list of valid modes and remove duplicates. Modes:%d MasterList:%d",
-                 ll_size(candidates), ll_size(list));
+    log_trace(HERE_AS(site), "Prioritize the list of valid modes and remove duplicates. Modes:%d MasterList:%d",
+              ll_size(candidates), ll_size(list));
   }
   for (const auto &wanted : walk<const short_video_desc_t>(LIST_AS(site, list))) {
     if (!add_if_candidate(HERE_AS(site), wanted, candidates, ret_modes)) return false;
@@ -140,7 +140,7 @@ bool select_modes(const site_t &site, const edid_t *edid, const compose_cfg_t *c
     LOG_TRACE_AS(site, "\tIgnoring hdmi_current_mode.");
   }
   if (debug_enabled()) {
-    LOG_TRACE_AS(site, "\tNew EDID List of VICs:");
+    log_trace(HERE_AS(site), "\tNew EDID List of VICs:");
     for (const auto &video : walk<const short_video_desc_t>(LIST_AS(site, ret_modes))) {
       print_mode(video, not_native_column);
     }
@@ -203,7 +203,7 @@ u32 _combine_lists(ll_list_t *vic_list, const ll_list_t *extra_list) {
               video.stereo);
   }
   if (debug_enabled()) {
-    LOG_TRACE("\tList after combining:");
+    log_trace(HERE, "\tList after combining:");
     for (const auto &video : walk<const short_video_desc_t>(LIST(vic_list)))
       print_mode(video, "");
   }

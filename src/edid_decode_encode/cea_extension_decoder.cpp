@@ -120,8 +120,6 @@ bool decode_data_block(const site_t &site, const byte_view_t &block, u32 tag, u3
     case data_block::extended:
       decode_extended_block(site, payload, length, edid);
       break;
-    default:
-      break;
   }
   return true;
 }

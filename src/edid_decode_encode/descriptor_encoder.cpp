@@ -13,7 +13,7 @@ constexpr u32 lowest_pixel_clock = 25175000;
 
 constexpr u32 extension_code(u32 type) {
   const u32 code = type - short_audio::extended_type_base;
-  return code >= 1 && code <= short_audio::last_extension ? code : 0;
+  return code <= short_audio::last_extension ? code : 0;
 }
 
 }  // namespace

@@ -78,27 +78,28 @@ bool timing_aspect(const site_t &site, const edid_t &edid, const detailed_timing
   return false;
 }
 
+/// For a caller that traces.
 void trace_unmatched(const site_t &site, const detailed_timing_t &timing) {
   constexpr auto inches = [](u32 millimetres) { return millimetres * 5 / 127; };
-  LOG_TRACE_AS(site, "Unable to match Detailed Timing Description.");
-  LOG_TRACE_AS(site, "\tPixel Clock:     %d", timing.pixel_clock);
-  LOG_TRACE_AS(site, "\tRefresh Rate:    %d", refresh_rate(timing));
-  LOG_TRACE_AS(site, "\tH Active:        %d", timing.h_active);
-  LOG_TRACE_AS(site, "\tH Blanking:      %d", timing.h_blanking);
-  LOG_TRACE_AS(site, "\tV Active:        %d", timing.v_active);
-  LOG_TRACE_AS(site, "\tV Blanking:      %d", timing.v_blanking);
-  LOG_TRACE_AS(site, "\tH sync offset:   %d", timing.h_sync_offset);
-  LOG_TRACE_AS(site, "\tH sync width:    %d", timing.h_sync_width);
-  LOG_TRACE_AS(site, "\tV sync offset:   %d", timing.v_sync_offset);
-  LOG_TRACE_AS(site, "\tV sync width:    %d", timing.v_sync_width);
-  LOG_TRACE_AS(site, "\tH image size:    %d mm (%d in)", timing.h_image_size, inches(timing.h_image_size));
-  LOG_TRACE_AS(site, "\tV image size:    %d mm (%d in)", timing.v_image_size, inches(timing.v_image_size));
-  LOG_TRACE_AS(site, "\tH Border:        %d", timing.h_border);
-  LOG_TRACE_AS(site, "\tV Border:        %d", timing.v_border);
-  LOG_TRACE_AS(site, "\tScan:            %s", timing.progressive != 0 ? "Progressive" : "Interlaced");
-  LOG_TRACE_AS(site, "\tStereo:          %s", timing.stereo != 0 ? "Yes" : "No");
-  LOG_TRACE_AS(site, "\tH sync:          %s", timing.h_sync_positive != 0 ? "Positive" : "Negative");
-  LOG_TRACE_AS(site, "\tV sync:          %s", timing.v_sync_positive != 0 ? "Positive" : "Negative");
+  log_trace(HERE_AS(site), "Unable to match Detailed Timing Description.");
+  log_trace(HERE_AS(site), "\tPixel Clock:     %d", timing.pixel_clock);
+  log_trace(HERE_AS(site), "\tRefresh Rate:    %d", refresh_rate(timing));
+  log_trace(HERE_AS(site), "\tH Active:        %d", timing.h_active);
+  log_trace(HERE_AS(site), "\tH Blanking:      %d", timing.h_blanking);
+  log_trace(HERE_AS(site), "\tV Active:        %d", timing.v_active);
+  log_trace(HERE_AS(site), "\tV Blanking:      %d", timing.v_blanking);
+  log_trace(HERE_AS(site), "\tH sync offset:   %d", timing.h_sync_offset);
+  log_trace(HERE_AS(site), "\tH sync width:    %d", timing.h_sync_width);
+  log_trace(HERE_AS(site), "\tV sync offset:   %d", timing.v_sync_offset);
+  log_trace(HERE_AS(site), "\tV sync width:    %d", timing.v_sync_width);
+  log_trace(HERE_AS(site), "\tH image size:    %d mm (%d in)", timing.h_image_size, inches(timing.h_image_size));
+  log_trace(HERE_AS(site), "\tV image size:    %d mm (%d in)", timing.v_image_size, inches(timing.v_image_size));
+  log_trace(HERE_AS(site), "\tH Border:        %d", timing.h_border);
+  log_trace(HERE_AS(site), "\tV Border:        %d", timing.v_border);
+  log_trace(HERE_AS(site), "\tScan:            %s", timing.progressive != 0 ? "Progressive" : "Interlaced");
+  log_trace(HERE_AS(site), "\tStereo:          %s", timing.stereo != 0 ? "Yes" : "No");
+  log_trace(HERE_AS(site), "\tH sync:          %s", timing.h_sync_positive != 0 ? "Positive" : "Negative");
+  log_trace(HERE_AS(site), "\tV sync:          %s", timing.v_sync_positive != 0 ? "Positive" : "Negative");
 }
 
 bool shows(const detailed_timing_t &row, const video_mode_t &mode) {

@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <ostream>
 #include <string>
 #include <vector>
 
@@ -243,6 +244,10 @@ struct video_list_t {
   const char *key;
   const char *reading;
 };
+
+std::ostream &operator<<(std::ostream &out, const video_list_t &list) {
+  return out << list.key;
+}
 
 class VideoListReader : public testing::TestWithParam<video_list_t> {
  protected:

@@ -109,6 +109,14 @@ TEST(PlatformValues, DestroyingTwiceFailsAtTheFirstList) {
                 bug_line("utility", "platform_values_destroy", "Failed removing platform audio_list"));
 }
 
+TEST(PlatformValues, AbsentRecordIsRefused) {
+  const std::string missing = "\"values\" parameter is NULL. values:(nil)";
+  EXPECT_EQ(output_of([] { EXPECT_FALSE(platform_values_init(nullptr)); }),
+            error_line("utility", "platform_values_init", missing));
+  EXPECT_EQ(output_of([] { EXPECT_FALSE(platform_values_destroy(nullptr)); }),
+            error_line("utility", "platform_values_destroy", missing));
+}
+
 TEST(PlatformValues, CopyIsNotInitialised) {
   test_support::scoped_values_t values;
   const platform_values_t copy = *values.get();

@@ -38,7 +38,7 @@ bytes_t sample_sink_t::build() const {
   if (end != end_t::behind_video) extension.block(test_support::audio_block(audio));
   if (end == end_t::none) {
     extension.block(test_support::data_block(4, {0x01, 0, 0}))
-        .block(test_support::hdmi_block({0x10, 0x00, 0xB8, 45, 0x80, 11, 6}));
+        .block(test_support::hdmi_block(hdmi));
   } else {
     extension.block(overrunning_block);
   }

@@ -17,6 +17,8 @@ struct sample_sink_t {
   std::vector<u32> extension_timings;  ///< VICs of the extension's detailed timings; 0 is one that is left out.
   std::vector<u8> video;               ///< Short video descriptors.
   test_support::bytes_t audio;         ///< Short audio descriptors.
+  /// The HDMI vendor-specific data block, from the physical address on.
+  test_support::bytes_t hdmi{0x10, 0x00, 0xB8, 45, 0x80, 11, 6};
 
   /// Where decoding stops with a failure of the block; what comes behind is not decoded.
   enum class end_t { none, behind_std_timings, behind_base_timings, behind_video, behind_audio };

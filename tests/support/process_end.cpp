@@ -6,12 +6,24 @@
 #include <unistd.h>
 
 #include <cerrno>
+#include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <system_error>
 
+#ifdef EDID_COMPOSER_COVERAGE
+extern "C" void __gcov_dump();
+#endif
+
 namespace test_support {
 namespace {
+
+// Coverage counters are written at the end of a process, which an abort is not.
+void count_coverage_until_the_abort() {
+#ifdef EDID_COMPOSER_COVERAGE
+  std::signal(SIGABRT, [](int) { __gcov_dump(); });
+#endif
+}
 
 [[noreturn]] void fail(const char *what) {
   throw std::system_error(errno, std::generic_category(), what);
@@ -47,6 +59,7 @@ class memory_file_t {
   dup2(err.descriptor(), STDERR_FILENO);
   static char buffer[65536];
   std::setvbuf(stdout, buffer, _IOFBF, sizeof(buffer));
+  count_coverage_until_the_abort();
   action();
   std::_Exit(EXIT_SUCCESS);
 }
