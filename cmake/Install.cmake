@@ -1,5 +1,6 @@
-# What `cmake --install` puts where, by component: runtime (the library), development (header, static variant, CMake package,
-# pkg-config file), tools (the command-line program), store (the configuration store, run time and development).
+# What `cmake --install` puts where, by component: runtime (the library), development (header, static variant, CMake
+# package, pkg-config file, manual page), tools (the command-line program, its completion and manual page), store (the
+# configuration store, run time and development).
 include(GNUInstallDirs)
 include(CMakePackageConfigHelpers)
 
@@ -61,6 +62,17 @@ if(EDID_COMPOSER_HOST)
     COMPONENT store)
   install_pkgconfig(edid_config_store store)
   install_manual(edid-platform.toml.5 5 store)
+
+  # The program finds the libraries from its own place, so that any prefix will do. Packages go without.
+  file(RELATIVE_PATH library_place /prefix/${CMAKE_INSTALL_BINDIR} /prefix/${CMAKE_INSTALL_LIBDIR})
+  set_target_properties(edid_composer_cli PROPERTIES INSTALL_RPATH "$ORIGIN/${library_place}")
   install(TARGETS edid_composer_cli RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR} COMPONENT tools)
   install_manual(edid-composer.1 1 tools)
+  if(EXISTS ${PROJECT_SOURCE_DIR}/completions/edid-composer.bash)
+    install(
+      FILES completions/edid-composer.bash
+      DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions
+      RENAME edid-composer
+      COMPONENT tools)
+  endif()
 endif()
