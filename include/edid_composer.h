@@ -513,6 +513,193 @@ EDID_COMPOSER_API bool compose_edid_internal(const u8 *edid_block, u32 edid_byte
                                              const platform_values_t *platform_values);
 /** @} */
 
+/** @defgroup explaining Why an EDID offers what it offers
+ *
+ * A composition can be observed: @ref compose_edid_observed tells, for everything that could have been in the new EDID,
+ * whether it is there, and why. Each candidate gets exactly one record: each VIC that the sink, a priority list or an
+ * addition list names, each 4Kx2K mode, each audio format of the platform and of the sink; and so does each of the
+ * derived values that @ref compose_subject lists. A record tells what became of its candidate in the bytes that were
+ * written, also where the encoder had to leave out what the stages before it had chosen. When
+ * @ref COMPOSE_SUBJECT_EXTENSION_ROOM says that a data block is too long, sources read what stands behind it otherwise
+ * than it is meant.
+ * @{ */
+
+/** What a decision is about; @ref compose_decision_t::subject. It says what @ref compose_decision_t::code is. */
+enum compose_subject {
+  COMPOSE_SUBJECT_VIDEO_MODE = 1,       /**< A video mode; code: its VIC (CEA-861, section 4). */
+  COMPOSE_SUBJECT_SINK_TIMING = 2,      /**< A detailed or standard timing of the sink that has no VIC; code: 0. */
+  COMPOSE_SUBJECT_4K_MODE = 3,          /**< A 4Kx2K mode; code: its HDMI_VIC (HDMI 1.4a, section 8.2.3.1). */
+  COMPOSE_SUBJECT_AUDIO_FORMAT = 4,     /**< An audio format; code: @ref short_audio_desc_t::type, 0 for none. */
+  COMPOSE_SUBJECT_NATIVE_RATE = 5,      /**< The refresh family, whose lists are used; code: 50 or 60. */
+  COMPOSE_SUBJECT_GEOMETRY_LIMIT = 6,   /**< The height that modes may have; code: lines; 0 without a limit, or without
+                                             a short video descriptor. */
+  COMPOSE_SUBJECT_CURRENT_MODE = 7,     /**< The mode that the platform puts out now; code: its VIC, 0 when unused. */
+  COMPOSE_SUBJECT_PHYSICAL_ADDRESS = 8, /**< The CEC physical address; code: 0x1230 for 1.2.3.0. */
+  COMPOSE_SUBJECT_DEEP_COLOR = 9,       /**< A colour depth; code: bits per pixel, 30, 36 or 48. */
+  COMPOSE_SUBJECT_TMDS_CLOCK = 10,      /**< The maximum TMDS clock; code: MHz, 0 when it is not declared. */
+  COMPOSE_SUBJECT_LATENCY = 11,       /**< A latency; code: 0 video, 1 audio, 2 interlaced video, 3 interlaced audio. */
+  COMPOSE_SUBJECT_3D = 12,            /**< Whether 3D is offered; code: 1 or 0. */
+  COMPOSE_SUBJECT_PADDING = 13,       /**< Modes added to reach the fewest an EDID has; code: how many. */
+  COMPOSE_SUBJECT_EXTENSION_ROOM = 14 /**< Room in the CEA extension; code: bytes needed before the checksum. */
+};
+
+/** What was decided; @ref compose_decision_t::verdict. */
+enum compose_verdict {
+  COMPOSE_VERDICT_OFFERED =
+      1, /**< In the new EDID, as named; of modes, 3D structures aside. A derived value: as asked for. */
+  COMPOSE_VERDICT_LEFT_OUT = 2, /**< Not in the new EDID. A derived value: not declared, or not in force. */
+  COMPOSE_VERDICT_CHANGED = 3   /**< In the new EDID, but not as it was named or asked for. */
+};
+
+/**
+ * Why; @ref compose_decision_t::reason. What stands in braces are the numbers behind it, as they lie in
+ * @ref compose_decision_t::value. @ref compose_reason_string has the reason in words.
+ */
+enum compose_reason {
+  COMPOSE_REASON_SINK_HAS_IT = 1,          /**< The priority list names it and the sink has it. */
+  COMPOSE_REASON_PLATFORM_ADDS_IT = 2,     /**< The priority list names it and the addition list has it. */
+  COMPOSE_REASON_IS_CURRENT_MODE = 3,      /**< The platform puts it out now. */
+  COMPOSE_REASON_PADS_THE_LIST = 4,        /**< Stands in for modes that are missing. */
+  COMPOSE_REASON_NOT_IN_PRIORITY_LIST = 5, /**< The sink or the addition list has it, the priority list doesn't. */
+  COMPOSE_REASON_NOT_AVAILABLE = 6,        /**< Neither the sink nor the addition list has it. */
+  COMPOSE_REASON_OTHER_REFRESH_FAMILY = 7, /**< Only lists of the other family name it {family in use}. */
+  COMPOSE_REASON_TALLER_THAN_SINK = 8,     /**< Above the geometry limit {lines of the mode, limit}. */
+  COMPOSE_REASON_NO_ROOM =
+      9, /**< Chosen, but the extension holds no more of its kind {descriptors of its kind there}. */
+  COMPOSE_REASON_TIMING_WITHOUT_VIC =
+      10, /**< No VIC has it {active pixels, active lines of a frame or 0, Hz, 1 interlaced}. */
+  COMPOSE_REASON_PLATFORM_FORMAT = 11,     /**< The platform has it {channels}. */
+  COMPOSE_REASON_SINK_FORMAT = 12,         /**< Passed through from the sink {channels}. */
+  COMPOSE_REASON_NARROWED_TO_SINK = 13,    /**< Narrowed to what the sink takes {channels asked for, channels left,
+                                                sample rates asked for, sample rates left}. */
+  COMPOSE_REASON_BASIC_AUDIO = 14,         /**< Basic audio, added as no format has it {channels}. */
+  COMPOSE_REASON_NOT_AN_AUDIO_FORMAT = 15, /**< The platform's entry can't be decoded {its value}. */
+  COMPOSE_REASON_SINK_FORMATS_ONLY = 16,   /**< Audio pass-through takes the sink's formats only {pass-through}. */
+  COMPOSE_REASON_PLATFORM_FORMATS_ONLY =
+      17,                          /**< Audio pass-through takes the platform's formats only {pass-through}. */
+  COMPOSE_REASON_NOT_IN_SINK = 18, /**< The sink has no format like it {channels}. */
+  COMPOSE_REASON_DUPLICATE =
+      19, /**< A format before it covers it {channels, place of that among the formats chosen so far}. */
+  COMPOSE_REASON_AUDIO_MASK = 20,       /**< The audio mask excludes its type {mask in force, bit of the type}. */
+  COMPOSE_REASON_TYPE_WITHOUT_BIT = 21, /**< No audio mask has a bit for its type {mask in force}. */
+  COMPOSE_REASON_RATE_OF_DETAILED_TIMING = 22, /**< The sink's first timing that tells {its position, Hz}. */
+  COMPOSE_REASON_RATE_OF_STANDARD_TIMING = 23, /**< The sink's first standard timing that tells {its position, Hz}. */
+  COMPOSE_REASON_RATE_OF_SHORT_VIDEO = 24,  /**< The sink's first short video descriptor that tells {position, Hz}. */
+  COMPOSE_REASON_RATE_OF_PLATFORM = 25,     /**< The platform's, as the sink tells none. */
+  COMPOSE_REASON_RATE_FORCED = 26,          /**< 60, as the platform's is neither 50 nor 60 {the platform's}. */
+  COMPOSE_REASON_GEOMETRY_OF_SINK = 27,     /**< That of the sink's tallest short video descriptor. */
+  COMPOSE_REASON_GEOMETRY_UNLIMITED = 28,   /**< The platform sets no limit. */
+  COMPOSE_REASON_CURRENT_MODE_FIRST = 29,   /**< Put first {width, height, Hz, interlaced}. */
+  COMPOSE_REASON_CURRENT_MODE_IGNORED = 30, /**< The platform doesn't ask for it {width, height, Hz, interlaced}. */
+  COMPOSE_REASON_CURRENT_MODE_IMPLAUSIBLE = 31, /**< Not a mode {width, height, Hz, interlaced}. */
+  COMPOSE_REASON_CURRENT_MODE_WITHOUT_VIC = 32, /**< No VIC has it {width, height, Hz, interlaced}. */
+  COMPOSE_REASON_ADDRESS_OF_ROOT = 33,          /**< The platform is the television {port}. */
+  COMPOSE_REASON_ADDRESS_BELOW_SINK = 34,       /**< The port in the sink's first free place {port, sink's address}. */
+  COMPOSE_REASON_ADDRESS_WITHOUT_SINK = 35,     /**< None: no HDMI sink {port}. */
+  COMPOSE_REASON_ADDRESS_OF_SINK_INVALID = 36,  /**< None: the sink's begins with 0 {port, sink's address}. */
+  COMPOSE_REASON_ADDRESS_WITHOUT_PLACE = 37,    /**< None: the sink's has no free place {port, sink's address}. */
+  COMPOSE_REASON_DEEP_COLOR_OF_PLATFORM = 38,   /**< As the platform says {1 or 0}. */
+  COMPOSE_REASON_DEEP_COLOR_REQUIRED = 39,      /**< HDMI requires 36 bit where 30 bit is offered. */
+  COMPOSE_REASON_DEEP_COLOR_NEVER = 40,         /**< Not offered by this library. */
+  COMPOSE_REASON_TMDS_OVERRIDE = 41,    /**< The platform's own, in steps of 5 MHz {MHz asked for, sink's MHz}. */
+  COMPOSE_REASON_TMDS_OF_MODES = 42,    /**< What the modes need {pixel clock in kHz, percent of it, sink's MHz}. */
+  COMPOSE_REASON_TMDS_OF_4K_MODES = 43, /**< What 4Kx2K modes need {pixel clock in kHz, percent, sink's MHz}. */
+  COMPOSE_REASON_TMDS_NOT_NEEDED = 44,  /**< The modes stay below 165 MHz {pixel clock in kHz, percent, sink's}. */
+  COMPOSE_REASON_TMDS_LARGEST = 45,     /**< Cut to what the field can hold {MHz wanted, MHz held}. */
+  COMPOSE_REASON_LATENCY_OF_BOTH =
+      46, /**< The platform's and the sink's in sum {own ms, sink's ms, ms declared: even, at most 500}. */
+  COMPOSE_REASON_LATENCY_NONE = 47, /**< Neither delays; offered as 0 ms where the other latencies need it to be. */
+  COMPOSE_REASON_LATENCY_TOO_LONG =
+      48,                         /**< One of both is longer than 500 ms: declared as not valid {own ms, sink's ms}. */
+  COMPOSE_REASON_3D_ALWAYS = 49,  /**< The caller asks for it {setting, sink's}. */
+  COMPOSE_REASON_3D_OF_SINK = 50, /**< The sink has it {setting, sink's}. */
+  COMPOSE_REASON_3D_NOT_IN_SINK = 51, /**< The sink doesn't have it {setting, sink's}. */
+  COMPOSE_REASON_3D_OFF = 52,         /**< The caller doesn't want it {setting, sink's}. */
+  COMPOSE_REASON_TOO_FEW_MODES = 53,  /**< VIC 1 was added {modes chosen, fewest}. */
+  COMPOSE_REASON_ENOUGH_MODES = 54,   /**< Nothing was added {modes chosen, fewest}. */
+  COMPOSE_REASON_ROOM_ENOUGH = 55,    /**< Every byte fits {bytes needed, bytes there, bytes of the longest data block
+                                           that can become too long, most}. */
+  COMPOSE_REASON_ROOM_EXCEEDED = 56,  /**< The rest is left out {as above}. */
+  COMPOSE_REASON_BLOCK_TOO_LONG = 57, /**< A data block is longer than its length field can tell, and read as shorter
+                                           {as above}. */
+  COMPOSE_REASON_NOT_ANNOUNCED = 58   /**< The base block doesn't announce the extension, as without a monitor name
+                                           {as above}. */
+};
+
+/** Who named a candidate; bits of @ref compose_decision_t::origins. */
+enum compose_origin {
+  COMPOSE_ORIGIN_DETAILED_TIMING = 0x0001,     /**< A detailed timing of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_STANDARD_TIMING = 0x0002,     /**< A standard timing of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_SHORT_VIDEO = 0x0004,         /**< A short video descriptor of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_SINK_4K = 0x0008,             /**< An HDMI_VIC of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_SINK_AUDIO = 0x0010,          /**< A short audio descriptor of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_PRIORITY_LIST = 0x0020,       /**< The priority list in use; place in priority_index. */
+  COMPOSE_ORIGIN_ADDITION_LIST = 0x0040,       /**< The addition list in use; place in addition_index. */
+  COMPOSE_ORIGIN_OTHER_PRIORITY_LIST = 0x0080, /**< The other family's; place in priority_index if alone. */
+  COMPOSE_ORIGIN_OTHER_ADDITION_LIST = 0x0100, /**< The other family's; place in addition_index if alone. */
+  COMPOSE_ORIGIN_PLATFORM_AUDIO = 0x0200,      /**< The platform's audio list; place in priority_index. */
+  COMPOSE_ORIGIN_CURRENT_MODE = 0x0400,        /**< The caller's current mode. */
+  COMPOSE_ORIGIN_LIBRARY = 0x0800              /**< The library itself: padding and basic audio. */
+};
+
+/** One decision of a composition. It holds no pointers: a copy of it keeps its meaning. */
+typedef struct compose_decision_t {
+  u32 size;    /**< Bytes of the record that the library fills. A later version may append members, never move one. */
+  u32 subject; /**< What it is about; @ref compose_subject. */
+  u32 code;    /**< Which one of them; see @ref compose_subject. */
+  u32 verdict; /**< What was decided; @ref compose_verdict. */
+  u32 reason;  /**< Why; @ref compose_reason. */
+  u32 origins; /**< Who named the candidate: mask of @ref compose_origin; 0 for derived values. */
+  i32 sink_index; /**< Place, from 0, of the first descriptor of the sink that names it, among those of the kind that
+                       the lowest bit of origins tells and that could be decoded; -1 when none does. */
+  i32 priority_index; /**< Place, from 0, among the entries of the list that names it as it was read, without those that
+                         were skipped; -1 when none does. */
+  i32 addition_index; /**< As above, for the addition list. */
+  i32 position;       /**< Place, from 0, among the new EDID's descriptors of its kind; -1 when it isn't there. */
+  i32 value[4];       /**< The numbers behind the reason; see @ref compose_reason. The others are 0. */
+} compose_decision_t;
+
+/**
+ * Hears of a decision.
+ *
+ * @param decision the record; it is gone when the call returns.
+ * @param context what @ref compose_edid_observed was given.
+ */
+typedef void (*compose_observer_t)(const compose_decision_t *decision, void *context);
+
+/**
+ * As @ref compose_edid_internal, and tells @p observer of every decision, once, after the new EDID was written and
+ * before the call returns: video modes, 4Kx2K modes, audio formats, derived values, in no order to rely on.
+ *
+ * What is written and printed is the same with an observer and without. An observed composition needs one more list
+ * entry for each decision. When one can't be had, that is reported, the composition goes on, and nothing is told.
+ *
+ * @param edid_block as for @ref compose_edid.
+ * @param edid_bytes as for @ref compose_edid.
+ * @param new_edid_block as for @ref compose_edid.
+ * @param new_edid_bytes as for @ref compose_edid.
+ * @param cfg as for @ref compose_edid.
+ * @param platform_values as for @ref compose_edid_internal.
+ * @param observer called on the calling thread. NULL: exactly @ref compose_edid_internal.
+ * @param context goes to @p observer as it is.
+ * @return as for @ref compose_edid_internal. On false nothing was told.
+ */
+EDID_COMPOSER_API bool compose_edid_observed(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block,
+                                             u32 new_edid_bytes, const compose_cfg_t *cfg,
+                                             const platform_values_t *platform_values, compose_observer_t observer,
+                                             void *context);
+
+/** @return the subject in words, such as "video mode"; "unknown" for any other number. Static. */
+EDID_COMPOSER_API const char *compose_subject_string(u32 subject);
+
+/** @return the verdict in words, such as "left out"; "unknown" for any other number. Static. */
+EDID_COMPOSER_API const char *compose_verdict_string(u32 verdict);
+
+/** @return the reason in words, such as "the priority list does not name it"; "unknown" for any other number. Static.
+ */
+EDID_COMPOSER_API const char *compose_reason_string(u32 reason);
+/** @} */
+
 /** @defgroup inspection Looking at an EDID
  * @{ */
 

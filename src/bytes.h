@@ -23,6 +23,12 @@ class byte_view_t {
     return contains(offset) ? byte_view_t(data_ + offset, size_ - offset) : byte_view_t(data_, 0);
   }
 
+  /// The first @p count bytes, as far as they are there: for a loop over all of them, which then needs no check of
+  /// each.
+  constexpr byte_view_t first(u32 count) const { return byte_view_t(data_, count < size_ ? count : size_); }
+  constexpr const u8 *begin() const { return data_; }
+  constexpr const u8 *end() const { return data_ + size_; }
+
   constexpr u32 little_endian_16(u32 offset) const { return u32{(*this)[offset]} | u32{(*this)[offset + 1]} << 8; }
   constexpr u32 little_endian_32(u32 offset) const {
     return little_endian_16(offset) | little_endian_16(offset + 2) << 16;

@@ -15,11 +15,19 @@ struct site_t {
   int line;
 };
 
-[[gnu::format(printf, 2, 3)]] void log_error(const site_t &site, const char *format, ...);
-[[gnu::format(printf, 2, 3)]] void log_warning(const site_t &site, const char *format, ...);
-[[gnu::format(printf, 2, 3)]] void log_bug(const site_t &site, const char *format, ...);
-/// Writes a debug trace whatever the switch says; LOG_TRACE asks first.
-[[gnu::format(printf, 2, 3)]] void log_trace(const site_t &site, const char *format, ...);
+// The writers of the lines take a site in pieces, which travel in registers, and are cold: code that has nothing to
+// report then builds no site, and its reports stand apart from it.
+
+[[gnu::cold, gnu::format(printf, 4, 5)]] void log_error(const char *module, const char *function, int line,
+                                                        const char *format, ...);
+[[gnu::cold, gnu::format(printf, 4, 5)]] void log_warning(const char *module, const char *function, int line,
+                                                          const char *format, ...);
+[[gnu::cold, gnu::format(printf, 4, 5)]] void log_bug(const char *module, const char *function, int line,
+                                                      const char *format, ...);
+/// Writes a debug trace, which doesn't name its module, whatever the switch says; LOG_TRACE asks first.
+[[gnu::cold, gnu::format(printf, 3, 4)]] void log_trace(const char *function, int line, const char *format, ...);
+/// The same for a block that has asked the switch for all of its traces.
+[[gnu::cold, gnu::format(printf, 2, 3)]] void log_trace(const site_t &site, const char *format, ...);
 
 /// For "%p", which takes pointers to void only.
 inline const void *address(const void *pointer) {
@@ -37,13 +45,16 @@ inline const char *true_or_false(bool value) {
 #define HERE (::edid_composer::site_t{EDID_COMPOSER_MODULE, static_cast<const char *>(__func__), __LINE__})
 /// This line, in the name of another site's function.
 #define HERE_AS(site) (::edid_composer::site_t{(site).module, (site).function, __LINE__})
+/// A site in pieces, as the writers take it.
+#define PIECES(site) (site).module, (site).function, (site).line
 
-#define LOG_ERROR(...) ::edid_composer::log_error(HERE, __VA_ARGS__)
-#define LOG_WARNING(...) ::edid_composer::log_warning(HERE, __VA_ARGS__)
-#define LOG_BUG(...) ::edid_composer::log_bug(HERE, __VA_ARGS__)
-#define LOG_TRACE(...) (debug_enabled() ? ::edid_composer::log_trace(HERE, __VA_ARGS__) : void())
+#define LOG_ERROR(...) ::edid_composer::log_error(PIECES(HERE), __VA_ARGS__)
+#define LOG_WARNING(...) ::edid_composer::log_warning(PIECES(HERE), __VA_ARGS__)
+#define LOG_BUG(...) ::edid_composer::log_bug(PIECES(HERE), __VA_ARGS__)
+#define LOG_TRACE(...) LOG_TRACE_AS(HERE, __VA_ARGS__)
 
-#define LOG_ERROR_AS(site, ...) ::edid_composer::log_error(HERE_AS(site), __VA_ARGS__)
-#define LOG_WARNING_AS(site, ...) ::edid_composer::log_warning(HERE_AS(site), __VA_ARGS__)
-#define LOG_BUG_AS(site, ...) ::edid_composer::log_bug(HERE_AS(site), __VA_ARGS__)
-#define LOG_TRACE_AS(site, ...) (debug_enabled() ? ::edid_composer::log_trace(HERE_AS(site), __VA_ARGS__) : void())
+#define LOG_ERROR_AS(site, ...) ::edid_composer::log_error(PIECES(HERE_AS(site)), __VA_ARGS__)
+#define LOG_WARNING_AS(site, ...) ::edid_composer::log_warning(PIECES(HERE_AS(site)), __VA_ARGS__)
+#define LOG_BUG_AS(site, ...) ::edid_composer::log_bug(PIECES(HERE_AS(site)), __VA_ARGS__)
+#define LOG_TRACE_AS(site, ...) \
+  (debug_enabled() ? ::edid_composer::log_trace((site).function, __LINE__, __VA_ARGS__) : void())

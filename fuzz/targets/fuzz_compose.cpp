@@ -117,8 +117,14 @@ int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
   FUZZ_REQUIRE(sum % 256 == 0);
   if (cfg.spa_offset != nullptr) FUZZ_REQUIRE(spa_offset > fuzz::block_size && spa_offset < edid_size - 2);
 
+  // An observer changes nothing, and is told things that it can name.
+  const compose_observer_t observer = [](const compose_decision_t *decision, void *) {
+    FUZZ_REQUIRE(std::strcmp(compose_reason_string(decision->reason), "unknown") != 0);
+    FUZZ_REQUIRE(std::strcmp(compose_verdict_string(decision->verdict), "unknown") != 0);
+  };
   const auto again = input.block(edid_size);
-  FUZZ_REQUIRE(compose_edid(sink.bytes.get(), sink.size, again.bytes.get(), edid_size, &cfg));
+  FUZZ_REQUIRE(compose_edid_observed(sink.bytes.get(), sink.size, again.bytes.get(), edid_size, &cfg, nullptr, observer,
+                                     nullptr));
   FUZZ_REQUIRE(std::memcmp(composed.bytes.get(), again.bytes.get(), edid_size) == 0);
   return 0;
 }

@@ -52,9 +52,10 @@ class temporary_file_t {
   temporary_file_t(const temporary_file_t &) = delete;
   temporary_file_t &operator=(const temporary_file_t &) = delete;
 
-  void write(std::span<const u8> bytes, mode_t mode) {
+  void write(std::span<const u8> bytes, mode_t mode, durability_t durability) {
     write_all(descriptor_.get(), bytes, target_);
-    if (fchmod(descriptor_.get(), mode) != 0 || fsync(descriptor_.get()) != 0 || !descriptor_.close()) {
+    const bool flushed = durability == durability_t::later || fsync(descriptor_.get()) == 0;
+    if (!flushed || fchmod(descriptor_.get(), mode) != 0 || !descriptor_.close()) {
       refuse(target_);
     }
   }
@@ -110,7 +111,7 @@ void write_all(int descriptor, std::span<const u8> bytes, const std::string &nam
   }
 }
 
-void write_file_atomically(const std::string &file, std::span<const u8> bytes) {
+void write_file_atomically(const std::string &file, std::span<const u8> bytes, durability_t durability) {
   struct stat existing {};
   const bool exists = stat(file.c_str(), &existing) == 0;
   if (exists && !S_ISREG(existing.st_mode)) {
@@ -119,9 +120,11 @@ void write_file_atomically(const std::string &file, std::span<const u8> bytes) {
   }
   const std::string target = resolve(file);
   temporary_file_t temporary(target);
-  temporary.write(bytes, exists ? existing.st_mode & 0777 : default_mode());
+  temporary.write(bytes, exists ? existing.st_mode & 0777 : default_mode(), durability);
   temporary.take_the_place_of_the_target();
-  flush_directory_of(target);
+  if (durability == durability_t::at_once) {
+    flush_directory_of(target);
+  }
 }
 
 }  // namespace edid_cli

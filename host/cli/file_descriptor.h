@@ -17,6 +17,14 @@ class file_descriptor_t {
   bool is_open() const { return descriptor_ >= 0; }
   int get() const { return descriptor_; }
 
+  /// Leaves closing to the caller.
+  int release() { return std::exchange(descriptor_, -1); }
+
+  void reset(int descriptor) {
+    close();
+    descriptor_ = descriptor;
+  }
+
   /// Tells whether closing succeeded: only then is known that what was written has arrived.
   bool close() {
     const int descriptor = std::exchange(descriptor_, -1);

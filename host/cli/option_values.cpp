@@ -10,9 +10,18 @@ namespace {
 
 constexpr u32 max_port = 14;
 constexpr u32 max_latency_ms = 65535;
+constexpr u32 max_jobs = 256;
 
 [[noreturn]] void refuse(std::string_view text, const std::string &expected) {
   throw bad_input_t("\"" + std::string(text) + "\" is not " + expected);
+}
+
+u32 parse_port(std::string_view text) {
+  const auto port = parse_whole_number(text);
+  if (!port || *port > max_port) {
+    refuse(text, "a port from 0 to 14");
+  }
+  return *port;
 }
 
 }  // namespace
@@ -26,12 +35,43 @@ u32 parse_mask(std::string_view text) {
   return *mask;
 }
 
-u32 parse_port(std::string_view text) {
-  const auto port = parse_whole_number(text);
-  if (!port || *port > max_port) {
-    refuse(text, "a port from 0 to 14");
+port_range_t parse_ports(std::string_view text) {
+  constexpr std::string_view dots = "..";
+  const std::size_t middle = text.find(dots);
+  if (middle == std::string_view::npos) {
+    const u32 port = parse_port(text);
+    return {port, port, false};
   }
-  return *port;
+  const port_range_t range{parse_port(text.substr(0, middle)), parse_port(text.substr(middle + dots.size())), true};
+  if (range.last < range.first) {
+    refuse(text, "a range of ports such as 0..3");
+  }
+  return range;
+}
+
+std::string parse_file_name(const std::string &text) {
+  if (text.empty()) {
+    throw bad_input_t("the file name is empty");
+  }
+  return text;
+}
+
+edid_format_t parse_edid_format(std::string_view text) {
+  if (text == "raw") {
+    return edid_format_t::raw;
+  }
+  if (text == "hex") {
+    return edid_format_t::hex;
+  }
+  refuse(text, "raw or hex");
+}
+
+u32 parse_jobs(std::string_view text) {
+  const auto jobs = parse_whole_number(text);
+  if (!jobs || *jobs < 1 || *jobs > max_jobs) {
+    refuse(text, "a number of jobs from 1 to 256");
+  }
+  return *jobs;
 }
 
 i32 parse_3d_mode(std::string_view text) {

@@ -1,17 +1,14 @@
-#include <fcntl.h>
-#include <unistd.h>
-
 #include <cstdio>
-#include <cstring>
 #include <filesystem>
 #include <vector>
 
-#include "bad_input.h"
 #include "commands.h"
+#include "decoded_edid.h"
 #include "edid_file.h"
 #include "exit_status.h"
 #include "input.h"
 #include "option_values.h"
+#include "output_capture.h"
 #include "standard_output.h"
 
 namespace edid_cli {
@@ -19,22 +16,8 @@ namespace {
 
 /// Printing tells no result, so the same decoding is tried first, unseen.
 bool decodes(const std::vector<u8> &edid) {
-  const file_descriptor_t nowhere(open("/dev/null", O_WRONLY | O_CLOEXEC));
-  if (!nowhere.is_open()) {
-    throw bad_input_t(std::string("/dev/null: ") + std::strerror(errno));
-  }
-  const standard_output_redirect_t redirect(nowhere.get());
-
-  edid_t record;
-  if (edid_prepare(&record) == 0) {
-    return false;
-  }
-  bool decoded = decode_edid_block_0(edid.data(), &record) != 0;
-  if (decoded && edid.size() > edid_block_size) {
-    const auto size = static_cast<u32>(edid.size()) - edid_block_size;
-    decoded = decode_edid_extensions(edid.data() + edid_block_size, size, &record) != 0;
-  }
-  return edid_destroy(&record) != 0 && decoded;
+  const output_capture_t unseen;
+  return decoded_edid_t(edid).is_complete();
 }
 
 /// The name of a file without its folders.
@@ -45,13 +28,13 @@ std::string title_of(const std::string &file) {
 }  // namespace
 
 int run(const print_options_t &options) {
-  const std::vector<u8> edid = read_edid(options.file);
+  const std::vector<u8> edid = read_edid(options.source, options.drm_directory);
   const bool decoded = decodes(edid);
-  print_edid(edid.data(), static_cast<u32>(edid.size()), options.brief ? 1 : 0, title_of(options.file).c_str());
+  print_edid(edid.data(), static_cast<u32>(edid.size()), options.brief ? 1 : 0, title_of(options.source).c_str());
   if (!decoded) {
     flush_standard_output();
     std::fprintf(stderr, "%s: %s: the library refused to decode this EDID\n", program_name,
-                 input_name(options.file).c_str());
+                 input_name(options.source).c_str());
     return refused_status;
   }
   return done_status;

@@ -96,3 +96,17 @@ const char *config_store_default_text(void) {
 const char *config_store_error(void) {
   return last_error().c_str();
 }
+
+bool config_store_node_position(uint32_t node, unsigned *line, unsigned *column) {
+  const auto position = current_tree().position(node);
+  if (!position) {
+    return false;
+  }
+  if (line != nullptr) {
+    *line = position->line;
+  }
+  if (column != nullptr) {
+    *column = position->column;
+  }
+  return true;
+}

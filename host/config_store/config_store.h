@@ -24,6 +24,7 @@
 
 #include <stdbool.h>
 #include <stddef.h>
+#include <stdint.h>
 
 /** Marks what the shared library exports. */
 #define EDID_CONFIG_STORE_API __attribute__((visibility("default")))
@@ -67,6 +68,17 @@ EDID_CONFIG_STORE_API const char *config_store_default_text(void);
  * Never NULL, NUL-terminated, valid until the next load.
  */
 EDID_CONFIG_STORE_API const char *config_store_error(void);
+
+/**
+ * Where a node stands in the document that was loaded: its key, or the value of an array's element. For what reports on
+ * a configuration.
+ *
+ * @param node a handle that a `config_node_*` operation has given.
+ * @param line receives the line, counted from 1. May be NULL.
+ * @param column receives the column, counted from 1. May be NULL.
+ * @return false, with both untouched, for the root and for a handle of no node.
+ */
+EDID_CONFIG_STORE_API bool config_store_node_position(uint32_t node, unsigned *line, unsigned *column);
 
 #ifdef __cplusplus
 }

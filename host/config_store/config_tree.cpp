@@ -10,21 +10,24 @@ config_tree_t::config_tree_t() {
   build_index();
 }
 
-node_handle_t config_tree_t::add_branch(node_handle_t parent, std::string_view name) {
-  return add(parent, name, node_kind_t::branch);
+node_handle_t config_tree_t::add_branch(node_handle_t parent, std::string_view name, node_position_t position) {
+  return add(parent, name, position, node_kind_t::branch);
 }
 
-void config_tree_t::add_integer(node_handle_t parent, std::string_view name, std::int32_t number) {
-  const node_handle_t node = add(parent, name, node_kind_t::integer);
+void config_tree_t::add_integer(node_handle_t parent, std::string_view name, node_position_t position,
+                                std::int32_t number) {
+  const node_handle_t node = add(parent, name, position, node_kind_t::integer);
   nodes_[node].number = number;
 }
 
-void config_tree_t::add_text(node_handle_t parent, std::string_view name, std::string_view text) {
-  const node_handle_t node = add(parent, name, node_kind_t::text);
+void config_tree_t::add_text(node_handle_t parent, std::string_view name, node_position_t position,
+                             std::string_view text) {
+  const node_handle_t node = add(parent, name, position, node_kind_t::text);
   nodes_[node].text = store(text);
 }
 
-node_handle_t config_tree_t::add(node_handle_t parent, std::string_view name, node_kind_t kind) {
+node_handle_t config_tree_t::add(node_handle_t parent, std::string_view name, node_position_t position,
+                                 node_kind_t kind) {
   std::string path(view(nodes_[parent].path));
   if (!path.empty()) {
     path += '.';
@@ -34,6 +37,7 @@ node_handle_t config_tree_t::add(node_handle_t parent, std::string_view name, no
   const auto node = static_cast<node_handle_t>(nodes_.size());
   node_t entry;
   entry.kind = kind;
+  entry.position = position;
   entry.path = store(path);
   entry.name_length = static_cast<std::uint32_t>(name.size());
   nodes_.push_back(entry);
@@ -118,6 +122,14 @@ std::optional<std::string_view> config_tree_t::text(node_handle_t node) const {
     return std::nullopt;
   }
   return view(entry->text);
+}
+
+std::optional<node_position_t> config_tree_t::position(node_handle_t node) const {
+  const node_t *entry = at(node);
+  if (entry == nullptr || node == root_handle) {
+    return std::nullopt;
+  }
+  return entry->position;
 }
 
 config_tree_t::span_t config_tree_t::store(std::string_view characters) {

@@ -15,15 +15,21 @@ inline constexpr node_handle_t root_handle = 0;
 
 enum class node_kind_t : std::uint8_t { branch, integer, text };
 
+/// Where a node stands in the document that it comes from, counted from 1.
+struct node_position_t {
+  std::uint32_t line = 0;
+  std::uint32_t column = 0;
+};
+
 /// Built once with the add operations, then sealed by build_index() and only read.
 class config_tree_t {
  public:
   config_tree_t();
 
   /// Appends a child to @p parent. @p name is unique among its siblings and not empty.
-  node_handle_t add_branch(node_handle_t parent, std::string_view name);
-  void add_integer(node_handle_t parent, std::string_view name, std::int32_t number);
-  void add_text(node_handle_t parent, std::string_view name, std::string_view text);
+  node_handle_t add_branch(node_handle_t parent, std::string_view name, node_position_t position);
+  void add_integer(node_handle_t parent, std::string_view name, node_position_t position, std::int32_t number);
+  void add_text(node_handle_t parent, std::string_view name, node_position_t position, std::string_view text);
 
   /// Makes the nodes added so far known to find().
   void build_index();
@@ -39,6 +45,8 @@ class config_tree_t {
   std::optional<std::string_view> name(node_handle_t node) const;
   std::optional<std::int32_t> integer(node_handle_t node) const;
   std::optional<std::string_view> text(node_handle_t node) const;
+  /// The root has none.
+  std::optional<node_position_t> position(node_handle_t node) const;
 
  private:
   static constexpr node_handle_t no_node = 0xFFFFFFFF;
@@ -51,6 +59,7 @@ class config_tree_t {
 
   struct node_t {
     node_kind_t kind = node_kind_t::branch;
+    node_position_t position;
     std::int32_t number = 0;
     span_t path;  ///< The name is its end.
     std::uint32_t name_length = 0;
@@ -60,7 +69,7 @@ class config_tree_t {
     node_handle_t next_sibling = no_node;
   };
 
-  node_handle_t add(node_handle_t parent, std::string_view name, node_kind_t kind);
+  node_handle_t add(node_handle_t parent, std::string_view name, node_position_t position, node_kind_t kind);
   span_t store(std::string_view characters);
   std::string_view view(span_t span) const;
   const node_t *at(node_handle_t node) const;

@@ -8,6 +8,10 @@
 
 // Errors come back as results: what is thrown by the parser would have to be caught at the C interface.
 #define TOML_EXCEPTIONS 0
+// The parser asserts what a malformed document can break ("[="), and reports it behind that as it should. The
+// assertions would end the process, or with NDEBUG have the compiler assume that it cannot be: neither may be.
+#undef NDEBUG
+#define TOML_ASSERT(expression) static_assert(true)
 #include <toml++/toml.h>
 
 namespace edid_config_store {
@@ -39,6 +43,10 @@ std::string at_position(std::string_view name, const toml::source_position &posi
   std::ostringstream result;
   result << name << ':' << position.line << ':' << position.column << ": ";
   return result.str();
+}
+
+node_position_t position_of(const toml::source_position &position) {
+  return {position.line, position.column};
 }
 
 const char *type_name(toml::node_type type) {
@@ -100,11 +108,11 @@ class copier_t {
     } else if (const auto *array = value.as_array(); array != nullptr) {
       copy_branch(*array, parent, name, position, depth);
     } else if (const auto *integer = value.as_integer(); integer != nullptr) {
-      copy_integer(integer->get(), parent, name, value.source().begin);
+      copy_integer(integer->get(), parent, name, position, value.source().begin);
     } else if (const auto *boolean = value.as_boolean(); boolean != nullptr) {
-      tree_.add_integer(parent, name, boolean->get() ? 1 : 0);
+      tree_.add_integer(parent, name, position_of(position), boolean->get() ? 1 : 0);
     } else if (const auto *text = value.as_string(); text != nullptr) {
-      copy_text(text->get(), parent, name, value.source().begin);
+      copy_text(text->get(), parent, name, position, value.source().begin);
     } else {
       refuse(value.source().begin, parent, name,
              std::string(type_name(value.type())) +
@@ -119,25 +127,27 @@ class copier_t {
       refuse(position, parent, name, "tables and arrays are nested more than 64 deep");
       return;
     }
-    copy_children(children, tree_.add_branch(parent, name), depth + 1);
+    copy_children(children, tree_.add_branch(parent, name, position_of(position)), depth + 1);
   }
 
   void copy_integer(std::int64_t number, node_handle_t parent, std::string_view name,
-                    const toml::source_position &position) {
+                    const toml::source_position &position, const toml::source_position &value_position) {
     if (number < std::numeric_limits<std::int32_t>::min() || number > std::numeric_limits<std::uint32_t>::max()) {
-      refuse(position, parent, name, std::to_string(number) + " does not fit 32 bits (-2147483648 to 4294967295)");
+      refuse(value_position, parent, name,
+             std::to_string(number) + " does not fit 32 bits (-2147483648 to 4294967295)");
       return;
     }
-    tree_.add_integer(parent, name, static_cast<std::int32_t>(static_cast<std::uint32_t>(number)));
+    tree_.add_integer(parent, name, position_of(position),
+                      static_cast<std::int32_t>(static_cast<std::uint32_t>(number)));
   }
 
   void copy_text(const std::string &text, node_handle_t parent, std::string_view name,
-                 const toml::source_position &position) {
+                 const toml::source_position &position, const toml::source_position &value_position) {
     if (text.find('\0') != std::string::npos) {
-      refuse(position, parent, name, "the string holds a NUL character");
+      refuse(value_position, parent, name, "the string holds a NUL character");
       return;
     }
-    tree_.add_text(parent, name, text);
+    tree_.add_text(parent, name, position_of(position), text);
   }
 
   /// The parser keeps tables sorted by key; what was written first stands at the smaller position.

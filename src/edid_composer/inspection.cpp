@@ -10,7 +10,7 @@ constexpr u32 smallest_size = block_size;
 constexpr u32 largest_size = 2 * block_size;
 
 /// The formats of an audio mask, from bit 0 on. kept: the enhanced AC-3 of bit 9 is called as the AC-3 of bit 1.
-constexpr const char *audio_mask_names[] = {
+constexpr char audio_mask_names[][16] = {
     "pcm ", "ac3 ",    "mpeg1 ", "mp3 ", "mpeg2 ",   "aac ",    "dts ",     "atrac ",         "dsd ",
     "ac3 ", "dts_hd ", "mlp ",   "dst ", "wma_pro ", "he_aac ", "he_aac2 ", "mpeg_surround ",
 };
@@ -61,7 +61,7 @@ void print_edid_audio_mask(u32 mask) {
     std::printf("No audio formats");
   } else {
     u32 bit = 1;
-    for (const char *name : audio_mask_names) {
+    for (const auto &name : audio_mask_names) {
       if ((mask & bit) != 0) std::printf("%s", name);
       bit <<= 1;
     }

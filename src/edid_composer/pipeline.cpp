@@ -1,12 +1,19 @@
 // The road of one composition, from the caller's arguments to the bytes of the new EDID.
+#include <optional>
+
 #include "diagnostics.h"
 #include "edid_composer/audio_formats.h"
+#include "edid_composer/decisions.h"
 #include "edid_composer/modes_4k_x_2k.h"
 #include "edid_composer/platform_values_reader.h"
 #include "edid_composer/population.h"
 #include "edid_composer/raw_dump.h"
 #include "edid_composer/video_modes.h"
+#include "edid_composer/written_offer.h"
+#include "edid_decode_encode/base_block_layout.h"
+#include "edid_decode_encode/cea_extension_layout.h"
 #include "edid_decode_encode/checksum.h"
+#include "edid_decode_encode/encoder.h"
 #include "linked_list/element_types.h"
 
 namespace edid_composer {
@@ -105,32 +112,56 @@ void decode_sink(const site_t &site, const request_t &request, edid_t *edid) {
   }
 }
 
+void note_room(decisions_t *decisions, const extension_size_t &size, const u8 *new_edid) {
+  constexpr u32 there = checksum_offset;
+  constexpr u32 longest = data_block::length_mask;
+  compose_verdict verdict = COMPOSE_VERDICT_CHANGED;
+  compose_reason reason = COMPOSE_REASON_ROOM_ENOUGH;
+  if (new_edid[base_block::extension_count] == 0) {
+    reason = COMPOSE_REASON_NOT_ANNOUNCED;
+  } else if (size.longest_block > longest) {
+    reason = COMPOSE_REASON_BLOCK_TOO_LONG;
+  } else if (size.bytes > there) {
+    reason = COMPOSE_REASON_ROOM_EXCEEDED;
+  } else {
+    verdict = COMPOSE_VERDICT_OFFERED;
+  }
+  decisions->note(COMPOSE_SUBJECT_EXTENSION_ROOM, size.bytes, verdict, reason,
+                  reason_values(size.bytes, there, size.longest_block, longest));
+}
+
 /// The stages, each from its inputs into the new record or the list of modes.
 bool run_stages(const site_t &site, const request_t &request, const platform_values_t *values, u8 port,
-                workspace_t *work) {
+                decisions_t *decisions, workspace_t *work) {
   const compose_cfg_t *const cfg = request.cfg;
-  if (_filter_video_modes(&work->edid, cfg, &work->modes, values) != 1) {
+  if (_filter_video_modes(&work->edid, cfg, &work->modes, values, decisions) != 1) {
     LOG_ERROR_AS(site, "Failed filtering the video modes.");
     return false;
   }
-  if (_filter_4k_modes(&work->edid, &work->new_edid, values) != 1) {
+  if (_filter_4k_modes(&work->edid, &work->new_edid, values, decisions) != 1) {
     LOG_ERROR_AS(site, "Failed filtering the 4k x 2k video modes.");
     return false;
   }
   const u8 sink_filter = cfg->audio_sink_filter == 1 ? 1 : 0;
-  if (_filter_audio_formats(&work->edid, cfg->audio_mask, sink_filter, &work->new_edid.audio_list, values) != 1) {
+  if (_filter_audio_formats(&work->edid, cfg->audio_mask, sink_filter, &work->new_edid.audio_list, values, decisions) !=
+      1) {
     LOG_ERROR_AS(site, "Failed filtering the audio formats.");
     return false;
   }
-  if (_populate_new_edid(&work->new_edid, &work->modes, &work->edid, port, cfg->hdmi_3d_mode, cfg->edid_latency,
-                         values) != 1) {
+  if (_populate_new_edid(&work->new_edid, &work->modes, &work->edid, port, cfg->hdmi_3d_mode, cfg->edid_latency, values,
+                         decisions) != 1) {
     LOG_ERROR_AS(site, "Failed populating the new edid.");
     return false;
   }
-  if (encode_edid(request.new_edid_block, static_cast<i32>(request.new_edid_bytes), &work->new_edid, cfg->spa_offset,
-                  values) != 1) {
+  extension_size_t size{};
+  if (encode_and_measure_edid(request.new_edid_block, static_cast<i32>(request.new_edid_bytes), &work->new_edid,
+                              cfg->spa_offset, values, &size) != 1) {
     LOG_ERROR_AS(site, "Failed encoding the new edid.");
     return false;
+  }
+  if (decisions != nullptr) {
+    note_room(decisions, size, request.new_edid_block);
+    settle_decisions(decisions, request.new_edid_block);
   }
   return true;
 }
@@ -153,7 +184,8 @@ void trace_result(const site_t &site, const u8 *new_edid_block) {
   if (edid_destroy(&edid) != 1) LOG_WARNING_AS(site, "Failed to destroy the debug edid.");
 }
 
-bool compose(const site_t &site, const request_t &request, bool sink_usable, workspace_t *work) {
+bool compose(const site_t &site, const request_t &request, bool sink_usable, decisions_t *decisions,
+             workspace_t *work) {
   const platform_values_t *values = request.platform_values;
   if (values == nullptr) {
     values = &work->platform_values;
@@ -170,7 +202,7 @@ bool compose(const site_t &site, const request_t &request, bool sink_usable, wor
     LOG_TRACE_AS(site, "Valid edid not available. Continuing composing edid. Passed in edid:%p size:%d bytes",
                  address(request.edid_block), request.edid_bytes);
   }
-  if (!run_stages(site, request, values, port, work)) return false;
+  if (!run_stages(site, request, values, port, decisions, work)) return false;
   trace_result(site, request.new_edid_block);
   return true;
 }
@@ -183,10 +215,33 @@ void clean_up(const site_t &site, workspace_t *work) {
   platform_values_destroy(&work->platform_values);
 }
 
+/// A composition, in the name of compose_edid_internal().
+bool compose_observed(const request_t &request, compose_observer_t observer, void *context) {
+  const site_t site{EDID_COMPOSER_MODULE, "compose_edid_internal", __LINE__};
+  const bool sink_usable = is_sink_usable(site, request);
+  if (!is_output_valid(site, request)) return false;
+
+  workspace_t work;
+  if (!platform_values_init(&work.platform_values)) {
+    LOG_ERROR_AS(site, "Failed initializing platfrom values.");
+    return false;
+  }
+  if (request.platform_values != nullptr && !ll_is_initialized(&request.platform_values->audio_list)) {
+    LOG_ERROR_AS(site, "The passed in platform_values has not been initialized.");
+    return false;
+  }
+  std::optional<decisions_t> decisions;
+  if (observer != nullptr) decisions.emplace(site);
+  const bool composed = compose(site, request, sink_usable, decisions ? &*decisions : nullptr, &work);
+  clean_up(site, &work);
+  if (composed && decisions) decisions->tell(observer, context);
+  return composed;
+}
+
 }  // namespace
 }  // namespace edid_composer
 
-using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
+using edid_composer::compose_observed;
 
 bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
                   const compose_cfg_t *cfg) {
@@ -195,20 +250,13 @@ bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 
 
 bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
                            const compose_cfg_t *cfg, const platform_values_t *platform_values) {
-  const request_t request{edid_block, edid_bytes, new_edid_block, new_edid_bytes, cfg, platform_values};
-  const bool sink_usable = is_sink_usable(HERE, request);
-  if (!is_output_valid(HERE, request)) return false;
+  return compose_edid_observed(edid_block, edid_bytes, new_edid_block, new_edid_bytes, cfg, platform_values, nullptr,
+                               nullptr);
+}
 
-  workspace_t work;
-  if (!platform_values_init(&work.platform_values)) {
-    LOG_ERROR("Failed initializing platfrom values.");
-    return false;
-  }
-  if (platform_values != nullptr && !ll_is_initialized(&platform_values->audio_list)) {
-    LOG_ERROR("The passed in platform_values has not been initialized.");
-    return false;
-  }
-  const bool composed = compose(HERE, request, sink_usable, &work);
-  clean_up(HERE, &work);
-  return composed;
+bool compose_edid_observed(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
+                           const compose_cfg_t *cfg, const platform_values_t *platform_values,
+                           compose_observer_t observer, void *context) {
+  return compose_observed({edid_block, edid_bytes, new_edid_block, new_edid_bytes, cfg, platform_values}, observer,
+                          context);
 }

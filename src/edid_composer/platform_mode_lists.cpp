@@ -1,6 +1,5 @@
 #include "edid_composer/platform_mode_lists.h"
 
-#include <cstdio>
 #include <iterator>
 
 #include "diagnostics.h"
@@ -42,11 +41,10 @@ bool _get_generic_platform_list(const char *list_name, bool is_int, void *contex
     LOG_BUG("Callback function pointer is NULL. list_name:%s", list_name);
     return true;
   }
-  char path[128];
-  std::snprintf(path, sizeof path, "%s%s", CONFIGURATION_DOMAIN, list_name);
+  const configuration_path_t<128> path(list_name);
   u32 list = 0;
-  if (config_node_find(0, path, &list) == not_found) {
-    LOG_ERROR("Unabled to find the platform node:%s.\n", path);
+  if (config_node_find(0, path.text(), &list) == not_found) {
+    LOG_ERROR("Unabled to find the platform node:%s.\n", path.text());
     return true;
   }
   print_platform_node(list, "\tRoot Node");
@@ -69,7 +67,7 @@ bool _get_platform_list(u32 type, ll_list_t *list) {
   struct video_list_t {
     u32 rate;
     bool priority;
-    const char *name;
+    char name[24];
   };
   constexpr video_list_t video_lists[] = {
       {50, true, "50_hz_priority_list"},
@@ -123,8 +121,8 @@ void print_platform_node(u32 node, const char *label) {
   if (!debug_enabled()) return;
   char name[edid_composer::node_name_size] = "";
   if (config_node_get_name(node, name, sizeof name) == 0) {
-    edid_composer::log_trace(HERE, "%s:Name of node is:%s", label, name);
+    LOG_TRACE("%s:Name of node is:%s", label, name);
   } else {
-    edid_composer::log_trace(HERE, "%s:Failed trying to get name", label);
+    LOG_TRACE("%s:Failed trying to get name", label);
   }
 }

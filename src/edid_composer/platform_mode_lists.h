@@ -40,6 +40,16 @@ void _get_4k_x_2k_modes(const char *list_name, i32 *modes);
 void _get_est_timing_list(const char *list_name, u32 *mask);
 void _get_std_timing_list(ll_list_t *list);
 
+/// What an entry of a video mode list holds: a number, and up to three words of up to nine characters.
+struct video_mode_words_t {
+  long number;  ///< Takes any number that fits the text; an int would not.
+  char flags[3][10];
+};
+
+/// Reads @p text as scanf reads "%ld%9s%9s%9s". Answers the number of fields, 0 without a number; words that aren't
+/// there stay as they are.
+int _scan_video_mode(const char *text, video_mode_words_t *words);
+
 bool _get_vic_list_callback(const char *node_name, const char *list_name, i32 int_value, char *string_value,
                             u32 string_size, void *context);
 bool _get_4k_x_2k_mode_callback(const char *node_name, const char *list_name, i32 int_value, char *string_value,

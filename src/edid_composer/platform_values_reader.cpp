@@ -1,7 +1,5 @@
 #include "edid_composer/platform_values_reader.h"
 
-#include <cstdio>
-
 #include "diagnostics.h"
 #include "edid_composer/platform_mode_lists.h"
 #include "linked_list/new_entry.h"
@@ -13,7 +11,7 @@ namespace {
 /// A number of the configuration: its key, its limits, what it is when absent, where it goes.
 template <typename number_t>
 struct setting_t {
-  const char *key;
+  char key[32];
   number_t min;
   number_t max;
   number_t default_val;
@@ -87,9 +85,9 @@ void read_settings(const site_t &site, platform_values_t *values) {
 }
 
 bool read_audio_entries(const site_t &site, platform_values_t *values) {
+  char path[] = CONFIGURATION_DOMAIN "audio.entry_?";
   for (char letter = 'a'; letter <= 'z'; ++letter) {
-    char path[128];
-    std::snprintf(path, sizeof path, "%s.entry_%c", CONFIGURATION_DOMAIN "audio", letter);
+    path[sizeof path - 2] = letter;
     i32 value = 0;
     if (config_get_int(0, path, &value) != 0) continue;
     if (!append(&values->audio_list, value, HERE_AS(site))) return false;

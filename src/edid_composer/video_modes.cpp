@@ -3,6 +3,7 @@
 #include <cstdio>
 
 #include "diagnostics.h"
+#include "edid_composer/video_verdicts.h"
 #include "linked_list/new_entry.h"
 #include "linked_list/walk.h"
 
@@ -23,19 +24,31 @@ constexpr const char *not_native_column = "      ";
 /// Appends the VIC of each timing of the sink that has one.
 template <typename timing_t>
 bool add_timings(const site_t &site, const edid_t *edid, const named_list_t &timings,
-                 u8 (*convert_to_vic)(const edid_t *, const timing_t *, u32 *), ll_list_t *candidates) {
+                 u8 (*convert_to_vic)(const edid_t *, const timing_t *, u32 *), ll_list_t *candidates,
+                 compose_origin origin, decisions_t *decisions) {
+  i32 next = 0;
   for (const auto &timing : walk<const timing_t>(timings)) {
+    const i32 index = next++;
     u32 vic = 0;
-    if (convert_to_vic(edid, &timing, &vic) != 1) continue;
+    if (convert_to_vic(edid, &timing, &vic) != 1) {
+      if (decisions != nullptr) note_timing_without_vic(decisions, timing, index);
+      continue;
+    }
+    if (decisions != nullptr) decisions->nominate(COMPOSE_SUBJECT_VIDEO_MODE, vic, origin, index);
     const short_video_desc_t video{.native = 0, .vic = vic, .stereo = 0};
     if (!append(candidates, video, HERE_AS(site))) return false;
   }
   return true;
 }
 
-bool add_sink_modes(const site_t &site, const edid_t *edid, ll_list_t *candidates) {
-  if (!add_timings(site, edid, LIST_AS(site, &edid->dtd_list), convert_dtd_to_vic, candidates)) return false;
-  if (!add_timings(site, edid, LIST_AS(site, &edid->std_timings), convert_std_to_vic, candidates)) return false;
+bool add_sink_modes(const site_t &site, const edid_t *edid, ll_list_t *candidates, decisions_t *decisions) {
+  if (!add_timings(site, edid, LIST_AS(site, &edid->dtd_list), convert_dtd_to_vic, candidates,
+                   COMPOSE_ORIGIN_DETAILED_TIMING, decisions) ||
+      !add_timings(site, edid, LIST_AS(site, &edid->std_timings), convert_std_to_vic, candidates,
+                   COMPOSE_ORIGIN_STANDARD_TIMING, decisions)) {
+    return false;
+  }
+  if (decisions != nullptr) decisions->nominate_modes(edid->video_list, COMPOSE_ORIGIN_SHORT_VIDEO);
   if (_combine_lists(candidates, &edid->video_list) != 1) {
     LOG_ERROR_AS(site, "Failed combining short video lists.");
     return false;
@@ -108,12 +121,14 @@ bool delete_first(const site_t &site, u32 vic, ll_list_t *ret_modes) {
   return true;
 }
 
-bool put_current_mode_first(const site_t &site, const video_mode_t &mode, ll_list_t *ret_modes) {
-  constexpr new_entry_texts_t texts{"Failed creating entry.", "Failed adding entry to the back of the list.",
-                                    "Failed deleting unused entry."};
+bool put_current_mode_first(const site_t &site, const video_mode_t &mode, ll_list_t *ret_modes,
+                            decisions_t *decisions) {
+  static constexpr new_entry_texts_t texts{"Failed creating entry.", "Failed adding entry to the back of the list.",
+                                           "Failed deleting unused entry."};
   u32 vic = 0;
   if (mode_to_vic(&mode, &vic) != 1) {
     LOG_ERROR_AS(site, "Could not obtain a valid hdmi mode. Continuing.");
+    if (decisions != nullptr) note_current_mode(decisions, mode, 0, COMPOSE_REASON_CURRENT_MODE_WITHOUT_VIC);
     return true;
   }
   if (!delete_first(site, vic, ret_modes)) return false;
@@ -121,23 +136,47 @@ bool put_current_mode_first(const site_t &site, const video_mode_t &mode, ll_lis
   if (!current) return false;
   current->vic = vic;
   LOG_TRACE_AS(site, "\tAdding hdmi output mode as the priority mode:%s", short_video_timing_string(vic));
+  if (decisions != nullptr) note_current_mode(decisions, mode, vic, COMPOSE_REASON_CURRENT_MODE_FIRST);
   return current.add_to_front(ret_modes);
+}
+
+/// Takes out the candidates that are taller than the sink shows, if the platform wants so.
+void limit_geometry(const platform_values_t &values, const ll_list_t &sink_modes, ll_list_t *candidates,
+                    decisions_t *decisions) {
+  if (values.geometry_limit == 0) {
+    if (decisions != nullptr) {
+      decisions->note(COMPOSE_SUBJECT_GEOMETRY_LIMIT, 0, COMPOSE_VERDICT_LEFT_OUT, COMPOSE_REASON_GEOMETRY_UNLIMITED);
+    }
+    return;
+  }
+  const u32 limit = _find_largest_height(&sink_modes);
+  if (decisions != nullptr) {
+    decisions->note(COMPOSE_SUBJECT_GEOMETRY_LIMIT, limit, COMPOSE_VERDICT_OFFERED, COMPOSE_REASON_GEOMETRY_OF_SINK);
+  }
+  _remove_larger_height_modes(limit, candidates, decisions);
 }
 
 /// The steps between making and deleting the candidate list.
 bool select_modes(const site_t &site, const edid_t *edid, const compose_cfg_t *cfg, const platform_values_t &values,
-                  ll_list_t *candidates, ll_list_t *ret_modes) {
-  if (!add_sink_modes(site, edid, candidates)) return false;
-  const i32 rate = _determine_tv_native_refresh_rate(edid, &values);
+                  ll_list_t *candidates, ll_list_t *ret_modes, decisions_t *decisions) {
+  if (!add_sink_modes(site, edid, candidates, decisions)) return false;
+  const i32 rate = _determine_tv_native_refresh_rate(edid, &values, decisions);
   if (!add_platform_modes(site, rate, values, candidates)) return false;
-  if (values.geometry_limit != 0) _remove_larger_height_modes(_find_largest_height(&edid->video_list), candidates);
+  if (decisions != nullptr) nominate_platform_modes(decisions, rate, values);
+  limit_geometry(values, edid->video_list, candidates, decisions);
   const ll_list_t *const list = rate == 60 ? &values.video_60_priority : &values.video_50_priority;
   if (!prioritize(site, rate, list, candidates, ret_modes)) return false;
+  if (decisions != nullptr) judge_video_modes(decisions, rate, *ret_modes);
 
-  if (values.current_mode_set_to_priority != 0 && _valid_current_mode(&cfg->hdmi_current_mode) == 1) {
-    if (!put_current_mode_first(site, cfg->hdmi_current_mode, ret_modes)) return false;
+  const bool wanted_first = values.current_mode_set_to_priority != 0;
+  if (wanted_first && _valid_current_mode(&cfg->hdmi_current_mode) == 1) {
+    if (!put_current_mode_first(site, cfg->hdmi_current_mode, ret_modes, decisions)) return false;
   } else {
     LOG_TRACE_AS(site, "\tIgnoring hdmi_current_mode.");
+    if (decisions != nullptr) {
+      note_current_mode(decisions, cfg->hdmi_current_mode, 0,
+                        wanted_first ? COMPOSE_REASON_CURRENT_MODE_IMPLAUSIBLE : COMPOSE_REASON_CURRENT_MODE_IGNORED);
+    }
   }
   if (debug_enabled()) {
     log_trace(HERE_AS(site), "\tNew EDID List of VICs:");
@@ -162,11 +201,11 @@ bool frame_height(const site_t &site, u32 vic, u32 *height) {
 }  // namespace
 
 u32 _filter_video_modes(const edid_t *edid, const compose_cfg_t *cfg, ll_list_t *ret_modes,
-                        const platform_values_t *platform_values) {
+                        const platform_values_t *platform_values, decisions_t *decisions) {
   ll_list_t candidates{};
   bool selected = init_list<short_video_desc_t>(&candidates);
   if (selected) {
-    selected = select_modes(HERE, edid, cfg, *platform_values, &candidates, ret_modes);
+    selected = select_modes(HERE, edid, cfg, *platform_values, &candidates, ret_modes, decisions);
   } else {
     LOG_ERROR("Failed initializing the linked list.");
   }
@@ -220,14 +259,18 @@ u32 _find_largest_height(const ll_list_t *video_list) {
   return largest;
 }
 
-void _remove_larger_height_modes(u32 limit, ll_list_t *list) {
+void _remove_larger_height_modes(u32 limit, ll_list_t *list, decisions_t *decisions) {
   // From the back, so that the positions in front of a deleted entry stay what they are.
   for (i32 position = ll_size(list) - 1; position >= 0; --position) {
     void *payload = nullptr;
     if (!ll_entry_at(list, position, &payload)) continue;
+    const u32 vic = static_cast<const short_video_desc_t *>(payload)->vic;
     u32 height = 0;
-    if (frame_height(HERE, static_cast<const short_video_desc_t *>(payload)->vic, &height) && height > limit) {
-      ll_delete_entry_at(list, static_cast<u32>(position));
+    if (!frame_height(HERE, vic, &height) || height <= limit) continue;
+    ll_delete_entry_at(list, static_cast<u32>(position));
+    if (decisions != nullptr) {
+      decide(decisions->candidate(COMPOSE_SUBJECT_VIDEO_MODE, vic), COMPOSE_VERDICT_LEFT_OUT,
+             COMPOSE_REASON_TALLER_THAN_SINK, reason_values(height, limit));
     }
   }
 }

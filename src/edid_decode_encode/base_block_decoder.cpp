@@ -3,28 +3,17 @@
 #include "edid_decode_encode/checksum.h"
 #include "edid_decode_encode/descriptor_decoder.h"
 #include "edid_decode_encode/descriptor_layout.h"
+#include "edid_decode_encode/record_lists.h"
 
 namespace edid_composer {
 namespace {
 
 using u64 = unsigned long long;
 
-struct prepared_list_t {
-  ll_list_t edid_t::*list;
-  const char *not_initialised;
-};
-
-constexpr prepared_list_t prepared_lists[] = {
-    {&edid_t::std_timings, "standard_timing_list: List not initialized."},
-    {&edid_t::dtd_list, "detailed_timing_list: List not initialized."},
-    {&edid_t::video_list, "short_video_description_list: List not initialized."},
-    {&edid_t::audio_list, "short_audio_description_list: List not initialized."},
-};
-
 bool is_prepared(const site_t &site, const edid_t &edid) {
-  for (const auto &row : prepared_lists) {
+  for (const auto &row : record_lists) {
     if (!ll_is_initialized(&(edid.*row.list))) {
-      LOG_ERROR_AS(site, "%s", row.not_initialised);
+      LOG_ERROR_AS(site, "%s: List not initialized.", row.name);
       return false;
     }
   }

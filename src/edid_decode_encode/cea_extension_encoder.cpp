@@ -120,21 +120,25 @@ bool encode_timing(const site_t &site, byte_writer_t *extension) {
 }  // namespace
 
 bool encode_cea_extension(const site_t &site, edid_t *edid, bool native_bit, u32 timings_written, u8 *extension,
-                          u8 *spa_offset) {
+                          u8 *spa_offset, extension_size_t *size) {
   constexpr i32 most_timings = 2;
   byte_writer_t writer(extension, block_size);
   writer.put(layout::cea_tag);
   writer.put(layout::supported_revision);
   writer.seek(layout::data_blocks);
   encode_speaker_block(*edid, &writer);
+  const u32 video_block = writer.position();
   if (!encode_video_block(site, *edid, native_bit, &writer)) return false;
+  const u32 audio_block = writer.position();
   if (!encode_audio_block(site, *edid, &writer)) return false;
+  const u32 hdmi_block = writer.position();
   if (!encode_hdmi_vendor_block(site, edid, &writer, spa_offset)) return false;
+  size->longest_block = std::max(audio_block - video_block, writer.position() - hdmi_block) - 1;
   encode_colorimetry_block(*edid, &writer);
   writer.put_at(layout::timings_offset, low_byte(writer.position()));
 
-  if (const i32 size = ll_size(&edid->dtd_list); size > most_timings) {
-    LOG_BUG_AS(site, "This function is only designed to handle up to 2 DTDs. num of dtds:%d", size);
+  if (const i32 timings = ll_size(&edid->dtd_list); timings > most_timings) {
+    LOG_BUG_AS(site, "This function is only designed to handle up to 2 DTDs. num of dtds:%d", timings);
     return false;
   }
   if (!encode_timing(site, &writer)) return false;
@@ -144,6 +148,7 @@ bool encode_cea_extension(const site_t &site, edid_t *edid, bool native_bit, u32
   const u32 support =
       (edid->underscan != 0 ? layout::underscan : 0U) | layout::basic_audio | layout::ycbcr_444 | layout::ycbcr_422;
   writer.put_at(layout::flags, low_byte(support | (timings_written & layout::native_timings_mask)));
+  size->bytes = writer.position();
   if (writer.position() > checksum_offset) {
     LOG_ERROR_AS(site, "The CEA extension needs %d bytes, but has %d before its checksum. The rest is left out.",
                  writer.position(), checksum_offset);

@@ -135,7 +135,7 @@ inline constexpr i32 most_3d_modes = 16;
 struct structure_3d_t {
   u32 code;
   u32 stereo;
-  const char *name;
+  char name[8];
 };
 inline constexpr u32 side_by_side_half = 8;  ///< The one structure that has a 3D_Detail byte behind it.
 inline constexpr structure_3d_t structures_3d[] = {

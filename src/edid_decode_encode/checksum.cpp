@@ -4,8 +4,8 @@ namespace edid_composer {
 
 u8 _calculate_checksum(const byte_view_t &block) {
   u32 sum = 0;
-  for (u32 offset = 0; offset < checksum_offset; ++offset)
-    sum += block[offset];
+  for (const u8 byte : block.first(checksum_offset))
+    sum += byte;
   return low_byte(0x100 - (sum & 0xFF));
 }
 

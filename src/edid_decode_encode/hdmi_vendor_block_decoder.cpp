@@ -61,12 +61,14 @@ bool mark_all(const site_t &site, u32 structure_all, u32 mask, edid_t *edid) {
   const u32 stereo = stereo_of_all(structure_all);
   const i32 size = ll_size(&edid->video_list);
   for (i32 i = 0; i < size && i < layout::most_3d_modes; ++i) {
+    // Looked up are the modes of the mask only: each look-up verifies the whole list.
+    if ((mask >> i & 1) == 0) continue;
     short_video_desc_t *entry = nullptr;
     if (!video_entry_at(*edid, i, &entry)) {
       LOG_ERROR_AS(site, "Failed reading from an linked list. index:%d", i);
       return false;
     }
-    if ((mask >> i & 1) != 0) entry->stereo |= stereo;
+    entry->stereo |= stereo;
   }
   return true;
 }

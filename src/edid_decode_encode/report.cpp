@@ -6,6 +6,7 @@
 #include "diagnostics.h"
 #include "linked_list/walk.h"
 #include "text_field.h"
+#include "utility/timing_lines.h"
 
 namespace edid_composer {
 namespace {
@@ -17,9 +18,6 @@ const char *native(u8 flag) {
   return flag != 0 ? "Native" : "";
 }
 
-u32 inches_of_mm(u32 millimetres) {
-  return millimetres * 5 / 127;
-}
 u32 inches_of_cm(u32 centimetres) {
   return centimetres * 50 / 127;
 }
@@ -152,24 +150,8 @@ void print_detailed_timing(i32 number, const detailed_timing_t &timing) {
                                           timing.v_blanking);
   std::printf("Timing %d: %dx%d%s%d\n", number, timing.h_active, progressive ? timing.v_active : timing.v_active * 2,
               progressive ? "p" : "i", rate);
-  std::printf("\tPixel Clock:     %d\n", timing.pixel_clock);
-  std::printf("\tRefresh Rate:    %d\n", rate);
-  std::printf("\tH Active:        %d\n", timing.h_active);
-  std::printf("\tH Blanking:      %d\n", timing.h_blanking);
-  std::printf("\tV Active:        %d\n", timing.v_active);
-  std::printf("\tV Blanking:      %d\n", timing.v_blanking);
-  std::printf("\tH sync offset:   %d\n", timing.h_sync_offset);
-  std::printf("\tH sync width:    %d\n", timing.h_sync_width);
-  std::printf("\tV sync offset:   %d\n", timing.v_sync_offset);
-  std::printf("\tV sync width:    %d\n", timing.v_sync_width);
-  std::printf("\tH image size:    %d mm (%d in)\n", timing.h_image_size, inches_of_mm(timing.h_image_size));
-  std::printf("\tV image size:    %d mm (%d in)\n", timing.v_image_size, inches_of_mm(timing.v_image_size));
-  std::printf("\tH Border:        %d\n", timing.h_border);
-  std::printf("\tV Border:        %d\n", timing.v_border);
-  std::printf("\tScan:            %s\n", progressive ? "Progressive" : "Interlaced");
-  std::printf("\tStereo:          %s\n", timing.stereo != 0 ? "Yes" : "No");
-  std::printf("\tH sync:          %s\n", timing.h_sync_positive != 0 ? "Positive" : "Negative");
-  std::printf("\tV sync:          %s\n", timing.v_sync_positive != 0 ? "Positive" : "Negative");
+  for (const auto &line : timing_lines_t(timing))
+    std::printf("%s\n", line);
 }
 
 void print_detailed_timings(const site_t &site, const edid_t *edid) {

@@ -18,40 +18,108 @@ u32 _get_magic_number(const ll_list_t *list) {
   return static_cast<u32>(bits & 0xFFFFFFFF) ^ key;
 }
 
-u32 _calculate_str_checksum(const char *name) {
-  u32 tag = 0;
-  u32 shift = 0;
-  for (; *name != '\0'; ++name) {
-    const auto extended = static_cast<u32>(i32{static_cast<signed char>(*name)});
-    tag ^= extended << shift;
-    shift = (shift + 8) % 32;
+bool create_entry(i32 size, ll_entry_t **entry, void **data, u32 tag) {
+  constexpr site_t site{EDID_COMPOSER_MODULE, "ll_create_entry", 0};
+  *entry = nullptr;
+  *data = nullptr;
+
+  auto *const created = static_cast<ll_entry_t *>(std::calloc(1, sizeof(ll_entry_t)));
+  if (created == nullptr) {
+    LOG_BUG_AS(site, "calloc failed to allocate memory for the entry. ptr:%p", address(entry));
+    return false;
   }
-  return tag;
+  created->data = std::calloc(1, static_cast<std::size_t>(size));
+  if (created->data == nullptr) {
+    LOG_BUG_AS(site, "calloc failed to allocate memory for the data storage. ptr:%p", address(data));
+    std::free(created);
+    return false;
+  }
+  created->type = tag;
+  *entry = created;
+  *data = created->data;
+  return true;
 }
 
 namespace {
 
-// What every operation on entries asks of its list.
-bool is_sound(const site_t &site, const ll_list_t *list) {
+// The integrity test, in the name of ll_verify_integrity. Answers the link that ends the list, so that an addition at
+// the back needs no walk of its own; null when the list is corrupt.
+ll_entry_t *const *verified_end(const ll_list_t *list) {
+  constexpr site_t site{EDID_COMPOSER_MODULE, "ll_verify_integrity", 0};
   if (list == nullptr) {
     LOG_ERROR_AS(site, "\"list\" parameter is NULL. list:%p", address(list));
-    return false;
+    return nullptr;
   }
-  if (!ll_verify_integrity(list)) {
-    LOG_BUG_AS(site, "List failed integrity test.%s", "");
-    return false;
+  if (const u32 magic = _get_magic_number(list); list->magic != magic) {
+    // kept: the stored magic stands under the label ExpectedMagic.
+    LOG_ERROR_AS(site, "Corrupt List: List not initialized. Ptr:%p ExpectedMagic:%d Magic:%d Size:%d Head:%p ",
+                 address(list), list->magic, magic, list->size, address(list->head));
+    return nullptr;
   }
-  return true;
+  if (list->head == nullptr) {
+    if (list->size == 0) return &list->head;
+    LOG_ERROR_AS(site, "Corrupt List: The list's head is NULL, but the size isn't zero. Size:%d", list->size);
+    return nullptr;
+  }
+  if (list->size == 0) {
+    LOG_ERROR_AS(site, "Corrupt List: The list's size is zero, but the head isn't NULL. HeadPtr:%p",
+                 address(list->head));
+    return nullptr;
+  }
+
+  const auto size = static_cast<i32>(list->size);
+  i32 counter = 0;
+  ll_entry_t *const *link = &list->head;
+  do {
+    const ll_entry_t *const entry = *link;
+    if (entry->list == nullptr) {
+      LOG_BUG_AS(site, "Corrupt List: An entry's list attribute is set to NULL. Ptr:%p", address(entry->list));
+      return nullptr;
+    }
+    if (entry->type != list->type) {
+      LOG_BUG_AS(site, "Corrupt List: An entry's type does not match the lists. Count:%d", counter);
+      return nullptr;
+    }
+    ++counter;
+    link = &entry->next;
+  } while (counter < size && *link != nullptr);
+
+  if (*link != nullptr) {
+    LOG_ERROR_AS(site,
+                 "Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d "
+                 "NextPtr=%p",
+                 counter, size, address(*link));
+    return nullptr;
+  }
+  if (counter != size) {
+    // kept: the counted number stands under the label ListSize.
+    LOG_ERROR_AS(site,
+                 "Corrupt List: Either the list's size doesn't match the number of entries. ListSize:%d Counted:%d",
+                 counter, size);
+    return nullptr;
+  }
+  return link;
 }
 
-// The checks that both additions share; only their words for a type mismatch differ.
-bool accepts(const site_t &site, const ll_list_t *list, const ll_entry_t *new_entry) {
-  if (!is_sound(HERE_AS(site), list)) return false;
-  if (new_entry == nullptr) {
-    LOG_ERROR_AS(site, "\"new_entry\" parameter is NULL. new_entry:%p", address(new_entry));
-    return false;
+// What every operation on entries asks of its list; answers as verified_end().
+ll_entry_t *const *sound_end(const site_t &site, const ll_list_t *list) {
+  if (list == nullptr) {
+    LOG_ERROR_AS(site, "\"list\" parameter is NULL. list:%p", address(list));
+    return nullptr;
   }
-  return true;
+  ll_entry_t *const *const end = verified_end(list);
+  if (end == nullptr) LOG_BUG_AS(site, "List failed integrity test.%s", "");
+  return end;
+}
+
+// The checks that both additions share; only their words for a type mismatch differ. Answers as verified_end().
+ll_entry_t *const *accepting_end(const site_t &site, const ll_list_t *list, const ll_entry_t *new_entry) {
+  ll_entry_t *const *const end = sound_end(site, list);
+  if (end != nullptr && new_entry == nullptr) {
+    LOG_ERROR_AS(site, "\"new_entry\" parameter is NULL. new_entry:%p", address(new_entry));
+    return nullptr;
+  }
+  return end;
 }
 
 void report_range(const site_t &site, i32 index, u32 size) {
@@ -64,10 +132,12 @@ void report_range(const site_t &site, i32 index, u32 size) {
 
 using edid_composer::_calculate_str_checksum;
 using edid_composer::_get_magic_number;
-using edid_composer::accepts;
+using edid_composer::accepting_end;
 using edid_composer::address;
-using edid_composer::is_sound;
+using edid_composer::create_entry;
 using edid_composer::report_range;
+using edid_composer::sound_end;
+using edid_composer::verified_end;
 
 bool ll_init(ll_list_t *list, const char *type) {
   if (list == nullptr) {
@@ -87,7 +157,7 @@ bool ll_init(ll_list_t *list, const char *type) {
   list->head = nullptr;
   list->magic = _get_magic_number(list);
   list->type = _calculate_str_checksum(type);
-  if (!ll_verify_integrity(list)) {
+  if (verified_end(list) == nullptr) {
     LOG_BUG("Failed verifying the integrity of the list.%s", "");
     return false;
   }
@@ -115,56 +185,7 @@ bool ll_verify_list_type(const ll_list_t *list, const char *type) {
 }
 
 bool ll_verify_integrity(const ll_list_t *list) {
-  if (list == nullptr) {
-    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
-    return false;
-  }
-  if (const u32 magic = _get_magic_number(list); list->magic != magic) {
-    // kept: the stored magic stands under the label ExpectedMagic.
-    LOG_ERROR("Corrupt List: List not initialized. Ptr:%p ExpectedMagic:%d Magic:%d Size:%d Head:%p ", address(list),
-              list->magic, magic, list->size, address(list->head));
-    return false;
-  }
-  if (list->head == nullptr) {
-    if (list->size == 0) return true;
-    LOG_ERROR("Corrupt List: The list's head is NULL, but the size isn't zero. Size:%d", list->size);
-    return false;
-  }
-  if (list->size == 0) {
-    LOG_ERROR("Corrupt List: The list's size is zero, but the head isn't NULL. HeadPtr:%p", address(list->head));
-    return false;
-  }
-
-  const auto size = static_cast<i32>(list->size);
-  i32 counter = 0;
-  const ll_entry_t *entry = list->head;
-  do {
-    if (entry->list == nullptr) {
-      LOG_BUG("Corrupt List: An entry's list attribute is set to NULL. Ptr:%p", address(entry->list));
-      return false;
-    }
-    if (entry->type != list->type) {
-      LOG_BUG("Corrupt List: An entry's type does not match the lists. Count:%d", counter);
-      return false;
-    }
-    ++counter;
-    entry = entry->next;
-  } while (counter < size && entry != nullptr);
-
-  if (entry != nullptr) {
-    LOG_ERROR(
-        "Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d "
-        "NextPtr=%p",
-        counter, size, address(entry));
-    return false;
-  }
-  if (counter != size) {
-    // kept: the counted number stands under the label ListSize.
-    LOG_ERROR("Corrupt List: Either the list's size doesn't match the number of entries. ListSize:%d Counted:%d",
-              counter, size);
-    return false;
-  }
-  return true;
+  return verified_end(list) != nullptr;
 }
 
 i32 ll_size(const ll_list_t *list) {
@@ -172,7 +193,7 @@ i32 ll_size(const ll_list_t *list) {
     LOG_ERROR("list ptr is NULL.%s", "");
     return 0;
   }
-  if (!ll_verify_integrity(list)) {
+  if (verified_end(list) == nullptr) {
     LOG_BUG("Failed integrity test. list:%p", address(list));
     return 0;
   }
@@ -196,24 +217,7 @@ bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type
     LOG_ERROR("\"type\" pointer is NULL. type:%p", address(type));
     return false;
   }
-  *entry = nullptr;
-  *data = nullptr;
-
-  auto *const created = static_cast<ll_entry_t *>(std::calloc(1, sizeof(ll_entry_t)));
-  if (created == nullptr) {
-    LOG_BUG("calloc failed to allocate memory for the entry. ptr:%p", address(entry));
-    return false;
-  }
-  created->data = std::calloc(1, static_cast<std::size_t>(size));
-  if (created->data == nullptr) {
-    LOG_BUG("calloc failed to allocate memory for the data storage. ptr:%p", address(data));
-    std::free(created);
-    return false;
-  }
-  created->type = _calculate_str_checksum(type);
-  *entry = created;
-  *data = created->data;
-  return true;
+  return create_entry(size, entry, data, _calculate_str_checksum(type));
 }
 
 bool ll_delete_entry(ll_entry_t *delete_entry) {
@@ -230,7 +234,7 @@ bool ll_delete_entry(ll_entry_t *delete_entry) {
 }
 
 bool ll_delete_entry_at(ll_list_t *list, u32 index) {
-  if (!is_sound(HERE, list)) return false;
+  if (sound_end(HERE, list) == nullptr) return false;
   if (index >= list->size) {
     report_range(HERE, static_cast<i32>(index), list->size);
     return false;
@@ -247,7 +251,7 @@ bool ll_delete_entry_at(ll_list_t *list, u32 index) {
     return false;
   }
   --list->size;
-  if (!ll_verify_integrity(list)) {
+  if (verified_end(list) == nullptr) {
     LOG_BUG("List failed the integrity check. list:%p", address(list));
     return false;
   }
@@ -255,23 +259,22 @@ bool ll_delete_entry_at(ll_list_t *list, u32 index) {
 }
 
 bool ll_add_entry_to_back(ll_list_t *list, ll_entry_t *new_entry) {
-  if (!accepts(HERE, list, new_entry)) return false;
+  ll_entry_t *const *const end = accepting_end(HERE, list, new_entry);
+  if (end == nullptr) return false;
   if (list->type != new_entry->type) {
     LOG_BUG("This entry represents a different type and cannot be added to this list. List:0x%08X Entry:0x%08X",
             list->type, new_entry->type);
     return false;
   }
-  ll_entry_t **link = &list->head;
-  while (*link != nullptr)
-    link = &(*link)->next;
-  *link = new_entry;
+  // The list and its entries are the caller's to change.
+  *const_cast<ll_entry_t **>(end) = new_entry;
   new_entry->list = list;
   ++list->size;
   return true;
 }
 
 bool ll_add_entry_to_front(ll_list_t *list, ll_entry_t *new_entry) {
-  if (!accepts(HERE, list, new_entry)) return false;
+  if (accepting_end(HERE, list, new_entry) == nullptr) return false;
   if (list->type != new_entry->type) {
     // kept: "tothis".
     LOG_BUG("This entry represents a different type and cannot be added tothis list. List:0x%08X Entry:0x%08X",
@@ -291,7 +294,7 @@ bool ll_entry_at(const ll_list_t *list, i32 index, void **entry_data) {
     return false;
   }
   *entry_data = nullptr;
-  if (!is_sound(HERE, list)) return false;
+  if (sound_end(HERE, list) == nullptr) return false;
   if (index < 0 || index >= static_cast<i32>(list->size)) {
     report_range(HERE, index, list->size);
     return false;
@@ -308,7 +311,7 @@ bool ll_delete_list(ll_list_t *list) {
     LOG_ERROR("list ptr is NULL.%s", "");
     return false;
   }
-  if (!ll_verify_integrity(list)) {
+  if (verified_end(list) == nullptr) {
     LOG_BUG("Failed verifying integrity of the list. list:%p", address(list));
     return false;
   }
@@ -337,11 +340,11 @@ bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size) {
     LOG_ERROR("\"dst_list\" parameter is NULL. dst_list:%p", address(dst_list));
     return false;
   }
-  if (!ll_verify_integrity(src_list)) {
+  if (verified_end(src_list) == nullptr) {
     LOG_BUG("Source list failed integrity test.%s", "");
     return false;
   }
-  if (!ll_verify_integrity(dst_list)) {
+  if (verified_end(dst_list) == nullptr) {
     LOG_BUG("Destination list failed integrity test.%s", "");
     return false;
   }

@@ -1,4 +1,4 @@
-// What the list derives its checks from.
+// What the list derives its checks from, and the making of entries whose tag is known.
 #pragma once
 
 #include "edid_composer.h"
@@ -9,6 +9,18 @@ namespace edid_composer {
 u32 _get_magic_number(const ll_list_t *list);
 
 /// The tag of a type name: its bytes, sign-extended, XORed together at shifts of 0, 8, 16, 24, 0, ...
-u32 _calculate_str_checksum(const char *name);
+constexpr u32 _calculate_str_checksum(const char *name) {
+  u32 tag = 0;
+  u32 shift = 0;
+  for (; *name != '\0'; ++name) {
+    const auto extended = static_cast<u32>(i32{static_cast<signed char>(*name)});
+    tag ^= extended << shift;
+    shift = (shift + 8) % 32;
+  }
+  return tag;
+}
+
+/// ll_create_entry, in whose name it reports, for arguments that are known to be valid.
+bool create_entry(i32 size, ll_entry_t **entry, void **data, u32 tag);
 
 }  // namespace edid_composer

@@ -13,11 +13,11 @@
 
 namespace edid_composer {
 
-/// How an operation words the three failures.
+/// How an operation words the three failures. An entry refers to its texts, which outlive it.
 struct new_entry_texts_t {
-  const char *creation_failed;
-  const char *addition_failed;
-  const char *deletion_failed;
+  char creation_failed[28];
+  char addition_failed[46];
+  char deletion_failed[30];
 };
 
 /// The wording of most operations, also of some that add to the front.
@@ -27,7 +27,7 @@ inline constexpr new_entry_texts_t new_entry_texts{
 /// An entry that is in no list yet, whatever its element type.
 class untyped_new_entry_t {
  public:
-  untyped_new_entry_t(const site_t &site, const new_entry_texts_t &texts, i32 size, const char *type_name);
+  untyped_new_entry_t(const site_t &site, const new_entry_texts_t &texts, i32 size, u32 tag);
   untyped_new_entry_t(const untyped_new_entry_t &) = delete;
   untyped_new_entry_t &operator=(const untyped_new_entry_t &) = delete;
 
@@ -47,7 +47,7 @@ class untyped_new_entry_t {
   bool settle(bool added);
 
   site_t site_;
-  new_entry_texts_t texts_;
+  const new_entry_texts_t &texts_;
   ll_entry_t *entry_ = nullptr;
   void *payload_ = nullptr;
 };
@@ -57,7 +57,7 @@ template <typename record_t>
 class new_entry_t : public untyped_new_entry_t {
  public:
   explicit new_entry_t(const site_t &site, const new_entry_texts_t &texts = new_entry_texts)
-      : untyped_new_entry_t(site, texts, static_cast<i32>(sizeof(record_t)), element_type_name<record_t>) {}
+      : untyped_new_entry_t(site, texts, static_cast<i32>(sizeof(record_t)), element_tag<record_t>) {}
 
   record_t &operator*() const { return *static_cast<record_t *>(payload()); }
   record_t *operator->() const { return static_cast<record_t *>(payload()); }

@@ -10,15 +10,7 @@
 namespace edid_composer {
 namespace {
 
-/// The full path of a key, cut to what a path may be long.
-class path_t {
- public:
-  explicit path_t(const char *key) { std::snprintf(text_, sizeof text_, "%s%s", CONFIGURATION_DOMAIN, key); }
-  const char *text() const { return text_; }
-
- private:
-  char text_[256];
-};
+using path_t = configuration_path_t<256>;
 
 /// What both number getters do once the limits are known to be consistent. An unsigned number is compared as such and
 /// printed as a signed one.

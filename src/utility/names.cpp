@@ -7,9 +7,11 @@ namespace {
 
 constexpr const char *unknown_value = "Unknown Value";
 
-constexpr const char *aspect_names[] = {"1:1", "4:3", "5:4", "16:9"};
+// The tables hold their names, as wide as the longest: pointers to them would have to be relocated at each load.
 
-constexpr const char *audio_names[] = {
+constexpr char aspect_names[][5] = {"1:1", "4:3", "5:4", "16:9"};
+
+constexpr char audio_names[][21] = {
     "AUDIO_TYPE_INVALID",
     "PCM",
     "AC3",
@@ -31,17 +33,17 @@ constexpr const char *audio_names[] = {
     "MPEG SURROUND",
 };
 
-constexpr const char *hdmi_vic_names[] = {"3840x2160p30Hz", "3840x2160p25Hz", "3840x2160p24Hz", "4096x2160p24Hz"};
+constexpr char hdmi_vic_names[][15] = {"3840x2160p30Hz", "3840x2160p25Hz", "3840x2160p24Hz", "4096x2160p24Hz"};
 
 // Bit 0 first.
-constexpr const char *est_timing_1_names[] = {"800x600p60", "800x600p56", "640x480p75", "640x480p72",
-                                              "640x480p67", "640x480p60", "720x400p88", "720x400p70"};
-constexpr const char *est_timing_2_names[] = {"1280x1024p75", "1024x768p75", "1024x768p70", "1024x768p60",
-                                              "1024x768p87",  "832x624p75",  "800x600p75",  "800x600p72"};
+constexpr char est_timing_1_names[][11] = {"800x600p60", "800x600p56", "640x480p75", "640x480p72",
+                                           "640x480p67", "640x480p60", "720x400p88", "720x400p70"};
+constexpr char est_timing_2_names[][13] = {"1280x1024p75", "1024x768p75", "1024x768p70", "1024x768p60",
+                                           "1024x768p87",  "832x624p75",  "800x600p75",  "800x600p72"};
 constexpr u32 man_timing_1152x870p75 = 1U << 7;
 
 // VIC 1 first.
-constexpr const char *vic_names[] = {
+constexpr char vic_names[][24] = {
     "640x480p60Hz4x3",        "720x480p60Hz4x3",         "720x480p60Hz16x9",       "1280x720p60Hz16x9",
     "1920x1080i60Hz16x9",     "720(1440)x480i60Hz4x3",   "720(1440)x480i60Hz16x9", "720(1440)x240p60Hz4x3",
     "720(1440)x240p60Hz16x9", "2880x480i60Hz4x3",        "2880x480i60Hz16x9",      "2880x240p60Hz4x3",
@@ -63,14 +65,14 @@ constexpr const char *vic_names[] = {
 };
 
 /// The name at @p index, which may lie anywhere.
-template <u32 size>
-constexpr const char *name_at(const char *const (&names)[size], u32 index, const char *otherwise) {
+template <u32 size, u32 width>
+constexpr const char *name_at(const char (&names)[size][width], u32 index, const char *otherwise) {
   return index < size ? names[index] : otherwise;
 }
 
 /// The name of a value in which one bit is set.
-template <u32 size>
-constexpr const char *name_of_bit(const char *const (&names)[size], u32 value) {
+template <u32 size, u32 width>
+constexpr const char *name_of_bit(const char (&names)[size][width], u32 value) {
   for (u32 bit = 0; bit < size; ++bit) {
     if (value == 1U << bit) return names[bit];
   }

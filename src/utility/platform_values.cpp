@@ -6,27 +6,25 @@
 namespace edid_composer {
 namespace {
 
-/// The six lists of a record, in the order in which they are initialised and deleted.
+/// The six lists of a record, in the order in which they are initialised and deleted, and their names in reports.
 struct platform_list_t {
   ll_list_t platform_values_t::*list;
   const char *element_type;
-  const char *initialisation_failed;
-  const char *deletion_failed;
+  char initialised_name[24];
+  char removed_name[24];
 };
 
 constexpr platform_list_t platform_lists[] = {
-    {&platform_values_t::audio_list, element_type_name<i32>, "Failed to initialize the platform values audio_list",
-     "Failed removing platform audio_list"},
-    {&platform_values_t::video_50_priority, element_type_name<short_video_desc_t>,
-     "Failed to initialize the platform values video_50_priority", "Failed removing platform video_50_priority"},
-    {&platform_values_t::video_50_additional, element_type_name<short_video_desc_t>,
-     "Failed to initialize the platform values video_50_additional", "Failed removing platform video_50_additional"},
-    {&platform_values_t::video_60_priority, element_type_name<short_video_desc_t>,
-     "Failed to initialize the platform values video_60_priority", "Failed removing platform video_60_priority"},
-    {&platform_values_t::video_60_additional, element_type_name<short_video_desc_t>,
-     "Failed to initialize the platform values video_60_additional", "Failed removing platform video_60_additional"},
-    {&platform_values_t::std_timings, element_type_name<std_timing_t>,
-     "Failed to initialize the platform values standard timings", "Failed removing platform values standard timings"},
+    {&platform_values_t::audio_list, element_type_name<i32>, "audio_list", "audio_list"},
+    {&platform_values_t::video_50_priority, element_type_name<short_video_desc_t>, "video_50_priority",
+     "video_50_priority"},
+    {&platform_values_t::video_50_additional, element_type_name<short_video_desc_t>, "video_50_additional",
+     "video_50_additional"},
+    {&platform_values_t::video_60_priority, element_type_name<short_video_desc_t>, "video_60_priority",
+     "video_60_priority"},
+    {&platform_values_t::video_60_additional, element_type_name<short_video_desc_t>, "video_60_additional",
+     "video_60_additional"},
+    {&platform_values_t::std_timings, element_type_name<std_timing_t>, "standard timings", "values standard timings"},
 };
 
 }  // namespace
@@ -43,7 +41,7 @@ bool platform_values_init(platform_values_t *values) {
   std::memset(values, 0, sizeof *values);
   for (const auto &row : platform_lists) {
     if (!ll_init(&(values->*row.list), row.element_type)) {
-      LOG_BUG("%s", row.initialisation_failed);
+      LOG_BUG("Failed to initialize the platform values %s", row.initialised_name);
       return false;
     }
   }
@@ -57,7 +55,7 @@ bool platform_values_destroy(platform_values_t *values) {
   }
   for (const auto &row : platform_lists) {
     if (!ll_delete_list(&(values->*row.list))) {
-      LOG_BUG("%s", row.deletion_failed);
+      LOG_BUG("Failed removing platform %s", row.removed_name);
       return false;
     }
   }

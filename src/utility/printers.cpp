@@ -10,7 +10,7 @@ namespace {
 
 struct bit_name_t {
   u32 bit;
-  const char *name;
+  char name[12];
 };
 
 constexpr bit_name_t sample_rate_names[] = {

@@ -1,6 +1,7 @@
 #include <iterator>
 
 #include "diagnostics.h"
+#include "utility/timing_lines.h"
 #include "utility/vic_timings.h"
 
 namespace edid_composer {
@@ -34,18 +35,14 @@ constexpr aspect_ratio_t aspect_ratios[] = {{1, 1}, {4, 3}, {5, 4}, {16, 9}};
 constexpr u32 aspect_4_3 = 1;
 constexpr u32 aspect_16_9 = 3;
 
-u32 refresh_rate(const detailed_timing_t &timing) {
-  return calculate_refresh_rate(timing.pixel_clock, timing.h_active, timing.h_blanking, timing.v_active,
-                                timing.v_blanking);
-}
-
-bool same_raster(const detailed_timing_t &a, const detailed_timing_t &b) {
-  return a.pixel_clock == b.pixel_clock && a.progressive == b.progressive && a.h_active == b.h_active &&
-         a.h_blanking == b.h_blanking && a.v_active == b.v_active;
+bool same_raster(const vic_timing_t &row, const detailed_timing_t &timing) {
+  return row.pixel_clock() == timing.pixel_clock && row.progressive == timing.progressive &&
+         row.horizontal.active == timing.h_active && row.horizontal.blanking == timing.h_blanking &&
+         row.vertical.active == timing.v_active;
 }
 
 bool row_aspect(const site_t &site, u32 index, u32 *ratio) {
-  const detailed_timing_t &row = g_vic_dtd[index].timing;
+  const detailed_timing_t row = timing_of(g_vic_dtd[index]);
   if (row.h_image_size == 0 || row.v_image_size == 0) {
     LOG_BUG_AS(site,
                "DTD table timing has a zeroed vertical/horizontal image size. index:%d h_image_size:%d v_image_size:%d",
@@ -80,35 +77,20 @@ bool timing_aspect(const site_t &site, const edid_t &edid, const detailed_timing
 
 /// For a caller that traces.
 void trace_unmatched(const site_t &site, const detailed_timing_t &timing) {
-  constexpr auto inches = [](u32 millimetres) { return millimetres * 5 / 127; };
-  log_trace(HERE_AS(site), "Unable to match Detailed Timing Description.");
-  log_trace(HERE_AS(site), "\tPixel Clock:     %d", timing.pixel_clock);
-  log_trace(HERE_AS(site), "\tRefresh Rate:    %d", refresh_rate(timing));
-  log_trace(HERE_AS(site), "\tH Active:        %d", timing.h_active);
-  log_trace(HERE_AS(site), "\tH Blanking:      %d", timing.h_blanking);
-  log_trace(HERE_AS(site), "\tV Active:        %d", timing.v_active);
-  log_trace(HERE_AS(site), "\tV Blanking:      %d", timing.v_blanking);
-  log_trace(HERE_AS(site), "\tH sync offset:   %d", timing.h_sync_offset);
-  log_trace(HERE_AS(site), "\tH sync width:    %d", timing.h_sync_width);
-  log_trace(HERE_AS(site), "\tV sync offset:   %d", timing.v_sync_offset);
-  log_trace(HERE_AS(site), "\tV sync width:    %d", timing.v_sync_width);
-  log_trace(HERE_AS(site), "\tH image size:    %d mm (%d in)", timing.h_image_size, inches(timing.h_image_size));
-  log_trace(HERE_AS(site), "\tV image size:    %d mm (%d in)", timing.v_image_size, inches(timing.v_image_size));
-  log_trace(HERE_AS(site), "\tH Border:        %d", timing.h_border);
-  log_trace(HERE_AS(site), "\tV Border:        %d", timing.v_border);
-  log_trace(HERE_AS(site), "\tScan:            %s", timing.progressive != 0 ? "Progressive" : "Interlaced");
-  log_trace(HERE_AS(site), "\tStereo:          %s", timing.stereo != 0 ? "Yes" : "No");
-  log_trace(HERE_AS(site), "\tH sync:          %s", timing.h_sync_positive != 0 ? "Positive" : "Negative");
-  log_trace(HERE_AS(site), "\tV sync:          %s", timing.v_sync_positive != 0 ? "Positive" : "Negative");
+  LOG_TRACE_AS(site, "Unable to match Detailed Timing Description.");
+  for (const auto &line : timing_lines_t(timing))
+    LOG_TRACE_AS(site, "%s", line);
 }
 
-bool shows(const detailed_timing_t &row, const video_mode_t &mode) {
+bool shows(const vic_timing_t &row, const video_mode_t &mode) {
   const bool progressive = mode.interlaced != 1;
-  const u32 frame_lines = row.progressive != 0 ? row.v_active : row.v_active * 2;
+  const u32 frame_lines = row.progressive != 0 ? row.vertical.active : row.vertical.active * 2U;
+  const u32 line = row.horizontal.active;
   // Half a line finds the rows of 1440 pixels that repeat each of 720.
-  const bool same_width = mode.width == row.h_active || mode.width == row.h_active / 2;
+  const bool same_width = mode.width == line || mode.width == line / 2;
   return (row.progressive != 0) == progressive && frame_lines == mode.height && same_width &&
-         refresh_rate(row) == mode.refresh;
+         calculate_refresh_rate(row.pixel_clock(), line, row.horizontal.blanking, row.vertical.active,
+                                row.vertical.blanking) == mode.refresh;
 }
 
 /// The mode that a standard timing is looked up as; false when VICs don't have its aspect ratio.
@@ -164,7 +146,7 @@ u8 convert_vic_to_dtd(u32 vic, detailed_timing_t *timing) {
     LOG_WARNING("Invalid vic requested for conversion to a DTD. Requested VIC:%d Range:%d-%d", vic, 0, g_vic_dtd_size);
     return 0;
   }
-  *timing = g_vic_dtd[vic - 1].timing;
+  *timing = timing_of(g_vic_dtd[vic - 1]);
   return 1;
 }
 
@@ -173,7 +155,7 @@ u8 convert_dtd_to_vic(const edid_t *edid, const detailed_timing_t *timing, u32 *
   for (u32 index = 0; index < g_vic_dtd_size; ++index) {
     u32 row_ratio = 0;
     u32 timing_ratio = 0;
-    if (same_raster(g_vic_dtd[index].timing, *timing) && row_aspect(HERE, index, &row_ratio) &&
+    if (same_raster(g_vic_dtd[index], *timing) && row_aspect(HERE, index, &row_ratio) &&
         timing_aspect(HERE, *edid, *timing, &timing_ratio) && row_ratio == timing_ratio) {
       *vic = g_vic_dtd[index].vic;
       return 1;
@@ -195,7 +177,7 @@ u8 mode_to_vic(const video_mode_t *mode, u32 *vic) {
   LOG_TRACE("\tMode is %dx%d%s%u. Attempting to find a match.", mode->width, mode->height,
             mode->interlaced == 1 ? "i" : "p", mode->refresh);
   for (const auto &row : g_vic_dtd) {
-    if (shows(row.timing, *mode)) {
+    if (shows(row, *mode)) {
       *vic = row.vic;
       return 1;
     }

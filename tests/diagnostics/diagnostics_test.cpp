@@ -19,9 +19,11 @@ using test_support::raw_output_of;
 constexpr site_t site{"linked_list", "ll_size", 120};
 
 TEST(Diagnostics, PrefixErrorsWarningsAndBugsWithModuleLineAndFunction) {
-  EXPECT_EQ(raw_output_of([] { log_error(site, "a %d %s", 1, "b"); }), "linked_list:120:ll_size() ERROR: a 1 b\n");
-  EXPECT_EQ(raw_output_of([] { log_warning(site, "a %d %s", 1, "b"); }), "linked_list:120:ll_size() WARNING: a 1 b\n");
-  EXPECT_EQ(raw_output_of([] { log_bug(site, "a %d %s", 1, "b"); }), "linked_list:120:ll_size() BUG: a 1 b\n");
+  EXPECT_EQ(raw_output_of([] { log_error(PIECES(site), "a %d %s", 1, "b"); }),
+            "linked_list:120:ll_size() ERROR: a 1 b\n");
+  EXPECT_EQ(raw_output_of([] { log_warning(PIECES(site), "a %d %s", 1, "b"); }),
+            "linked_list:120:ll_size() WARNING: a 1 b\n");
+  EXPECT_EQ(raw_output_of([] { log_bug(PIECES(site), "a %d %s", 1, "b"); }), "linked_list:120:ll_size() BUG: a 1 b\n");
 }
 
 TEST(Diagnostics, PutTheSiteOfATraceBehindItsMessage) {
@@ -29,13 +31,14 @@ TEST(Diagnostics, PutTheSiteOfATraceBehindItsMessage) {
 }
 
 TEST(Diagnostics, KeepAMessagesOwnNewlineAndAddTheLines) {
-  EXPECT_EQ(raw_output_of([] { log_error(site, "a\n"); }), "linked_list:120:ll_size() ERROR: a\n\n");
+  EXPECT_EQ(raw_output_of([] { log_error(PIECES(site), "a\n"); }), "linked_list:120:ll_size() ERROR: a\n\n");
   EXPECT_EQ(raw_output_of([] { log_trace(site, "a\n"); }), "a\n \t\t\tll_size():120\n");
 }
 
 TEST(Diagnostics, WriteMessagesOfAnyLength) {
   const std::string text(100000, 'x');
-  EXPECT_EQ(raw_output_of([&] { log_bug(site, "%s", text.c_str()); }), "linked_list:120:ll_size() BUG: " + text + "\n");
+  EXPECT_EQ(raw_output_of([&] { log_bug(PIECES(site), "%s", text.c_str()); }),
+            "linked_list:120:ll_size() BUG: " + text + "\n");
 }
 
 TEST(Diagnostics, NameTheReportingFunctionAndItsModule) {

@@ -58,7 +58,13 @@ std::filesystem::path golden_directory() {
   return GOLDEN_DIRECTORY;
 }
 
-composition_t composed(const golden_case_t &golden_case, bool tracing) {
+namespace {
+
+/// Composes from a sink into the buffer of a composition.
+using composer_t = bool (*)(const std::vector<u8> &sink, std::vector<u8> *edid, const compose_cfg_t *settings,
+                            void *context);
+
+composition_t composed_by(composer_t composer, void *context, const golden_case_t &golden_case, bool tracing) {
   constexpr u32 edid_size = 256;
   load_platform(golden_case.platform);
   const std::vector<u8> sink =
@@ -68,12 +74,35 @@ composition_t composed(const golden_case_t &golden_case, bool tracing) {
   const compose_cfg_t settings = settings_of(golden_case, &composition.address_offset);
 
   bool done = false;
-  const auto compose = [&] {
-    done = compose_edid(sink.data(), static_cast<u32>(sink.size()), composition.edid.data(), edid_size, &settings);
-  };
+  const auto compose = [&] { done = composer(sink, &composition.edid, &settings, context); };
   composition.log = tracing ? test_support::traced_output_of(compose) : test_support::output_of(compose);
   if (!done) throw std::runtime_error(golden_case.name() + ": the library refused\n" + composition.log);
   return composition;
+}
+
+u32 size_of(const std::vector<u8> &bytes) {
+  return static_cast<u32>(bytes.size());
+}
+
+}  // namespace
+
+composition_t composed(const golden_case_t &golden_case, bool tracing) {
+  const composer_t composer = [](const std::vector<u8> &sink, std::vector<u8> *edid, const compose_cfg_t *settings,
+                                 void *) {
+    return compose_edid(sink.data(), size_of(sink), edid->data(), size_of(*edid), settings);
+  };
+  return composed_by(composer, nullptr, golden_case, tracing);
+}
+
+composition_t observed(const golden_case_t &golden_case, bool tracing, int *decisions) {
+  const composer_t composer = [](const std::vector<u8> &sink, std::vector<u8> *edid, const compose_cfg_t *settings,
+                                 void *context) {
+    const compose_observer_t count = [](const compose_decision_t *, void *number) { ++*static_cast<int *>(number); };
+    return compose_edid_observed(sink.data(), size_of(sink), edid->data(), size_of(*edid), settings, nullptr, count,
+                                 context);
+  };
+  *decisions = 0;
+  return composed_by(composer, decisions, golden_case, tracing);
 }
 
 std::map<std::string, std::string> golden_texts(const golden_case_t &golden_case) {

@@ -26,6 +26,9 @@ struct composition_t {
 /// Composes the case. Throws std::runtime_error when a file cannot be read or the library refuses.
 composition_t composed(const golden_case_t &golden_case, bool tracing);
 
+/// The same, with somebody who hears of the decisions; @p decisions receives their number.
+composition_t observed(const golden_case_t &golden_case, bool tracing, int *decisions);
+
 /// The texts that are kept of a case, by the names of their files.
 std::map<std::string, std::string> golden_texts(const golden_case_t &golden_case);
 

@@ -54,7 +54,7 @@ TEST_P(Goldens, AreWhatIsComposedNow) {
 
 TEST_P(Goldens, SpellTheComposedBytesForTheProgramsReader) {
   const auto file = golden::golden_directory() / (GetParam().name() + ".hex");
-  EXPECT_EQ(hex_lines(edid_cli::read_edid(file.string())), hex_lines(golden::composed(GetParam(), false).edid));
+  EXPECT_EQ(hex_lines(edid_cli::read_edid_file(file.string())), hex_lines(golden::composed(GetParam(), false).edid));
 }
 
 TEST_P(Goldens, DoNotDependOnTracing) {
@@ -70,6 +70,18 @@ TEST_P(Goldens, DoNotDependOnTracing) {
     found = traced.log.find(line, found);
     ASSERT_NE(found, std::string::npos) << line;
     found += line.size();
+  }
+}
+
+TEST_P(Goldens, DoNotDependOnAnObserver) {
+  for (const bool tracing : {false, true}) {
+    const auto alone = golden::composed(GetParam(), tracing);
+    int decisions = 0;
+    const auto observed = golden::observed(GetParam(), tracing, &decisions);
+    EXPECT_EQ(hex_lines(observed.edid), hex_lines(alone.edid));
+    EXPECT_EQ(observed.address_offset, alone.address_offset);
+    EXPECT_EQ(golden::first_difference(alone.log, observed.log), "");
+    EXPECT_GT(decisions, 20);
   }
 }
 

@@ -91,6 +91,10 @@ struct addition_t {
   const char *mismatch;
 };
 
+std::ostream &operator<<(std::ostream &out, const addition_t &addition) {
+  return out << addition.name;
+}
+
 class LinkedListAdd : public testing::TestWithParam<addition_t> {};
 
 TEST_P(LinkedListAdd, TakesAnEntryIntoAnEmptyList) {

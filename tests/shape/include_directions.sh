@@ -57,7 +57,7 @@ internal() {
 while read -r file; do
   case $file in
     tests/support/* | tests/end_to_end/* | tests/golden/* | tests/host/* | tests/shape/*) ;;
-    tests/*) continue ;;
+    tests/* | bench/*) continue ;;
   esac
   for included in $(includes "$file"); do
     ! internal "$file" "$included" || complain "$file includes the internal header $included"

@@ -190,6 +190,19 @@ OFFSET(platform_values_t, established_timings_2, 300);
 OFFSET(platform_values_t, manufacturer_timings, 304);
 OFFSET(platform_values_t, std_timings, 312);
 
+SIZE(compose_decision_t, 56);
+OFFSET(compose_decision_t, size, 0);
+OFFSET(compose_decision_t, subject, 4);
+OFFSET(compose_decision_t, code, 8);
+OFFSET(compose_decision_t, verdict, 12);
+OFFSET(compose_decision_t, reason, 16);
+OFFSET(compose_decision_t, origins, 20);
+OFFSET(compose_decision_t, sink_index, 24);
+OFFSET(compose_decision_t, priority_index, 28);
+OFFSET(compose_decision_t, addition_index, 32);
+OFFSET(compose_decision_t, position, 36);
+OFFSET(compose_decision_t, value, 40);
+
 #undef SIZE
 #undef OFFSET
 

@@ -33,6 +33,10 @@ struct formatter_t {
   }
 };
 
+std::ostream &operator<<(std::ostream &out, const formatter_t &formatter) {
+  return out << formatter.name;
+}
+
 class MaskFormatter : public testing::TestWithParam<formatter_t> {};
 
 TEST_P(MaskFormatter, NamesAllBitsInOrderEachFollowedByABlank) {

@@ -100,14 +100,14 @@ TEST_F(EdidInput, AFileWithoutEndIsRefused) {
   expect_bad_input(run_cli({"print", "/dev/zero"}), "/dev/zero: larger than 1 MiB");
 }
 
-TEST_F(EdidInput, BadHexTextIsNamedWithItsLine) {
-  expect_bad_input(refused("00 ff\n# comment\n00 zz ff\n"), edid_path() + ":3: \"zz\" is not hexadecimal");
-  expect_bad_input(refused("00 ff f\n"), edid_path() + ":1: \"f\" has an odd number of hexadecimal digits");
-  expect_bad_input(refused("00\n0x\n"), edid_path() + ":2: \"0x\" is not hexadecimal");
-  expect_bad_input(refused("00\n\n0xfff"), edid_path() + ":3: \"0xfff\" has an odd number of hexadecimal digits");
-  expect_bad_input(run_cli({"print", "-"}, "no EDID at all"), "standard input:1: \"no\" is not hexadecimal");
+TEST_F(EdidInput, BadHexTextIsNamedWithItsLineAndColumn) {
+  expect_bad_input(refused("00 ff\n# comment\n00 zz ff\n"), edid_path() + ":3:4: \"zz\" is not hexadecimal");
+  expect_bad_input(refused("00 ff f\n"), edid_path() + ":1:7: \"f\" has an odd number of hexadecimal digits");
+  expect_bad_input(refused("00\n0x\n"), edid_path() + ":2:1: \"0x\" is not hexadecimal");
+  expect_bad_input(refused("00\n\n\t0xfff"), edid_path() + ":3:2: \"0xfff\" has an odd number of hexadecimal digits");
+  expect_bad_input(run_cli({"print", "-"}, "no EDID at all"), "standard input:1:1: \"no\" is not hexadecimal");
   expect_bad_input(refused(std::string(40, 'x')),
-                   edid_path() + ":1: \"" + std::string(32, 'x') + "\" is not hexadecimal");
+                   edid_path() + ":1:1: \"" + std::string(32, 'x') + "\" is not hexadecimal");
 }
 
 }  // namespace

@@ -25,6 +25,19 @@ TEST_F(StandardStreams, StandardOutputCarriesTheBytesAndNothingElse) {
   EXPECT_EQ(result.error, "");
 }
 
+TEST_F(StandardStreams, StandardOutputCarriesHexTextOfSixteenBytesALine) {
+  const std::string bytes = composed({"--sink", sample_sink("tv_4k")});
+  std::string expected;
+  for (std::size_t offset = 0; offset < bytes.size(); offset += 16) {
+    expected += hex_of(bytes.substr(offset, 16)) + "\n";
+  }
+  const process_result_t result = run_cli({"compose", "--sink", sample_sink("tv_4k"), "-o", "-", "--format", "hex"});
+  EXPECT_EQ(result.status, 0);
+  EXPECT_EQ(result.output, expected);
+  EXPECT_EQ(composed({"--sink", sample_sink("tv_4k"), "--format", "hex"}), expected);
+  EXPECT_EQ(composed({"--sink", sample_sink("tv_4k"), "--format", "raw"}), bytes);
+}
+
 TEST_F(StandardStreams, TheLibrarysOutputMovesToStandardErrorThen) {
   const std::string expected = composed({"--debug"});
   const process_result_t result = run_cli({"compose", "--debug", "-o", "-"});

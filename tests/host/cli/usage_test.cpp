@@ -37,11 +37,15 @@ const std::string a_mode = "a mode such as 1920x1080p60 or 1920x1080i50";
 const std::string a_mask = "a number of 32 bits, decimal or 0x hexadecimal";
 const std::string latencies = "four latencies from 0 to 65535 ms, separated by commas";
 const std::string a_3d_mode = "off, sink or on";
+const std::string jobs = "a number of jobs from 1 to 256";
 
 INSTANTIATE_TEST_SUITE_P(
     Commands, WrongUsage,
     testing::Values(
-        usage_case_t{"NoCommand", {}, "no command given: compose, print, audio-mask or platform (try --help)"},
+        usage_case_t{"NoCommand",
+                     {},
+                     "no command given: compose, explain, print, diff, sinks, check-platform, audio-mask or platform "
+                     "(try --help)"},
         usage_case_t{"UnknownCommand", {"compos"}, "The following argument was not expected: compos (try --help)"},
         usage_case_t{"ComposeWithoutOutput", {"compose"}, "--output is required (try --help)"},
         usage_case_t{"OutputWithoutName", {"compose", "-o"}, "--output: 1 required FILE missing (try --help)"},
@@ -60,31 +64,46 @@ INSTANTIATE_TEST_SUITE_P(
         usage_case_t{
             "PrintWithTwoFiles", {"print", "a", "b"}, "The following argument was not expected: b (try --help)"},
         usage_case_t{"AudioMaskWithoutMask", {"audio-mask"}, "MASK is required (try --help)"},
+        usage_case_t{"RangeOfPortsThatAreNone",
+                     {"compose", "-o", nowhere, "--port", "0..15"},
+                     "--port: \"15\" is not a port from 0 to 14"},
+        usage_case_t{
+            "RangeWithoutEnd", {"compose", "-o", nowhere, "--port", "0.."}, "--port: \"\" is not a port from 0 to 14"},
+        usage_case_t{"DiffOfOneFile", {"diff", "a"}, "B is required (try --help)"},
+        usage_case_t{"DiffOfStandardInputTwice", {"diff", "-", "-"}, "A and B cannot both be read from standard input"},
+        usage_case_t{"CheckPlatformWithoutFile", {"check-platform"}, "FILE is required (try --help)"},
+        usage_case_t{"SinksWithArgument", {"sinks", "x"}, "The following argument was not expected: x (try --help)"},
+        usage_case_t{"LogOfOne",
+                     {"compose", "-o", nowhere, "--log"},
+                     "--log goes with several EDIDs: a folder of sinks, or a range of ports"},
         usage_case_t{
             "PlatformWithArgument", {"platform", "x"}, "The following argument was not expected: x (try --help)"}),
     [](const auto &tested) { return tested.param.name; });
 
-INSTANTIATE_TEST_SUITE_P(Values, WrongUsage,
-                         testing::Values(bad_option("PortTooHigh", "--port", "15", a_port),
-                                         bad_option("NegativePort", "--port", "-1", a_port),
-                                         bad_option("PortInWords", "--port", "one", a_port),
-                                         bad_option("EmptyPort", "--port", "", a_port),
-                                         bad_option("ModeWithoutWidth", "--current-mode", "1080p60", a_mode),
-                                         bad_option("ModeWithoutScan", "--current-mode", "1920x1080", a_mode),
-                                         bad_option("ModeWithoutRate", "--current-mode", "1920x1080p", a_mode),
-                                         bad_option("ModeWithFraction", "--current-mode", "1920x1080p59.94", a_mode),
-                                         bad_option("ModeWithUnit", "--current-mode", "1920x1080p60Hz", a_mode),
-                                         bad_option("ModeTooLarge", "--current-mode", "4294967296x1080p60", a_mode),
-                                         bad_option("MaskInWords", "--audio-mask", "all", a_mask),
-                                         bad_option("MaskTooLarge", "--audio-mask", "0x100000000", a_mask),
-                                         bad_option("ThreeLatencies", "--latency", "1,2,3", latencies),
-                                         bad_option("FiveLatencies", "--latency", "1,2,3,4,5", latencies),
-                                         bad_option("EmptyLatency", "--latency", "1,,3,4", latencies),
-                                         bad_option("LatencyTooLarge", "--latency", "1,2,3,65536", latencies),
-                                         bad_option("LatencyWithUnit", "--latency", "1ms,2,3,4", latencies),
-                                         bad_option("Unknown3dMode", "--3d", "yes", a_3d_mode),
-                                         bad_option("Upper3dMode", "--3d", "ON", a_3d_mode)),
-                         [](const auto &tested) { return tested.param.name; });
+INSTANTIATE_TEST_SUITE_P(
+    Values, WrongUsage,
+    testing::Values(bad_option("PortTooHigh", "--port", "15", a_port),
+                    bad_option("NegativePort", "--port", "-1", a_port),
+                    bad_option("PortInWords", "--port", "one", a_port), bad_option("EmptyPort", "--port", "", a_port),
+                    bad_option("RangeDownwards", "--port", "3..1", "a range of ports such as 0..3"),
+                    bad_option("UnknownFormat", "--format", "HEX", "raw or hex"),
+                    bad_option("NoJobs", "--jobs", "0", jobs), bad_option("TooManyJobs", "--jobs", "257", jobs),
+                    bad_option("ModeWithoutWidth", "--current-mode", "1080p60", a_mode),
+                    bad_option("ModeWithoutScan", "--current-mode", "1920x1080", a_mode),
+                    bad_option("ModeWithoutRate", "--current-mode", "1920x1080p", a_mode),
+                    bad_option("ModeWithFraction", "--current-mode", "1920x1080p59.94", a_mode),
+                    bad_option("ModeWithUnit", "--current-mode", "1920x1080p60Hz", a_mode),
+                    bad_option("ModeTooLarge", "--current-mode", "4294967296x1080p60", a_mode),
+                    bad_option("MaskInWords", "--audio-mask", "all", a_mask),
+                    bad_option("MaskTooLarge", "--audio-mask", "0x100000000", a_mask),
+                    bad_option("ThreeLatencies", "--latency", "1,2,3", latencies),
+                    bad_option("FiveLatencies", "--latency", "1,2,3,4,5", latencies),
+                    bad_option("EmptyLatency", "--latency", "1,,3,4", latencies),
+                    bad_option("LatencyTooLarge", "--latency", "1,2,3,65536", latencies),
+                    bad_option("LatencyWithUnit", "--latency", "1ms,2,3,4", latencies),
+                    bad_option("Unknown3dMode", "--3d", "yes", a_3d_mode),
+                    bad_option("Upper3dMode", "--3d", "ON", a_3d_mode)),
+    [](const auto &tested) { return tested.param.name; });
 
 TEST(WrongPlatform, IsNamedWithWhatIsWrong) {
   const temporary_directory_t directory;
@@ -104,26 +123,6 @@ TEST(WrongInput, WritesNoOutputFile) {
   run_cli({"compose", "-o", directory.path("new.bin"), "--sink", "/nonexistent"});
   run_cli({"compose", "-o", directory.path("new.bin"), "--platform", "/nonexistent"});
   EXPECT_TRUE(directory.names().empty());
-}
-
-TEST(Help, ListsTheCommandsOnStandardOutput) {
-  const process_result_t result = run_cli({"--help"});
-  EXPECT_EQ(result.status, 0);
-  EXPECT_EQ(result.error, "");
-  for (const char *command : {"compose", "print", "audio-mask", "platform"}) {
-    EXPECT_THAT(result.output, HasSubstr(std::string("\n  ") + command + " "));
-  }
-}
-
-TEST(Help, ListsTheOptionsOfACommand) {
-  const process_result_t result = run_cli({"compose", "--help"});
-  EXPECT_EQ(result.status, 0);
-  for (const char *option :
-       {"--platform FILE", "--sink FILE", "--port N", "--current-mode MODE", "--audio-mask MASK", "--audio-sink-filter",
-        "--3d off|sink|on", "--latency V,A,IV,IA", "--debug", "-o,--output FILE"}) {
-    EXPECT_THAT(result.output, HasSubstr(std::string("\n  ") + option + " "));
-  }
-  EXPECT_THAT(result.output, HasSubstr("\nUsage: edid-composer compose "));
 }
 
 }  // namespace

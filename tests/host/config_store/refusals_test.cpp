@@ -113,6 +113,14 @@ INSTANTIATE_TEST_SUITE_P(
                     malformed_case_t{"NulByte", std::string("a = 1\n\0b = 2\n", 13), "test.toml:2:"}),
     [](const auto &tested) { return tested.param.name; });
 
+TEST_F(ConfigStore, WhatTheParserTakesForGrantedIsRefusedLikeAnyMistake) {
+  EXPECT_EQ(
+      refusal_of("[=x]\n"),
+      "test.toml:1:2: Error while parsing key: expected bare key starting character or string delimiter, saw '='");
+  EXPECT_EQ(refusal_of("[[=x]]\n").substr(0, 10), "test.toml:");
+  EXPECT_EQ(refusal_of("a = { =1 }\n").substr(0, 10), "test.toml:");
+}
+
 TEST_F(ConfigStore, AFailedLoadLeavesTheTreeAsItWas) {
   ASSERT_TRUE(load("keep = 1\n[list]\nb = 1\na = 2\n"));
   u32 node = 0;

@@ -7,6 +7,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <cstdlib>
 #include <stdexcept>
 
 #include "support/temporary_directory.h"
@@ -27,14 +28,17 @@ void redirect(int descriptor, const std::string &file, int flags) {
                          const std::string &error) {
   redirect(STDIN_FILENO, input, O_RDONLY);
   redirect(STDOUT_FILENO, output, process.output_file ? O_WRONLY : O_WRONLY | O_CREAT);
-  redirect(STDERR_FILENO, error, O_WRONLY | O_CREAT);
+  redirect(STDERR_FILENO, error, process.error_file ? O_WRONLY | O_NOCTTY : O_WRONLY | O_CREAT);
   if (process.file_size_limit) {
-    signal(SIGXFSZ, SIG_IGN);
+    signal(SIGXFSZ, process.dies_of_file_size ? SIG_DFL : SIG_IGN);
     const rlimit limit{*process.file_size_limit, *process.file_size_limit};
     setrlimit(RLIMIT_FSIZE, &limit);
   }
   if (process.creation_mask) {
     umask(*process.creation_mask);
+  }
+  for (const std::string &variable : process.environment) {
+    putenv(const_cast<char *>(variable.c_str()));
   }
   std::vector<char *> arguments{const_cast<char *>(process.program.c_str())};
   for (const std::string &argument : process.arguments) {
@@ -50,7 +54,7 @@ void redirect(int descriptor, const std::string &file, int flags) {
 process_result_t process_t::run() const {
   const temporary_directory_t directory;
   const std::string input_file = directory.write("input", input);
-  const std::string error_path = directory.path("error");
+  const std::string error_path = error_file.value_or(directory.path("error"));
   const std::string output_path = output_file.value_or(directory.path("output"));
 
   const pid_t child = fork();
@@ -66,7 +70,7 @@ process_result_t process_t::run() const {
   process_result_t result;
   result.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
   result.output = output_file ? "" : content_of(output_path);
-  result.error = content_of(error_path);
+  result.error = error_file ? "" : content_of(error_path);
   return result;
 }
 

@@ -1,0 +1,53 @@
+#include <array>
+#include <string>
+
+#include "edid_composer/platform_values_reader.h"
+#include "measured.h"
+#include "platforms.h"
+#include "registration.h"
+#include "sinks.h"
+#include "stack_meter.h"
+
+namespace bench {
+namespace {
+
+using output_t = std::array<u8, 256>;
+
+/// Measures a composition's time and heap calls, and the stack below it.
+template <typename operation_t>
+void measure_with_stack(benchmark::State &state, operation_t operation) {
+  operation();
+  state.counters["stack"] = static_cast<double>(stack_use_of(operation));
+  measure(state, operation);
+}
+
+void run_with_values(benchmark::State &state, const sink_t &sink) {
+  load_default_platform();
+  values_t values;
+  edid_composer::_read_platform_values(values.get());
+  const compose_cfg_t cfg = sample_settings();
+  output_t output;
+  measure_with_stack(state, [&] {
+    compose_edid_internal(sink.data(), sink.size(), output.data(), output.size(), &cfg, values.get());
+  });
+}
+
+void run_with_store(benchmark::State &state, const sink_t &sink) {
+  load_default_platform();
+  const compose_cfg_t cfg = sample_settings();
+  output_t output;
+  measure_with_stack(state, [&] { compose_edid(sink.data(), sink.size(), output.data(), output.size(), &cfg); });
+}
+
+}  // namespace
+
+void register_composition_benchmarks() {
+  for (const auto &sink : sample_sinks()) {
+    benchmark::RegisterBenchmark(("compose/with_values/" + sink.name).c_str(),
+                                 [&sink](benchmark::State &state) { run_with_values(state, sink); });
+    benchmark::RegisterBenchmark(("compose/with_store/" + sink.name).c_str(),
+                                 [&sink](benchmark::State &state) { run_with_store(state, sink); });
+  }
+}
+
+}  // namespace bench

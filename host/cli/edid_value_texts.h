@@ -1,0 +1,20 @@
+// Values of a decoded EDID that take more than a number to tell. Of a list: one text for each entry.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "edid_composer.h"
+
+namespace edid_cli {
+
+std::string version_text(const edid_t &edid);
+std::string gamma_text(const edid_t &edid);
+std::string speaker_text(const edid_t &edid);
+std::vector<std::string> standard_timing_texts(const edid_t &edid);
+std::vector<std::string> detailed_timing_texts(const edid_t &edid);
+std::vector<std::string> video_mode_texts(const edid_t &edid);
+std::vector<std::string> audio_format_texts(const edid_t &edid);
+std::vector<std::string> mode_4k_x_2k_texts(const edid_t &edid);
+
+}  // namespace edid_cli

@@ -1,0 +1,66 @@
+#include "explain/byte_names.h"
+
+#include <algorithm>
+
+#include "explain/byte_fields.h"
+
+namespace edid_cli {
+namespace {
+
+constexpr std::size_t block_size = 128;
+constexpr std::size_t extension_begin = block_size;
+constexpr std::size_t checksum_offset = extension_begin + block_size - 1;
+
+constexpr field_bit_t flag_bits[] = {
+    {0x80, "underscan"}, {0x40, "basic audio"}, {0x20, "YCbCr 4:4:4"}, {0x10, "YCbCr 4:2:2"}};
+
+constexpr field_row_t header_rows[] = {
+    {1, "Extension tag",
+     [](const field_place_t &place) -> std::string {
+       return place.here() == 2 ? "2: CEA-861" : std::to_string(place.here());
+     }},
+    {1, "Revision", [](const field_place_t &place) { return std::to_string(place.here()); }},
+    {1, "Detailed timings begin",
+     [](const field_place_t &place) {
+       return field_text("at byte %u of this block, 0x%02X", place.here(),
+                         static_cast<unsigned>(place.base) + place.here());
+     }},
+    {1, "Flags",
+     [](const field_place_t &place) {
+       return set_bit_names(place.here(), flag_bits) + ", " + number_text(place.here() & 15U, "native timings");
+     }},
+};
+
+/// A descriptor begins with its clock, or with two zeros and a tag behind them.
+bool is_descriptor_next(const byte_naming_t &naming) {
+  return naming.position() + descriptor_size <= checksum_offset &&
+         (naming.next(0) != 0 || naming.next(1) != 0 || naming.next(3) != 0);
+}
+
+void name_extension(byte_naming_t &naming) {
+  naming.set_end(checksum_offset);
+  const std::size_t timings = extension_begin + naming.next(2);
+  naming.name(byte_block_t::extension, header_rows, checksum_offset);
+  while (naming.position() < std::min(timings, checksum_offset)) {
+    name_data_block(naming);
+  }
+  while (is_descriptor_next(naming)) {
+    name_descriptor(naming);
+  }
+  if (naming.position() < checksum_offset) {
+    naming.name(byte_block_t::unused, checksum_offset - naming.position(), "Unused", "nothing is written here");
+  }
+  naming.set_end(checksum_offset + 1);
+  naming.name(byte_block_t::extension, 1, "Checksum", checksum_meaning(naming.place(extension_begin)));
+}
+
+}  // namespace
+
+std::vector<byte_field_t> name_bytes(std::span<const u8> edid) {
+  byte_naming_t naming(edid);
+  name_base_block(naming);
+  name_extension(naming);
+  return std::move(naming).take();
+}
+
+}  // namespace edid_cli

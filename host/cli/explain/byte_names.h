@@ -1,0 +1,46 @@
+// What each byte of an EDID is: EDID 1.3, CEA-861, HDMI 1.4.
+#pragma once
+
+#include <span>
+#include <string>
+#include <vector>
+
+#include "edid_composer.h"
+
+namespace edid_cli {
+
+/// Parts of an EDID that are told apart by colour.
+enum class byte_block_t {
+  identity,
+  display,
+  timings,
+  descriptor,
+  extension,
+  speakers,
+  video,
+  audio,
+  hdmi,
+  colorimetry,
+  other,
+  unused
+};
+inline constexpr std::size_t byte_block_count = static_cast<std::size_t>(byte_block_t::unused) + 1;
+
+/// "Video data block".
+const char *byte_block_title(byte_block_t block);
+/// "video", for style sheets.
+const char *byte_block_id(byte_block_t block);
+
+/// Bytes that mean something together.
+struct byte_field_t {
+  std::size_t offset;
+  std::size_t size;
+  byte_block_t block;
+  std::string name;
+  std::string meaning;
+};
+
+/// The fields of a base block and a CEA-861 extension, 256 bytes: each byte is in one field, in order.
+std::vector<byte_field_t> name_bytes(std::span<const u8> edid);
+
+}  // namespace edid_cli

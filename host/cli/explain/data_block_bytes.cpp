@@ -1,0 +1,117 @@
+// The data blocks of the extension: CEA-861, section 7.5.
+#include <algorithm>
+
+#include "explain/byte_fields.h"
+#include "explain/mode_names.h"
+
+namespace edid_cli {
+namespace {
+
+constexpr field_bit_t speaker_bits[] = {{0x001, "front left and right"},
+                                        {0x002, "LFE"},
+                                        {0x004, "front centre"},
+                                        {0x008, "rear left and right"},
+                                        {0x010, "rear centre"},
+                                        {0x020, "front left and right of centre"},
+                                        {0x040, "rear left and right of centre"},
+                                        {0x080, "front wide"},
+                                        {0x100, "front high"},
+                                        {0x200, "top centre"},
+                                        {0x400, "front centre high"}};
+constexpr field_bit_t colorimetry_bits[] = {{0x01, "xvYCC601"}, {0x02, "xvYCC709"}};
+constexpr field_bit_t metadata_bits[] = {{0x01, "MD0"}, {0x02, "MD1"}, {0x04, "MD2"}, {0x08, "MD3"}};
+constexpr field_bit_t rate_bits[] = {{0x01, "32 kHz"}, {0x02, "44.1 kHz"},  {0x04, "48 kHz"}, {0x08, "88.2 kHz"},
+                                     {0x10, "96 kHz"}, {0x20, "176.4 kHz"}, {0x40, "192 kHz"}};
+constexpr field_bit_t size_bits[] = {{0x01, "16 bits"}, {0x02, "20 bits"}, {0x04, "24 bits"}};
+
+/// What the third byte of an audio descriptor says depends on its format.
+std::string audio_detail(unsigned format, unsigned byte) {
+  constexpr unsigned pcm = 1;
+  constexpr unsigned last_with_bitrate = 8;
+  constexpr unsigned wma_pro = 14;
+  constexpr unsigned extension = 15;
+  if (format == pcm) {
+    return set_bit_names(byte, size_bits);
+  }
+  if (format == extension) {
+    return "extension code " + std::to_string(byte >> 3) + ": " + audio_type_name((byte >> 3) + extension);
+  }
+  return format <= last_with_bitrate ? number_text(byte * 8, "kbit/s")
+         : format == wma_pro         ? "profile " + std::to_string(byte & 7U)
+                                     : "value " + std::to_string(byte);
+}
+
+void name_audio(byte_naming_t &naming, std::size_t end) {
+  constexpr byte_block_t block = byte_block_t::audio;
+  for (int number = 1; naming.position() + 3 <= end; ++number) {
+    const std::string name = "Audio descriptor " + std::to_string(number);
+    const unsigned format = naming.next() >> 3 & 15U;
+    naming.name(block, 1, name + ": format and channels",
+                audio_type_name(format) + ", " + number_text((naming.next() & 7U) + 1, "channels"));
+    naming.name(block, 1, name + ": sample rates", set_bit_names(naming.next(), rate_bits));
+    naming.name(block, 1, name + ": detail", audio_detail(format, naming.next()));
+  }
+}
+
+void name_video(byte_naming_t &naming, std::size_t end) {
+  for (int number = 1; naming.position() < end; ++number) {
+    const unsigned byte = naming.next();
+    naming.name(byte_block_t::video, 1, "Video descriptor " + std::to_string(number),
+                video_mode_name(byte & 0x7FU) + ((byte & 0x80U) != 0 ? ", native" : ""));
+  }
+}
+
+void name_speakers(byte_naming_t &naming, std::size_t) {
+  naming.name(byte_block_t::speakers, 3, "Speakers", set_bit_names(naming.next() | naming.next(1) << 8, speaker_bits));
+}
+
+void name_vendor(byte_naming_t &naming, std::size_t end) {
+  if (naming.next(0) == 0x03 && naming.next(1) == 0x0C && naming.next(2) == 0x00) {
+    name_hdmi_block(naming, end);
+  }
+}
+
+void name_extended(byte_naming_t &naming, std::size_t end) {
+  constexpr unsigned colorimetry = 5;
+  if (naming.position() < end && naming.next() == colorimetry) {
+    naming.name(byte_block_t::colorimetry, 1, "Extended tag", "5: colorimetry");
+    naming.name(byte_block_t::colorimetry, 1, "Colorimetry", set_bit_names(naming.next(), colorimetry_bits));
+    naming.name(byte_block_t::colorimetry, 1, "Gamut metadata profiles", set_bit_names(naming.next(), metadata_bits));
+  }
+}
+
+void name_nothing(byte_naming_t &, std::size_t) {}
+
+struct data_block_t {
+  byte_block_t block;
+  const char *name;
+  void (*name_payload)(byte_naming_t &naming, std::size_t end);
+};
+
+/// By tag.
+constexpr data_block_t data_blocks[8] = {
+    {byte_block_t::other, "Reserved", name_nothing},
+    {byte_block_t::audio, "Audio", name_audio},
+    {byte_block_t::video, "Video", name_video},
+    {byte_block_t::hdmi, "Vendor-specific", name_vendor},
+    {byte_block_t::speakers, "Speaker allocation", name_speakers},
+    {byte_block_t::other, "VESA DTC", name_nothing},
+    {byte_block_t::other, "Reserved", name_nothing},
+    {byte_block_t::colorimetry, "Extended", name_extended},
+};
+
+}  // namespace
+
+void name_data_block(byte_naming_t &naming) {
+  const unsigned header = naming.next();
+  const data_block_t &kind = data_blocks[header >> 5];
+  const std::size_t length = header & 0x1FU;
+  naming.name(kind.block, 1, std::string(kind.name) + " data block", number_text(header & 0x1FU, "bytes follow"));
+  const std::size_t end = std::min(naming.position() + length, naming.end());
+  kind.name_payload(naming, end);
+  if (naming.position() < end) {
+    naming.name(kind.block, end - naming.position(), "Not known", "not looked at");
+  }
+}
+
+}  // namespace edid_cli

@@ -1,0 +1,31 @@
+// What a composition was about: everything that the texts of an explanation are made from.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "composition.h"
+#include "decoded_edid.h"
+#include "explain/explanation.h"
+#include "explain/platform_places.h"
+
+namespace edid_cli {
+
+struct explained_t {
+  const explanation_t &explanation;
+  const std::vector<u8> &sink_bytes;  ///< Empty: no sink.
+  const edid_t &sink;                 ///< What could be decoded of it.
+  std::string sink_name;              ///< Empty: no sink.
+  const platform_places_t &places;
+  const composition_options_t &options;
+
+  /// The refresh family whose lists are used.
+  u32 family() const;
+  /// Whether sources look at the extension at all.
+  bool is_extension_announced() const;
+};
+
+/// The first decision about a subject; nullptr when there is none.
+const compose_decision_t *find_decision(const explanation_t &explanation, compose_subject subject);
+
+}  // namespace edid_cli

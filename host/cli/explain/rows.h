@@ -1,0 +1,48 @@
+// The decisions of a composition as rows of text: what all outputs are made from.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "explain/explained.h"
+
+namespace edid_cli {
+
+enum class section_t { video, mode_4k, audio, derived };
+
+enum class source_kind_t { sink, platform, setting, library };
+
+/// Where a decision comes from.
+struct source_t {
+  source_kind_t kind;
+  std::string text;   ///< "box.toml:40 60_hz_priority_list[2]".
+  std::string key{};  ///< Of the platform: the key or the entry. Of the settings: the option.
+  unsigned line = 0;  ///< Of the platform; 0: the key is not there.
+};
+
+struct row_t {
+  section_t section;
+  compose_decision_t decision;
+  std::string name;
+  std::string sentence;
+  std::vector<source_t> sources;
+
+  bool is_offered() const { return decision.verdict != COMPOSE_VERDICT_LEFT_OUT; }
+};
+
+/// What is wrong with the new EDID as a whole.
+std::vector<std::string> warnings_of(const std::vector<row_t> &rows);
+/// The verdict in words; a derived value is not offered but in force.
+const char *verdict_text(const row_t &row);
+/// "Video modes".
+const char *section_title(section_t section);
+/// "video", for programs.
+const char *section_id(section_t section);
+const char *source_kind_id(source_kind_t kind);
+/// All of a row's sources.
+std::string source_text(const row_t &row);
+
+/// Section after section; what is offered comes first, in the order of the EDID.
+std::vector<row_t> rows_of(const explained_t &explained);
+
+}  // namespace edid_cli

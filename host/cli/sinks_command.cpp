@@ -1,0 +1,56 @@
+#include <cstdio>
+#include <string>
+#include <vector>
+
+#include "bad_input.h"
+#include "commands.h"
+#include "decoded_edid.h"
+#include "drm_connectors.h"
+#include "edid_file.h"
+#include "exit_status.h"
+#include "input.h"
+#include "output_capture.h"
+#include "physical_address_text.h"
+#include "text_table.h"
+
+namespace edid_cli {
+namespace {
+
+std::string monitor_of(const edid_t &edid) {
+  return edid.monitor_name[0] != '\0' ? edid.monitor_name : "(no name)";
+}
+
+text_table_t::row_t describe(const connector_t &connector) {
+  try {
+    if (read_input(connector.edid_file).empty()) {
+      return {connector.name, "(not connected)", "-"};
+    }
+    const std::vector<u8> bytes = read_edid_file(connector.edid_file);
+    const output_capture_t unseen;
+    const decoded_edid_t edid(bytes);
+    if (!edid.is_complete()) {
+      return {connector.name, "(EDID does not decode)", "-"};
+    }
+    return {connector.name, monitor_of(edid.record()), physical_address_text(edid.record())};
+  } catch (const bad_input_t &) {
+    return {connector.name, "(EDID cannot be read)", "-"};
+  }
+}
+
+}  // namespace
+
+int run(const sinks_options_t &options) {
+  const std::vector<connector_t> connectors = list_connectors(options.drm_directory);
+  if (connectors.empty()) {
+    throw bad_input_t(options.drm_directory + ": holds no connectors");
+  }
+  text_table_t table;
+  table.add({"CONNECTOR", "MONITOR", "ADDRESS"});
+  for (const connector_t &connector : connectors) {
+    table.add(describe(connector));
+  }
+  std::fputs(table.text().c_str(), stdout);
+  return done_status;
+}
+
+}  // namespace edid_cli

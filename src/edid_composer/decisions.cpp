@@ -1,0 +1,119 @@
+#include "edid_composer/decisions.h"
+
+#include "linked_list/new_entry.h"
+#include "linked_list/walk.h"
+
+namespace edid_composer {
+namespace {
+
+constexpr i32 nowhere = -1;
+
+constexpr compose_decision_t undecided(compose_subject subject, u32 code) {
+  return {.size = sizeof(compose_decision_t),
+          .subject = subject,
+          .code = code,
+          .verdict = 0,
+          .reason = 0,
+          .origins = 0,
+          .sink_index = nowhere,
+          .priority_index = nowhere,
+          .addition_index = nowhere,
+          .position = nowhere,
+          .value = {}};
+}
+
+/// Where the place in a list that names a candidate is kept.
+i32 compose_decision_t::*place_of(compose_origin origin) {
+  switch (origin) {
+    case COMPOSE_ORIGIN_DETAILED_TIMING:
+    case COMPOSE_ORIGIN_STANDARD_TIMING:
+    case COMPOSE_ORIGIN_SHORT_VIDEO:
+    case COMPOSE_ORIGIN_SINK_4K:
+    case COMPOSE_ORIGIN_SINK_AUDIO:
+      return &compose_decision_t::sink_index;
+    case COMPOSE_ORIGIN_PRIORITY_LIST:
+    case COMPOSE_ORIGIN_OTHER_PRIORITY_LIST:
+    case COMPOSE_ORIGIN_PLATFORM_AUDIO:
+      return &compose_decision_t::priority_index;
+    case COMPOSE_ORIGIN_ADDITION_LIST:
+    case COMPOSE_ORIGIN_OTHER_ADDITION_LIST:
+      return &compose_decision_t::addition_index;
+    case COMPOSE_ORIGIN_CURRENT_MODE:
+    case COMPOSE_ORIGIN_LIBRARY:
+      break;
+  }
+  return nullptr;
+}
+
+}  // namespace
+
+void decide(compose_decision_t *decision, compose_verdict verdict, compose_reason reason, reason_values_t values) {
+  decision->verdict = verdict;
+  decision->reason = reason;
+  decision->value[0] = values.first;
+  decision->value[1] = values.second;
+  decision->value[2] = values.third;
+  decision->value[3] = values.fourth;
+}
+
+decisions_t::decisions_t(const site_t &site) : site_(site) {
+  static_cast<void>(init_list<compose_decision_t>(&list_));
+}
+
+decisions_t::~decisions_t() {
+  ll_delete_list(&list_);
+}
+
+compose_decision_t *decisions_t::add(compose_subject subject, u32 code) {
+  new_entry_t<compose_decision_t> decision(HERE_AS(site_));
+  if (!decision || !decision.add_to_back(&list_)) {
+    complete_ = false;
+    unheard_ = undecided(subject, code);
+    return &unheard_;
+  }
+  *decision = undecided(subject, code);
+  return &*decision;
+}
+
+compose_decision_t *decisions_t::candidate(compose_subject subject, u32 code) {
+  for (auto &decision : walk<compose_decision_t>(LIST_AS(site_, &list_))) {
+    if (decision.subject == subject && decision.code == code) return &decision;
+  }
+  return add(subject, code);
+}
+
+compose_decision_t *decisions_t::nominate(compose_subject subject, u32 code, compose_origin origin, i32 index) {
+  compose_decision_t *const decision = candidate(subject, code);
+  decision->origins |= origin;
+  if (i32 compose_decision_t::*const place = place_of(origin); place != nullptr && decision->*place == nowhere) {
+    decision->*place = index;
+  }
+  return decision;
+}
+
+void decisions_t::nominate_modes(const ll_list_t &modes, compose_origin origin) {
+  if (!is_walkable<short_video_desc_t>(modes)) return;
+  i32 index = 0;
+  for (const auto &mode : walk<const short_video_desc_t>(LIST_AS(site_, &modes)))
+    nominate(COMPOSE_SUBJECT_VIDEO_MODE, mode.vic, origin, index++);
+}
+
+void decisions_t::note(compose_subject subject, u32 code, compose_verdict verdict, compose_reason reason,
+                       reason_values_t values) {
+  decide(add(subject, code), verdict, reason, values);
+}
+
+compose_decision_t *decisions_t::chosen(compose_subject subject, u32 place) {
+  for (auto &decision : walk<compose_decision_t>(LIST_AS(site_, &list_))) {
+    if (decision.subject == subject && is_chosen(decision) && place-- == 0) return &decision;
+  }
+  return nullptr;
+}
+
+void decisions_t::tell(compose_observer_t observer, void *context) const {
+  if (!complete_) return;
+  for (const auto &decision : walk<const compose_decision_t>(LIST_AS(site_, &list_)))
+    observer(&decision, context);
+}
+
+}  // namespace edid_composer

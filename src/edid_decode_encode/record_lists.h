@@ -1,0 +1,26 @@
+// The lists that a record consists of.
+#pragma once
+
+#include "linked_list/element_types.h"
+
+namespace edid_composer {
+
+/// The four lists of a record, in the order in which they are checked, initialised and deleted.
+/// kept: two lists are called otherwise when they are missing at destruction.
+struct record_list_t {
+  ll_list_t edid_t::*list;
+  const char *element_type;
+  char name[32];
+  char name_when_missing[40];
+};
+
+inline constexpr record_list_t record_lists[] = {
+    {&edid_t::std_timings, element_type_name<std_timing_t>, "standard_timing_list", "standard_timing_list"},
+    {&edid_t::dtd_list, element_type_name<detailed_timing_t>, "detailed_timing_list", "detailed_timing_list"},
+    {&edid_t::video_list, element_type_name<short_video_desc_t>, "short_video_description_list",
+     "short_video_description_timing_list"},
+    {&edid_t::audio_list, element_type_name<short_audio_desc_t>, "short_audio_description_list",
+     "short_audio_description_timing_list"},
+};
+
+}  // namespace edid_composer

@@ -1,0 +1,128 @@
+// The words for subjects, verdicts and reasons, to the letter: programs compare them.
+#include <gtest/gtest.h>
+
+#include <set>
+#include <string>
+#include <vector>
+
+#include "edid_composer.h"
+
+namespace {
+
+struct name_t {
+  u32 number;
+  const char *text;
+};
+
+using name_function_t = const char *(*)(u32);
+
+void expect_names(name_function_t name_of, const std::vector<name_t> &names) {
+  std::set<std::string> texts;
+  for (const auto &[number, text] : names) {
+    EXPECT_STREQ(name_of(number), text) << number;
+    EXPECT_TRUE(texts.insert(name_of(number)).second) << "another one has the text " << text;
+    EXPECT_EQ(name_of(number), name_of(number)) << "the text is a static one";
+  }
+  const auto behind = static_cast<u32>(names.size()) + 1;
+  for (const u32 number : {0U, behind, behind + 1, 0x7FFFFFFFU, 0x80000000U, 0xFFFFFFFFU})
+    EXPECT_STREQ(name_of(number), "unknown") << number;
+}
+
+TEST(ObservedNames, OfSubjects) {
+  expect_names(compose_subject_string, {{1, "video mode"},
+                                        {2, "sink timing"},
+                                        {3, "4Kx2K mode"},
+                                        {4, "audio format"},
+                                        {5, "native rate"},
+                                        {6, "geometry limit"},
+                                        {7, "current mode"},
+                                        {8, "physical address"},
+                                        {9, "deep colour"},
+                                        {10, "TMDS clock"},
+                                        {11, "latency"},
+                                        {12, "3D"},
+                                        {13, "padding"},
+                                        {14, "extension room"}});
+}
+
+TEST(ObservedNames, OfVerdicts) {
+  expect_names(compose_verdict_string, {{1, "offered"}, {2, "left out"}, {3, "changed"}});
+}
+
+TEST(ObservedNames, OfReasons) {
+  expect_names(compose_reason_string, {
+                                          {1, "the priority list names it and the sink has it"},
+                                          {2, "the priority list names it and the addition list has it"},
+                                          {3, "the platform puts it out now"},
+                                          {4, "it stands in for missing modes"},
+                                          {5, "the priority list does not name it"},
+                                          {6, "neither the sink nor the addition list has it"},
+                                          {7, "only lists of the other refresh family name it"},
+                                          {8, "it is taller than every short video descriptor of the sink"},
+                                          {9, "the extension holds no more of its kind"},
+                                          {10, "no VIC has this timing"},
+                                          {11, "the platform has it"},
+                                          {12, "it is passed through from the sink"},
+                                          {13, "narrowed to what the sink takes"},
+                                          {14, "basic audio, which no other format covers"},
+                                          {15, "the entry is not an audio format"},
+                                          {16, "pass-through takes the formats of the sink only"},
+                                          {17, "pass-through takes the formats of the platform only"},
+                                          {18, "the sink has no such format"},
+                                          {19, "a format before it covers it"},
+                                          {20, "the caller's audio mask excludes it"},
+                                          {21, "no audio mask has a bit for its type"},
+                                          {22, "a detailed timing of the sink tells it"},
+                                          {23, "a standard timing of the sink tells it"},
+                                          {24, "a short video descriptor of the sink tells it"},
+                                          {25, "the platform's, as no mode of the sink tells it"},
+                                          {26, "the platform's rate is neither 50 nor 60"},
+                                          {27, "the tallest short video descriptor of the sink"},
+                                          {28, "the platform sets no limit"},
+                                          {29, "the platform wants it first"},
+                                          {30, "the platform does not want it first"},
+                                          {31, "it is not a plausible mode"},
+                                          {32, "no VIC has this mode"},
+                                          {33, "the platform is the television"},
+                                          {34, "the port stands in the first free place of the sink's"},
+                                          {35, "there is no HDMI sink"},
+                                          {36, "the sink's begins with 0"},
+                                          {37, "the sink's has no free place"},
+                                          {38, "the platform says so"},
+                                          {39, "HDMI requires 36 bit where 30 bit is offered"},
+                                          {40, "never offered"},
+                                          {41, "the platform sets it"},
+                                          {42, "the offered modes need it"},
+                                          {43, "the offered 4Kx2K modes need it"},
+                                          {44, "the offered modes stay below 165 MHz"},
+                                          {45, "cut to the largest that can be declared"},
+                                          {46, "the platform's and the sink's in sum"},
+                                          {47, "neither the platform nor the sink delays"},
+                                          {48, "the platform's or the sink's is longer than 500 ms"},
+                                          {49, "the caller wants it always"},
+                                          {50, "the caller wants it as the sink, which has it"},
+                                          {51, "the caller wants it as the sink, which does not have it"},
+                                          {52, "the caller does not want it"},
+                                          {53, "fewer modes than an EDID has at least were chosen"},
+                                          {54, "enough modes were chosen"},
+                                          {55, "every byte fits"},
+                                          {56, "the extension is full: what comes last is left out"},
+                                          {57, "a data block is longer than its length field can tell"},
+                                          {58, "without a monitor name the extension is not announced"},
+                                      });
+}
+
+// Stored records and programs in other languages rely on the numbers.
+static_assert(COMPOSE_SUBJECT_VIDEO_MODE == 1 && COMPOSE_SUBJECT_EXTENSION_ROOM == 14);
+static_assert(COMPOSE_VERDICT_OFFERED == 1 && COMPOSE_VERDICT_LEFT_OUT == 2 && COMPOSE_VERDICT_CHANGED == 3);
+static_assert(COMPOSE_REASON_SINK_HAS_IT == 1 && COMPOSE_REASON_NO_ROOM == 9 && COMPOSE_REASON_PLATFORM_FORMAT == 11 &&
+              COMPOSE_REASON_TYPE_WITHOUT_BIT == 21 && COMPOSE_REASON_RATE_OF_DETAILED_TIMING == 22 &&
+              COMPOSE_REASON_GEOMETRY_OF_SINK == 27 && COMPOSE_REASON_CURRENT_MODE_FIRST == 29 &&
+              COMPOSE_REASON_ADDRESS_OF_ROOT == 33 && COMPOSE_REASON_DEEP_COLOR_OF_PLATFORM == 38 &&
+              COMPOSE_REASON_TMDS_OVERRIDE == 41 && COMPOSE_REASON_LATENCY_OF_BOTH == 46 &&
+              COMPOSE_REASON_3D_ALWAYS == 49 && COMPOSE_REASON_TOO_FEW_MODES == 53 &&
+              COMPOSE_REASON_ROOM_ENOUGH == 55 && COMPOSE_REASON_NOT_ANNOUNCED == 58);
+static_assert(COMPOSE_ORIGIN_DETAILED_TIMING == 0x1 && COMPOSE_ORIGIN_SINK_AUDIO == 0x10 &&
+              COMPOSE_ORIGIN_PRIORITY_LIST == 0x20 && COMPOSE_ORIGIN_LIBRARY == 0x800);
+
+}  // namespace

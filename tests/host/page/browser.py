@@ -1,0 +1,107 @@
+"""A browser without a window, driven by plain WebDriver (W3C) requests."""
+
+import base64
+import json
+import shutil
+import subprocess
+import time
+import urllib.error
+import urllib.request
+
+PROGRAMS = ("chromedriver", "chromium")
+ENTER = "\ue007"
+ARROW_RIGHT, ARROW_DOWN = "\ue014", "\ue015"
+
+
+def missing_programs():
+    return [program for program in PROGRAMS if shutil.which(program) is None]
+
+
+class Browser:
+    """One page at a time. What it logs and what it asks the network for is kept."""
+
+    def __init__(self, folder, dark=False, scripts=True):
+        self._driver = subprocess.Popen([shutil.which("chromedriver"), "--port=0"], cwd=folder, stdout=subprocess.PIPE,
+                                        stderr=subprocess.STDOUT, text=True)
+        try:
+            self._url = f"http://127.0.0.1:{self._port()}"
+            colors = f"--blink-settings=preferredColorScheme={0 if dark else 1}"
+            arguments = ["--headless=new", "--no-sandbox", "--disable-gpu", "--disable-dev-shm-usage",
+                         f"--user-data-dir={folder}/profile", colors, "about:blank"]
+            options = {"args": arguments, "binary": shutil.which("chromium")}
+            if not scripts:
+                options["prefs"] = {"profile.managed_default_content_settings.javascript": 2}
+            always = {"browserName": "chrome", "goog:chromeOptions": options,
+                      "goog:loggingPrefs": {"browser": "ALL", "performance": "ALL"}}
+            session = self._send("POST", "/session", {"capabilities": {"alwaysMatch": always}})
+            self._url += f"/session/{session['sessionId']}"
+        except BaseException:
+            self._driver.kill()
+            self._driver.wait()
+            raise
+
+    def close(self):
+        try:
+            self._send("DELETE", "")
+        finally:
+            self._driver.terminate()
+            self._driver.wait(timeout=20)
+            self._driver.stdout.close()
+
+    def _port(self):
+        for line in self._driver.stdout:
+            if "started successfully on port" in line:
+                return int(line.rstrip(".\n").rpartition(" ")[2])
+        raise RuntimeError("chromedriver does not start")
+
+    def _send(self, method, path, body=None):
+        data = json.dumps(body).encode() if body is not None else None
+        request = urllib.request.Request(self._url + path, data, {"Content-Type": "application/json"}, method=method)
+        try:
+            with urllib.request.urlopen(request, timeout=60) as answer:
+                return json.load(answer)["value"]
+        except urllib.error.HTTPError as error:
+            raise RuntimeError(error.read().decode()) from error
+
+    def open(self, page):
+        self._send("POST", "/url", {"url": page.as_uri()})
+
+    def resize(self, width, height=900):
+        """The inside of the window, as a phone has it."""
+        self._send("POST", "/goog/cdp/execute", {"cmd": "Emulation.setDeviceMetricsOverride", "params": {
+            "width": width, "height": height, "deviceScaleFactor": 1, "mobile": False}})
+
+    def run(self, script, *arguments):
+        """The value that a script returns."""
+        return self._send("POST", "/execute/sync", {"script": script, "args": arguments})
+
+    def press(self, selector, keys):
+        """Keys that a person would press in an element."""
+        element = self._send("POST", "/element", {"using": "css selector", "value": selector})
+        self._send("POST", f"/element/{next(iter(element.values()))}/value", {"text": keys})
+
+    def press_here(self, *keys):
+        """Keys where the focus is."""
+        actions = [{"type": kind, "value": key} for key in keys for kind in ("keyDown", "keyUp")]
+        self._send("POST", "/actions", {"actions": [{"type": "key", "id": "keyboard", "actions": actions}]})
+
+    def click(self, selector):
+        self.run("document.querySelector(arguments[0]).scrollIntoView({block: 'center'})", selector)
+        element = self._send("POST", "/element", {"using": "css selector", "value": selector})
+        self._send("POST", f"/element/{next(iter(element.values()))}/click", {})
+
+    def print_pages(self):
+        """A PDF file's bytes."""
+        paper = {"width": 21, "height": 29.7}
+        return base64.b64decode(self._send("POST", "/print", {"background": True, "page": paper}))
+
+    def console(self):
+        return [entry["message"] for entry in self._send("POST", "/se/log", {"type": "browser"})]
+
+    def requests(self):
+        """The addresses that were asked for since the last call."""
+        time.sleep(0.2)
+        entries = self._send("POST", "/se/log", {"type": "performance"})
+        events = [json.loads(entry["message"])["message"] for entry in entries]
+        urls = [event["params"]["request"]["url"] for event in events if event["method"] == "Network.requestWillBeSent"]
+        return [url for url in urls if not url.startswith("chrome:")]  # Those of its own first page.

@@ -1,0 +1,306 @@
+"""What "explain --want" tells to do has the effect that it promises, for everything that can stand in the way."""
+
+import json
+import re
+import unittest
+
+import explaining
+import instructions
+import offers
+import sinks
+
+DOMAIN = "platform.software.drivers.vorex.edid"
+ALL_AUDIO_TYPES = [*range(1, 15), 16, 17, 18]
+
+
+def platform(video=("16", "4", "3", "1"), video_addition=("16", "4", "3", "1"), other=("31", "19", "18", "1"),
+             other_addition=("31", "19", "18", "1"), modes_4k=(1, 2, 3, 4), addition_4k=(), audio=(0x077F09, 0x500715),
+             pass_through=0, keys="", name="monitor_name = \"Box\""):
+    """A platform's text, an entry a line. "Other" are the lists of the 50 Hz family."""
+    text = f"[{DOMAIN}]\n{name}\n{keys}\n"
+    for name, entries in (("60_hz_priority_list", video), ("60_hz_addition_list", video_addition),
+                          ("50_hz_priority_list", other), ("50_hz_addition_list", other_addition)):
+        if entries is not None:
+            text += f"{name} = [\n" + "".join(f'  "{entry}",\n' for entry in entries) + "]\n"
+    text += f"4k_x_2k_priority_list = {list(modes_4k)}\n4k_x_2k_addition_list = {list(addition_4k)}\n"
+    text += f"[{DOMAIN}.audio]\npass_through = {pass_through}\n"
+    return text + "".join(f"entry_{chr(ord('a') + place)} = 0x{entry:06X}\n" for place, entry in enumerate(audio))
+
+
+def sink_50():
+    return sinks.sink(vics=[19, 18, 17])
+
+
+class WantTest(explaining.ExplainTest):
+    def ask(self, text, sink, arguments, wanted):
+        files = ["--platform", self.write("box.toml", text)]
+        files += ["--sink", self.write("sink.bin", sink)] if sink else []
+        status, printed, complaints = self.run_program("explain", "--json", *files, *arguments, "--want", wanted)
+        self.assertIn(status, (0, 1), complaints)
+        return status, json.loads(printed)["answers"]
+
+    def offered(self, text, sink, arguments):
+        files = ["--platform", self.write("box.toml", text)]
+        files += ["--sink", self.write("sink.bin", sink)] if sink else []
+        edid = self.composed(*files, *arguments)
+        return {"vic": offers.video_modes(edid), "4k": offers.modes_4k(edid), "audio": offers.audio_types(edid)}
+
+    def check(self, wanted, kind, code, text, sink=None, arguments=(), told=()):
+        """It isn't offered; what is told contains @p told, in order; that done, it is offered."""
+        self.assertNotIn(code, self.offered(text, sink, arguments)[kind])
+        status, (answer,) = self.ask(text, sink, arguments, wanted)
+        self.assertEqual((status, answer["offered"]), (1, False))
+        steps = [step["text"] for step in answer["steps"]]
+        self.assertEqual(len(steps), len(told), steps)
+        for step, expected in zip(steps, told):
+            self.assertIn(expected, step)
+
+        changed = instructions.Instructions(text, arguments)
+        changed.follow(answer["steps"])
+        self.assertIn(code, self.offered(changed.platform(), sink, changed.arguments)[kind])
+        status, (answer,) = self.ask(changed.platform(), sink, changed.arguments, wanted)
+        self.assertEqual((status, answer["offered"], answer["steps"]), (0, True, []))
+        return answer
+
+    @staticmethod
+    def line_of(text, beginning):
+        """The line, counted from 1, that begins so."""
+        return next(number for number, line in enumerate(text.splitlines(), 1) if line.startswith(beginning))
+
+
+class VideoModes(WantTest):
+    def test_one_that_the_sink_has_and_the_priority_list_does_not_name(self):
+        text = platform()
+        line = self.line_of(text, "60_hz_priority_list")
+        self.check("32", "vic", 32, text, sinks.sink(vics=[16, 32]),
+                   told=[f'add "32" to 60_hz_priority_list (box.toml:{line})'])
+
+    def test_one_that_only_the_addition_list_has(self):
+        text = platform(video_addition=("16", "5"))
+        self.check("1920x1080i60", "vic", 5, text, told=['add "5" to 60_hz_priority_list (box.toml:4)'])
+
+    def test_one_that_neither_the_sink_nor_the_platform_has(self):
+        text = platform(video=("16", "32"))
+        line = self.line_of(text, "60_hz_addition_list")
+        self.check("1920x1080p24", "vic", 32, text, sinks.sink(vics=[16]),
+                   told=[f'add "32" to 60_hz_addition_list (box.toml:{line})'])
+
+    def test_one_that_nobody_names(self):
+        self.check("63", "vic", 63, platform(), sinks.sink(vics=[16]),
+                   told=['add "63" to 60_hz_priority_list', 'add "63" to 60_hz_addition_list'])
+
+    def test_one_of_the_other_refresh_family(self):
+        self.check("16", "vic", 16, platform(), sink_50(),
+                   told=['add "16" to 50_hz_priority_list', 'add "16" to 50_hz_addition_list'])
+
+    def test_one_of_the_other_refresh_family_that_the_sink_has(self):
+        self.check("4", "vic", 4, platform(), sinks.sink(vics=[19, 4]), told=['add "4" to 50_hz_priority_list'])
+
+    def test_one_that_is_taller_than_the_sink(self):
+        text = platform(keys="geometry_limit = 1")
+        answer = self.check("16", "vic", 16, text, sinks.sink(vics=[4]), told=["set geometry_limit = 0 (box.toml:3)"])
+        self.assertIn("60_hz_addition_list", answer["reasons"][0])
+
+    def test_one_that_is_interlaced_and_taller_than_the_sink(self):
+        text = platform(video=("5", "4"), video_addition=("5",), keys="geometry_limit = 1")
+        self.check("5", "vic", 5, text, sinks.sink(vics=[4]), told=["set geometry_limit = 0"])
+
+    def test_one_that_is_taller_and_not_named(self):
+        text = platform(video=("4",), video_addition=("4",), keys="geometry_limit = 1")
+        self.check("16", "vic", 16, text, sinks.sink(vics=[4]),
+                   told=['add "16" to 60_hz_priority_list', 'add "16" to 60_hz_addition_list',
+                         "set geometry_limit = 0"])
+
+    def test_one_that_there_is_no_room_for(self):
+        vics = [str(vic) for vic in range(1, 36)]
+        text = platform(video=vics, video_addition=vics)
+        line = self.line_of(text, '  "34"')
+        self.check("35", "vic", 35, text,
+                   told=[f'take "34" out of 60_hz_priority_list (box.toml:{line})', 'take "33" out', 'take "32" out',
+                         'take "31" out'])
+
+    def test_one_that_would_be_one_too_many(self):
+        vics = [str(vic) for vic in range(1, 32)]
+        text = platform(video=vics, video_addition=[*vics, "40"])
+        self.check("40", "vic", 40, text, told=['add "40" to 60_hz_priority_list', 'take "31" out'])
+
+    def test_one_in_a_block_that_is_too_long_by_one(self):
+        vics = [str(vic) for vic in range(1, 33)]
+        self.check("1", "vic", 1, platform(video=vics, video_addition=vics), told=['take "32" out'])
+
+    def test_one_whose_list_is_not_there(self):
+        text = platform(video=None)
+        self.check("16", "vic", 16, text, sinks.sink(vics=[16]),
+                   told=[f'add 60_hz_priority_list = ["16"] to the table {DOMAIN} of box.toml'])
+
+    def test_entries_that_are_skipped_do_not_shift_the_lines_that_are_told(self):
+        vics = [str(vic) for vic in range(1, 33)]
+        text = platform(video=["99", "16 XY", *vics], video_addition=vics)
+        line = self.line_of(text, '  "31"')
+        self.check("32", "vic", 32, text, told=[f"(box.toml:{line})"])
+
+    def test_one_whose_extension_is_not_announced(self):
+        text = platform(name='monitor_name = ""')
+        answer = self.check("3", "vic", 3, text, told=['set monitor_name = "Box" (box.toml:2)'])
+        self.assertEqual(len(answer["reasons"]), 1)
+
+    def test_one_whose_extension_is_not_announced_for_want_of_the_key(self):
+        text = platform(name="")
+        self.check("3", "vic", 3, text, told=['add monitor_name = "Box" to the table'])
+
+    def test_one_that_is_a_detailed_timing_needs_no_extension(self):
+        status, (answer,) = self.ask(platform(name=""), None, (), "16")
+        self.assertEqual((status, answer["offered"]), (0, True))
+
+    def test_one_that_is_offered_says_so(self):
+        status, (answer,) = self.ask(platform(), sinks.sink(vics=[16]), (), "16")
+        self.assertEqual((status, answer["offered"], answer["steps"]), (0, True, []))
+        self.assertEqual(answer["reasons"], ["60_hz_priority_list names it, and the sink has it."])
+
+    def test_a_mode_of_two_aspect_ratios_is_offered_if_one_of_them_is(self):
+        text = platform(video=("3", "4", "16", "1"))
+        status, answers = self.ask(text, None, (), "720x480p60")
+        self.assertEqual((status, [answer["offered"] for answer in answers]), (0, [False, True]))
+        status, answers = self.ask(platform(video=("16",), video_addition=("16",)), None, (), "720x480p60")
+        self.assertEqual((status, [answer["offered"] for answer in answers]), (1, [False, False]))
+
+
+class Modes4k(WantTest):
+    def test_one_that_the_sink_has_and_the_priority_list_does_not_name(self):
+        text = platform(modes_4k=(3,))
+        line = self.line_of(text, "4k_x_2k_priority_list")
+        self.check("4k:1", "4k", 1, text, sinks.sink(vics=[16], vics_4k=[1]),
+                   told=[f"add 1 to 4k_x_2k_priority_list (box.toml:{line})"])
+
+    def test_one_that_the_sink_does_not_have(self):
+        self.check("3840x2160p30", "4k", 1, platform(), told=["add 1 to 4k_x_2k_addition_list"])
+
+    def test_one_that_nobody_names(self):
+        self.check("4k:4", "4k", 4, platform(modes_4k=()),
+                   told=["add 4 to 4k_x_2k_priority_list", "add 4 to 4k_x_2k_addition_list"])
+
+    def test_one_in_a_block_that_3d_formats_make_too_long(self):
+        vics = [f"{vic} FP SBSH TBH" for vic in range(1, 16)]
+        text = platform(video=vics, video_addition=vics)
+        if 1 in self.offered(text, sinks.sink(vics=[16], vics_4k=[1], has_3d=True), ())["4k"]:
+            self.skipTest("the block's length happens to hold the mode")
+        self.check("4k:1", "4k", 1, text, sinks.sink(vics=[16], vics_4k=[1], has_3d=True), told=["give --3d off"])
+
+    def test_one_whose_extension_is_not_announced(self):
+        self.check("4k:1", "4k", 1, platform(name=""), sinks.sink(vics=[16], vics_4k=[1]), told=["monitor_name"])
+
+    def test_one_that_the_list_has_no_place_for(self):
+        self.check("4k:2", "4k", 2, platform(modes_4k=(1,) * 7), sinks.sink(vics=[16], vics_4k=[1, 2]),
+                   told=["write 2 in place of 1 in 4k_x_2k_priority_list"])
+
+
+class AudioFormats(WantTest):
+    def test_one_that_nobody_has_of_every_type(self):
+        for wanted in ALL_AUDIO_TYPES:
+            entry = 0x077F09 if wanted != 1 else 0x500715
+            with self.subTest(type=wanted):
+                text = platform(audio=(entry,))
+                if wanted == 1:  # Basic audio is always there.
+                    self.assertEqual(self.ask(text, None, (), "audio:1")[0], 0)
+                else:
+                    self.check(f"audio:{wanted}", "audio", wanted, text, told=["add audio.entry_b = 0x"])
+
+    def test_one_for_a_platform_without_formats(self):
+        text = platform(audio=())
+        line = self.line_of(text, f"[{DOMAIN}.audio]")
+        self.check("ac3", "audio", 2, text, told=[f"behind box.toml:{line}"])
+
+    def test_one_that_the_sink_has_while_only_the_platforms_are_taken(self):
+        text = platform()
+        line = self.line_of(text, "pass_through")
+        self.check("dts", "audio", 7, text, sinks.sink(vics=[16], audio=[(0x3D, 0x06, 0xC0)]),
+                   told=[f"set audio.pass_through = 1 (box.toml:{line})"])
+
+    def test_one_that_the_platform_has_while_only_the_sinks_are_taken(self):
+        self.check("ac3", "audio", 2, platform(pass_through=2), sinks.sink(vics=[16], audio=[(0x3D, 0x06, 0xC0)]),
+                   told=["set audio.pass_through = 1"])
+
+    def test_one_that_nobody_has_while_only_the_sinks_are_taken(self):
+        self.check("eac3", "audio", 10, platform(pass_through=2), sinks.sink(vics=[16]),
+                   told=["set audio.pass_through = 1", "add audio.entry_c = 0x"])
+
+    def test_one_that_the_mask_excludes(self):
+        self.check("ac3", "audio", 2, platform(), arguments=["--audio-mask", "0x1"], told=["give --audio-mask 0x3"])
+
+    def test_one_of_the_extension_types_that_the_mask_excludes(self):
+        self.check("audio:16", "audio", 16, platform(audio=(0x077F09, 0x08077D)), arguments=["--audio-mask", "1"],
+                   told=["give --audio-mask 0x4001"])
+
+    def test_one_that_the_sink_filter_takes_away(self):
+        self.check("ac3", "audio", 2, platform(), sinks.sink(vics=[16], audio=[(0x09, 0x07, 0x07)]),
+                   arguments=["--audio-sink-filter"], told=["leave --audio-sink-filter away"])
+
+    def test_one_whose_sample_rates_the_sink_does_not_have(self):
+        text = platform(audio=(0x077F09, 0x504015))  # AC-3 at 192 kHz
+        self.check("ac3", "audio", 2, text, sinks.sink(vics=[16], audio=[(0x09, 0x07, 0x07), (0x15, 0x07, 0x50)]),
+                   arguments=["--audio-sink-filter"], told=["leave --audio-sink-filter away"])
+
+    def test_one_whose_extension_is_not_announced(self):
+        self.check("ac3", "audio", 2, platform(name=""), told=["monitor_name"])
+
+    def test_one_that_much_stands_in_the_way_of(self):
+        self.check("mlp", "audio", 12, platform(pass_through=2), sinks.sink(vics=[16]),
+                   arguments=["--audio-sink-filter", "--audio-mask", "0x1"],
+                   told=["set audio.pass_through = 1", "add audio.entry_c", "leave --audio-sink-filter away",
+                         "give --audio-mask 0x801"])
+
+    def test_one_that_there_is_no_room_for(self):
+        # Types 1 to 12; byte 1 is the type and 2 channels.
+        text = platform(audio=[0x070700 | kind << 3 | 1 for kind in range(1, 13)])
+        line = self.line_of(text, "entry_k")
+        self.check("audio:12", "audio", 12, text,
+                   told=[f"take audio.entry_k out (box.toml:{line})", "take audio.entry_j out"])
+
+    def test_one_that_would_be_one_too_many(self):
+        text = platform(audio=[0x070700 | kind << 3 | 1 for kind in range(1, 11)])
+        self.check("dts-hd", "audio", 11, text, told=["add audio.entry_k", "take audio.entry_j out"])
+
+    def test_one_that_another_covers_is_offered(self):
+        status, (answer,) = self.ask(platform(audio=(0x077F09, 0x500715, 0x500711)), None, (), "ac3")
+        self.assertEqual((status, answer["offered"]), (0, True))
+
+
+class Usage(WantTest):
+    def test_what_is_no_mode_is_refused_with_status_2(self):
+        for wanted in ("0", "65", "99999999999", "4k:0", "4k:5", "4k:", "audio:0", "audio:15", "audio:19", "audio:x",
+                       "1920x1080", "1920x1080p61", "vorbis", ""):
+            with self.subTest(wanted=wanted):
+                status, printed, complaints = self.run_program("explain", "--want", wanted)
+                self.assertEqual((status, printed), (2, ""))
+                self.assertTrue(re.match(r"edid-composer: --want: .*\n\Z", complaints), complaints)
+
+    def test_every_audio_type_can_be_asked_for_by_name(self):
+        names = {"pcm": 1, "AC3": 2, "mpeg1": 3, "mp3": 4, "mpeg2": 5, "aac": 6, "dts": 7, "atrac": 8, "dsd": 9,
+                 "eac3": 10, "dts-hd": 11, "truehd": 12, "dst": 13, "wma-pro": 14, "he-aac": 16, "he-aacv2": 17,
+                 "mpeg-surround": 18}
+        for name, kind in names.items():
+            _, (answer,) = self.ask(platform(), None, (), name)
+            self.assertTrue(answer["name"].endswith(f"(audio:{kind})"), answer["name"])
+
+    def test_every_vic_can_be_asked_for_by_its_own_name(self):
+        for vic in range(1, 65):
+            status, (answer,) = self.ask(platform(), None, (), str(vic))
+            name = answer["name"].split(" ")[0].replace("(1440)", "")
+            status, answers = self.ask(platform(), None, (), name)
+            self.assertIn(answer["name"], [found["name"] for found in answers])
+
+    def test_text_tells_the_same_as_json(self):
+        box = self.write("box.toml", platform())
+        status, printed, _ = self.run_program("explain", "--platform", box, "--want", "63")
+        self.assertEqual(status, 1)
+        self.assertEqual(printed.splitlines(), [
+            "1920x1080p120 16:9 (VIC 63) is not offered.",
+            "  Neither the sink nor any list of the platform names it.",
+            "To have it offered:",
+            '  - add "63" to 60_hz_priority_list (box.toml:4)',
+            '  - add "63" to 60_hz_addition_list (box.toml:10): the platform must be able to take it without the sink',
+        ])
+
+
+if __name__ == "__main__":
+    unittest.main()
