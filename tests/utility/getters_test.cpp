@@ -43,6 +43,14 @@ TEST(GetPcInt, ReadsAValueWithinItsLimits) {
             read_trace("get_pc_int", "tmds_override", "0"));
 }
 
+TEST(Getters, WithoutAKeyAskForOneThatIsCalledNull) {
+  const configuration_tree_t tree;
+  EXPECT_EQ(output_of([] { EXPECT_EQ(get_pc_int(nullptr, 0, 9, 5, true), 5); }),
+            absent_warning("get_pc_int", "(null)", "5"));
+  EXPECT_EQ(output_of([] { EXPECT_EQ(get_pc_uint(nullptr, 0, 9, 5, true), 5U); }),
+            absent_warning("get_pc_uint", "(null)", "5"));
+}
+
 TEST(GetPcInt, AsksForTheWholePathFromTheRoot) {
   configuration_tree_t tree;
   tree.set("audio.pass_through", 2);
