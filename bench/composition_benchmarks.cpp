@@ -1,4 +1,5 @@
 #include <array>
+#include <cstdint>
 #include <string>
 
 #include "edid_composer/platform_values_reader.h"
@@ -12,6 +13,7 @@ namespace bench {
 namespace {
 
 using output_t = std::array<u8, 256>;
+using u64_t = std::uint64_t;
 
 /// Measures a composition's time and heap calls, and the stack below it.
 template <typename operation_t>
@@ -32,6 +34,27 @@ void run_with_values(benchmark::State &state, const sink_t &sink) {
   });
 }
 
+void count(const compose_decision_t *, void *decisions) {
+  ++*static_cast<u64_t *>(decisions);
+}
+
+/// A composition from values that were read beforehand, with an observer or with a null pointer for one.
+void run_observed(benchmark::State &state, const sink_t &sink, compose_observer_t observer) {
+  load_default_platform();
+  values_t values;
+  edid_composer::_read_platform_values(values.get());
+  const compose_cfg_t cfg = sample_settings();
+  output_t output;
+  u64_t decisions = 0;
+  const auto compose = [&] {
+    compose_edid_observed(sink.data(), sink.size(), output.data(), output.size(), &cfg, values.get(), observer,
+                          &decisions);
+  };
+  compose();
+  state.counters["decisions"] = static_cast<double>(decisions);
+  measure_with_stack(state, compose);
+}
+
 void run_with_store(benchmark::State &state, const sink_t &sink) {
   load_default_platform();
   const compose_cfg_t cfg = sample_settings();
@@ -47,6 +70,10 @@ void register_composition_benchmarks() {
                                  [&sink](benchmark::State &state) { run_with_values(state, sink); });
     benchmark::RegisterBenchmark(("compose/with_store/" + sink.name).c_str(),
                                  [&sink](benchmark::State &state) { run_with_store(state, sink); });
+    benchmark::RegisterBenchmark(("compose/not_observed/" + sink.name).c_str(),
+                                 [&sink](benchmark::State &state) { run_observed(state, sink, nullptr); });
+    benchmark::RegisterBenchmark(("compose/observed/" + sink.name).c_str(),
+                                 [&sink](benchmark::State &state) { run_observed(state, sink, count); });
   }
 }
 

@@ -76,6 +76,18 @@ def floor_table(run, sink):
     return table(["", "List entries", "Heap bytes", "Floor, µs", "Measured, µs", "Times the floor"], rows)
 
 
+def observer_table(run):
+    """A composition through each of the two entries, without an observer and with one that counts."""
+    def row(sink):
+        alone, nobody, observed = (f"compose/{family}/{sink}" for family in ("with_values", "not_observed", "observed"))
+        return (sink, microseconds(run.time(alone)), microseconds(run.time(nobody)),
+                f"{run.time(nobody) / run.time(alone) - 1:+.1%}".replace("%", " %"), microseconds(run.time(observed)),
+                str(run.counter(observed, "decisions")))
+
+    heads = ["Sample sink", "`compose_edid_internal`, µs", "Null observer, µs", "Difference", "Observed, µs", "Decisions"]
+    return table(heads, map(row, run.of("compose/observed")))
+
+
 def growth_table(run):
     def row(family, what):
         points = run.series(family)

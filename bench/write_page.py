@@ -59,6 +59,7 @@ def sections(run, all_targets, options):
     yield "sinks", tables.sink_table(run)
     yield "stages", tables.stage_table(run, SINK)
     yield "floor", tables.floor_table(run, SINK)
+    yield "observer", tables.observer_table(run)
     yield "growth", tables.growth_table(run)
     yield "size", tables.size_table(options.library)
     yield "profile", tables.profile_table(options.build / "bin" / "cost_workloads")
