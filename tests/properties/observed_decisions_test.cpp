@@ -284,7 +284,7 @@ TEST(RandomObservation, GivesEveryCandidateOneVerdictAndOffersWhatTheBytesSay) {
 }
 
 TEST(RandomObservation, ChangesNeitherBytesNorLines) {
-  for_each_run(1000, [&](random_source_t &random) {
+  for_each_run(400, [&](random_source_t &random) {
     const situation_t situation = any_situation(random);
     debug_enable(random.chance(50));
     const observed_t observed = observe(situation, keep);

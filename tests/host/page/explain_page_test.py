@@ -37,7 +37,9 @@ class PageTest(explaining.ExplainTest):
         page = self.folder / "page.html"
         self.browser.requests()
         self.browser.open(page)
-        self.assertEqual([url for url in self.browser.requests() if url not in (page.as_uri(), "data:,")], [])
+        # Nothing leaves the machine for a data: URL; the browser has some of its own.
+        asked_for = [url for url in self.browser.requests() if not url.startswith("data:")]
+        self.assertEqual([url for url in asked_for if url != page.as_uri()], [])
         self.assertEqual(self.browser.console(), [])
 
     def shown(self):
