@@ -37,8 +37,7 @@ bytes_t sample_sink_t::build() const {
   extension.flags(0x70).block(test_support::video_block(video));
   if (end != end_t::behind_video) extension.block(test_support::audio_block(audio));
   if (end == end_t::none) {
-    extension.block(test_support::data_block(4, {0x01, 0, 0}))
-        .block(test_support::hdmi_block(hdmi));
+    extension.block(test_support::data_block(4, {0x01, 0, 0})).block(test_support::hdmi_block(hdmi));
   } else {
     extension.block(overrunning_block);
   }

@@ -13,7 +13,8 @@ namespace {
 using testing::HasSubstr;
 using testing::MatchesRegex;
 
-constexpr const char *commands[] = {"compose", "explain", "print", "diff", "sinks", "check-platform", "audio-mask", "platform"};
+constexpr const char *commands[] = {"compose", "explain",        "print",      "diff",
+                                    "sinks",   "check-platform", "audio-mask", "platform"};
 
 TEST(Help, ListsTheCommandsOnStandardOutput) {
   const process_result_t result = run_cli({"--help"});
