@@ -515,7 +515,7 @@ EDID_COMPOSER_API bool compose_edid_internal(const u8 *edid_block, u32 edid_byte
 
 /** @defgroup explaining Why an EDID offers what it offers
  *
- * A composition can be observed: @ref compose_edid_observed tells, for everything that could have been in the new EDID,
+ * A composition can be observed: @ref compose_edid_request reports, for everything that could have been in the new EDID,
  * whether it is there, and why. Each candidate gets exactly one record: each VIC that the sink, a priority list or an
  * addition list names, each 4Kx2K mode, each audio format of the platform and of the sink; and so does each of the
  * derived values that @ref compose_subject lists. A record tells what became of its candidate in the bytes that were
@@ -663,31 +663,9 @@ typedef struct compose_decision_t {
  * Hears of a decision.
  *
  * @param decision the record; it is gone when the call returns.
- * @param context what @ref compose_edid_observed was given.
+ * @param context @ref compose_request_t::observer_context.
  */
 typedef void (*compose_observer_t)(const compose_decision_t *decision, void *context);
-
-/**
- * As @ref compose_edid_internal, and tells @p observer of every decision, once, after the new EDID was written and
- * before the call returns: video modes, 4Kx2K modes, audio formats, derived values, in no order to rely on.
- *
- * What is written and printed is the same with an observer and without. An observed composition needs one more list
- * entry for each decision. When one can't be had, that is reported, the composition goes on, and nothing is told.
- *
- * @param edid_block as for @ref compose_edid.
- * @param edid_bytes as for @ref compose_edid.
- * @param new_edid_block as for @ref compose_edid.
- * @param new_edid_bytes as for @ref compose_edid.
- * @param cfg as for @ref compose_edid.
- * @param platform_values as for @ref compose_edid_internal.
- * @param observer called on the calling thread. NULL: exactly @ref compose_edid_internal.
- * @param context goes to @p observer as it is.
- * @return as for @ref compose_edid_internal. On false nothing was told.
- */
-EDID_COMPOSER_API bool compose_edid_observed(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block,
-                                             u32 new_edid_bytes, const compose_cfg_t *cfg,
-                                             const platform_values_t *platform_values, compose_observer_t observer,
-                                             void *context);
 
 /** @return the subject in words, such as "video mode"; "unknown" for any other number. Static. */
 EDID_COMPOSER_API const char *compose_subject_string(u32 subject);
@@ -698,6 +676,130 @@ EDID_COMPOSER_API const char *compose_verdict_string(u32 verdict);
 /** @return the reason in words, such as "the priority list does not name it"; "unknown" for any other number. Static.
  */
 EDID_COMPOSER_API const char *compose_reason_string(u32 reason);
+/** @} */
+
+/** @defgroup request A composition as one request
+ *
+ * @ref compose_edid_request does what @ref compose_edid_internal does and returns more: what became of the sink's EDID,
+ * why the new EDID offers what it offers, and every line of the call by callback instead of standard output.
+ * @{ */
+
+/** What kind of line a composition has written; @ref compose_log_line_t::kind. */
+enum compose_log_kind {
+  COMPOSE_LOG_ERROR = 1,   /**< On standard output: `module:line:function() ERROR: text`. */
+  COMPOSE_LOG_WARNING = 2, /**< On standard output: `module:line:function() WARNING: text`. */
+  COMPOSE_LOG_BUG = 3,     /**< On standard output: `module:line:function() BUG: text`. */
+  COMPOSE_LOG_TRACE = 4,   /**< On standard output: the text, then ` \t\t\tfunction():line`. */
+  COMPOSE_LOG_TEXT = 5     /**< A line of a report or of a dump: on standard output the text alone. */
+};
+
+/** One line of a composition. The texts are valid until the callback returns. */
+typedef struct compose_log_line_t {
+  u32 size;             /**< Bytes of the record that the library fills. A later version may append members. */
+  u32 kind;             /**< @ref compose_log_kind. */
+  const char *module;   /**< The module that reports, such as "edid_composer"; "" for @ref COMPOSE_LOG_TEXT. */
+  const char *function; /**< The operation that reports; "" for @ref COMPOSE_LOG_TEXT. */
+  u32 line;             /**< Line number in the library's source; 0 for @ref COMPOSE_LOG_TEXT. */
+  const char *text;     /**< The message, NUL-terminated, without the newline that ends the line on standard output.
+                             Up to 1023 bytes; the rest of a longer one is cut. Texts of the sink and of the platform
+                             stand in it as they are, control characters included. */
+} compose_log_line_t;
+
+/**
+ * Receives a line.
+ *
+ * Called on the thread that composes, once for each line, in order. It may call operations of this library: what they
+ * print is not part of the composition and goes to standard output.
+ *
+ * @param line the line; it is gone when the call returns.
+ * @param context @ref compose_request_t::log_context.
+ */
+typedef void (*compose_log_t)(const compose_log_line_t *line, void *context);
+
+/** What became of the sink's base block; @ref compose_result_t::sink_status. */
+enum compose_sink_status {
+  COMPOSE_SINK_NONE = 1,                /**< No sink was given: a NULL pointer, or no bytes. */
+  COMPOSE_SINK_READ = 2,                /**< The base block was read. */
+  COMPOSE_SINK_LENGTH_INVALID = 3,      /**< Not read: its length is no multiple of 128 bytes. */
+  COMPOSE_SINK_HEADER_INVALID = 4,      /**< Refused: bytes 0 to 7 are not the header (EDID 1.3, section 3.1). */
+  COMPOSE_SINK_CHECKSUM_INVALID = 5,    /**< Refused: the 128 bytes do not sum to 0 (EDID 1.3, section 3.12). */
+  COMPOSE_SINK_VERSION_UNSUPPORTED = 6, /**< Refused: neither version 1.3 nor a later revision of version 1. */
+  COMPOSE_SINK_DESCRIPTOR_INVALID = 7,  /**< Reading ended at a malformed 18-byte descriptor: what stands before it is
+                                             used, what follows it and the extension are not. */
+  COMPOSE_SINK_OUT_OF_MEMORY = 8        /**< Reading ended because a list entry could not be had. */
+};
+
+/** What became of the sink's block 1; @ref compose_result_t::sink_extension_status. */
+enum compose_extension_status {
+  COMPOSE_EXTENSION_NOT_LOOKED_AT = 1,        /**< The base block was not read to its end, so block 1 was not either. */
+  COMPOSE_EXTENSION_NOT_ANNOUNCED = 2,        /**< The base block announces no extension (byte 126 is 0). */
+  COMPOSE_EXTENSION_READ = 3,                 /**< Block 1 was read as CEA-861 extension. */
+  COMPOSE_EXTENSION_MISSING = 4,              /**< Announced, but the sink has no more than 128 bytes. */
+  COMPOSE_EXTENSION_NOT_CEA = 5,              /**< Refused: its tag (byte 0) is not 2. */
+  COMPOSE_EXTENSION_REVISION_UNSUPPORTED = 6, /**< Refused: its revision (byte 1) is not 3. */
+  COMPOSE_EXTENSION_CHECKSUM_INVALID = 7,     /**< Refused: its 128 bytes do not sum to 0. */
+  COMPOSE_EXTENSION_OFFSET_UNSUPPORTED = 8,   /**< Refused: its detailed timings (byte 2) begin after byte 110, which
+                                                   the standard allows and this library does not. */
+  COMPOSE_EXTENSION_MALFORMED = 9,            /**< A data block overruns its collection: what stands before it is used.
+                                                   See @ref compose_result_t::sink_malformed_at. */
+  COMPOSE_EXTENSION_OUT_OF_MEMORY = 10        /**< Reading ended because a list entry could not be had. */
+};
+
+/**
+ * What a composition works from. Zero-fill it, set @ref size, and set what is needed.
+ *
+ * Later versions append members; one that is not there, because the caller was compiled earlier, counts as zero.
+ */
+typedef struct compose_request_t {
+  u32 size;                                 /**< sizeof(compose_request_t) of the caller. */
+  u32 sink_bytes;                           /**< Size of the sink's EDID, bytes: a multiple of 128. */
+  const u8 *sink;                           /**< The sink's EDID, or NULL when there is none. */
+  u8 *new_edid;                             /**< Receives the new EDID; may be the buffer of @ref sink. */
+  u32 new_edid_bytes;                       /**< Size of that buffer, bytes: 256. */
+  const compose_cfg_t *settings;            /**< The caller's settings; not NULL. */
+  const platform_values_t *platform_values; /**< As for @ref compose_edid_internal; NULL: the configuration is read. */
+  compose_observer_t observer;              /**< Receives each decision after the new EDID was written; may be NULL. */
+  void *observer_context;                   /**< Goes to @ref observer as it is. */
+  compose_log_t log;                        /**< Receives each line of the call instead of standard output; may be NULL.
+                                                 Whether traces are among them is the affair of @ref debug_enable. */
+  void *log_context;                        /**< Goes to @ref log as it is. */
+} compose_request_t;
+
+/** What a composition returns. Set @ref size; all other members are filled, on failure too. */
+typedef struct compose_result_t {
+  u32 size;                    /**< sizeof(compose_result_t) of the caller. */
+  u32 bytes_written;           /**< Bytes of the new EDID: 256; 0 when the composition failed. */
+  u32 physical_address_offset; /**< Offset of the physical address' two bytes in the new EDID, so that a host can patch
+                                    them for each input; 0 when the composition failed. */
+  u32 sink_status;             /**< What became of the sink's base block; @ref compose_sink_status. 0 when the call was
+                                    refused before the sink was looked at. */
+  u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. */
+  u32 sink_malformed_at;       /**< With @ref COMPOSE_EXTENSION_MALFORMED: the byte of block 1, from 0, at which the
+                                    data block begins that overruns; else 0. */
+  u32 sink_blocks_unread;      /**< Extension blocks after block 1 that are announced and given, but not read. */
+} compose_result_t;
+
+/**
+ * Composes as @ref compose_edid_internal does, from a request record into a result record.
+ *
+ * What is written, and every line, is the same as from @ref compose_edid_internal, in whose name the lines are, with an
+ * observer or a log callback and without. An observed composition needs list entries of its own; when one cannot be
+ * had, that is reported, the composition goes on, and no decision is passed on.
+ *
+ * Several threads may compose at once, each with its own request, result and buffers; each call's lines go to its own
+ * callback.
+ *
+ * @param request not NULL; its @ref compose_request_t::size is that of this version or larger. Only read.
+ * @param result not NULL; its @ref compose_result_t::size likewise.
+ * @return true when the new EDID was written. On false no decision was passed on.
+ */
+EDID_COMPOSER_API bool compose_edid_request(const compose_request_t *request, compose_result_t *result);
+
+/** @return the status in words, such as "base block refused: checksum"; "unknown" for any other number. Static. */
+EDID_COMPOSER_API const char *compose_sink_status_string(u32 status);
+
+/** @return the status in words, such as "refused: not a CEA-861 extension"; "unknown" for any other number. Static. */
+EDID_COMPOSER_API const char *compose_extension_status_string(u32 status);
 /** @} */
 
 /** @defgroup inspection Looking at an EDID

@@ -1,11 +1,10 @@
 #include "edid_composer/audio_formats.h"
 
-#include <cstdio>
-
 #include "diagnostics.h"
 #include "edid_composer/audio_verdicts.h"
 #include "linked_list/new_entry.h"
 #include "linked_list/walk.h"
+#include "output.h"
 
 namespace edid_composer {
 namespace {
@@ -101,7 +100,7 @@ bool ensure_basic_audio(const site_t &site, ll_list_t *ret_list, decisions_t *de
   if (!basic.add_to_front(ret_list)) return false;
   if (decisions != nullptr) note_basic_audio(decisions, *basic);
   if (debug_enabled()) {
-    std::printf("\t");
+    print("\t");
     print_audio_structure(&*basic);
   }
   return true;

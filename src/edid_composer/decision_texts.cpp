@@ -91,6 +91,30 @@ constexpr text_t reason_texts[] = {
     {COMPOSE_REASON_NOT_ANNOUNCED, "without a monitor name the extension is not announced"},
 };
 
+constexpr text_t sink_status_texts[] = {
+    {COMPOSE_SINK_NONE, "none given"},
+    {COMPOSE_SINK_READ, "read"},
+    {COMPOSE_SINK_LENGTH_INVALID, "not read: the length is no multiple of 128 bytes"},
+    {COMPOSE_SINK_HEADER_INVALID, "base block refused: header"},
+    {COMPOSE_SINK_CHECKSUM_INVALID, "base block refused: checksum"},
+    {COMPOSE_SINK_VERSION_UNSUPPORTED, "base block refused: version below 1.3"},
+    {COMPOSE_SINK_DESCRIPTOR_INVALID, "base block read up to a malformed descriptor"},
+    {COMPOSE_SINK_OUT_OF_MEMORY, "base block not read to its end: out of memory"},
+};
+
+constexpr text_t extension_status_texts[] = {
+    {COMPOSE_EXTENSION_NOT_LOOKED_AT, "not looked at"},
+    {COMPOSE_EXTENSION_NOT_ANNOUNCED, "none announced"},
+    {COMPOSE_EXTENSION_READ, "read"},
+    {COMPOSE_EXTENSION_MISSING, "announced but missing"},
+    {COMPOSE_EXTENSION_NOT_CEA, "refused: not a CEA-861 extension"},
+    {COMPOSE_EXTENSION_REVISION_UNSUPPORTED, "refused: revision other than 3"},
+    {COMPOSE_EXTENSION_CHECKSUM_INVALID, "refused: checksum"},
+    {COMPOSE_EXTENSION_OFFSET_UNSUPPORTED, "refused: detailed timings after byte 110"},
+    {COMPOSE_EXTENSION_MALFORMED, "read up to a data block that overruns its collection"},
+    {COMPOSE_EXTENSION_OUT_OF_MEMORY, "not read to its end: out of memory"},
+};
+
 template <std::size_t count>
 constexpr bool are_in_order(const text_t (&texts)[count]) {
   for (u32 i = 0; i < count; ++i) {
@@ -133,6 +157,8 @@ struct joined_t {
 constexpr joined_t<subject_texts> subjects;
 constexpr joined_t<verdict_texts> verdicts;
 constexpr joined_t<reason_texts> reasons;
+constexpr joined_t<sink_status_texts> sink_statuses;
+constexpr joined_t<extension_status_texts> extension_statuses;
 
 /// The text of a number from 1 to @p count.
 const char *text_of(u32 number, const char *texts, std::size_t count) {
@@ -157,4 +183,12 @@ const char *compose_verdict_string(u32 verdict) {
 
 const char *compose_reason_string(u32 reason) {
   return text_of(reason, reasons.characters, std::size(reason_texts));
+}
+
+const char *compose_sink_status_string(u32 status) {
+  return text_of(status, sink_statuses.characters, std::size(sink_status_texts));
+}
+
+const char *compose_extension_status_string(u32 status) {
+  return text_of(status, extension_statuses.characters, std::size(extension_status_texts));
 }

@@ -1,7 +1,7 @@
-#include <cstdio>
 
 #include "diagnostics.h"
 #include "edid_decode_encode/checksum.h"
+#include "output.h"
 
 namespace edid_composer {
 namespace {
@@ -54,17 +54,17 @@ void print_edid(const u8 *edid_block, u32 size, u8 brief, const char *title) {
 
 void print_edid_audio_mask(u32 mask) {
   constexpr u32 all_formats = 0xFFFFFFFF;
-  std::printf("EDID: Audio mask: 0x%08X => ", mask);
+  print("EDID: Audio mask: 0x%08X => ", mask);
   if (mask == all_formats) {
-    std::printf("All audio formats supported");
+    print("All audio formats supported");
   } else if (mask == 0) {
-    std::printf("No audio formats");
+    print("No audio formats");
   } else {
     u32 bit = 1;
     for (const auto &name : audio_mask_names) {
-      if ((mask & bit) != 0) std::printf("%s", name);
+      if ((mask & bit) != 0) print("%s", name);
       bit <<= 1;
     }
   }
-  std::printf("\n");
+  print("\n");
 }

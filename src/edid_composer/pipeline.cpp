@@ -1,4 +1,5 @@
 // The road of one composition, from the caller's arguments to the bytes of the new EDID.
+#include <algorithm>
 #include <optional>
 
 #include "diagnostics.h"
@@ -13,24 +14,16 @@
 #include "edid_decode_encode/base_block_layout.h"
 #include "edid_decode_encode/cea_extension_layout.h"
 #include "edid_decode_encode/checksum.h"
+#include "edid_decode_encode/decoder.h"
 #include "edid_decode_encode/encoder.h"
 #include "linked_list/element_types.h"
+#include "output.h"
 
 namespace edid_composer {
 namespace {
 
 constexpr u32 smallest_size = block_size;
 constexpr u32 largest_size = 2 * block_size;
-
-/// The caller's arguments.
-struct request_t {
-  const u8 *edid_block;
-  u32 edid_bytes;
-  u8 *new_edid_block;
-  u32 new_edid_bytes;
-  const compose_cfg_t *cfg;
-  const platform_values_t *platform_values;
-};
 
 /// The records of one composition. They start zero-filled, so that one that was never prepared is destroyed cleanly.
 struct workspace_t {
@@ -41,29 +34,29 @@ struct workspace_t {
 };
 
 /// A sink's EDID that can't be read is left out, not refused.
-bool is_sink_usable(const site_t &site, const request_t &request) {
+bool is_sink_usable(const site_t &site, const compose_request_t &request) {
   bool usable = true;
-  if (request.edid_block == nullptr) {
+  if (request.sink == nullptr) {
     usable = false;
     LOG_TRACE_AS(site,
                  "\"edid_block\" memory block parameter is NULL. Skipping edid reading and proceeding with creation. "
                  "edid_block:%p",
-                 address(request.edid_block));
+                 address(request.sink));
   }
-  if (request.edid_bytes == 0 || request.edid_bytes % block_size != 0) {
+  if (request.sink_bytes == 0 || request.sink_bytes % block_size != 0) {
     usable = false;
     LOG_TRACE_AS(site,
                  "Edid is not an valid value. edid_bytes=%d Range=(%d-%d) Skipping edid reading and proceeding with "
                  "creation.",
-                 request.edid_bytes, smallest_size, largest_size);
+                 request.sink_bytes, smallest_size, largest_size);
   }
   return usable;
 }
 
-bool is_output_valid(const site_t &site, const request_t &request) {
-  if (request.new_edid_block == nullptr) {
+bool is_output_valid(const site_t &site, const compose_request_t &request) {
+  if (request.new_edid == nullptr) {
     LOG_ERROR_AS(site, "\"new_edid_block\" memory block parameter is NULL. Unable to proceed. new_edid_block:%p",
-                 address(request.new_edid_block));
+                 address(request.new_edid));
     return false;
   }
   if (request.new_edid_bytes < smallest_size || request.new_edid_bytes > largest_size) {
@@ -71,8 +64,8 @@ bool is_output_valid(const site_t &site, const request_t &request) {
                  request.new_edid_bytes, largest_size);
     return false;
   }
-  if (request.cfg == nullptr) {
-    LOG_ERROR_AS(site, "cfg is NULL. Unable to proceed. cfg : %p.", address(request.cfg));
+  if (request.settings == nullptr) {
+    LOG_ERROR_AS(site, "cfg is NULL. Unable to proceed. cfg : %p.", address(request.settings));
     return false;
   }
   return true;
@@ -94,22 +87,28 @@ bool prepare(const site_t &site, workspace_t *work) {
   return true;
 }
 
-void decode_sink(const site_t &site, const request_t &request, edid_t *edid) {
+void decode_sink(const site_t &site, const compose_request_t &request, edid_t *edid, compose_result_t *result) {
+  result->sink_extension_status = COMPOSE_EXTENSION_NOT_LOOKED_AT;
   LOG_TRACE_AS(site, "Decode EDID Block %d", 0);
-  _dump_raw_edid_block(request.edid_block, 1);
-  if (decode_edid_block_0(request.edid_block, edid) != 1) {
+  _dump_raw_edid_block(request.sink, 1);
+  result->sink_status = decode_base_block(request.sink, edid);
+  if (result->sink_status != COMPOSE_SINK_READ) {
     LOG_ERROR_AS(site, "Failed decoding the edid block 0. Continuing.");
     return;
   }
+  result->sink_extension_status = COMPOSE_EXTENSION_NOT_ANNOUNCED;
   if (edid->extension_count == 0) return;
   // A sink may announce an extension that it doesn't have.
-  const u32 length = request.edid_bytes - block_size;
-  const u8 *const extension = request.edid_block + block_size;
+  const u32 length = request.sink_bytes - block_size;
+  const u8 *const extension = request.sink + block_size;
   LOG_TRACE_AS(site, "Decode EDID Block 1");
   _dump_raw_edid_block(extension, length >= block_size ? 1 : 0);
-  if (decode_edid_extensions(extension, length, edid) != 1) {
-    LOG_ERROR_AS(site, "Failed decoding the extension. Continuing.");
-  }
+  const extension_outcome_t outcome = decode_cea_extension(extension, length, edid);
+  if (outcome.status != COMPOSE_EXTENSION_READ) LOG_ERROR_AS(site, "Failed decoding the extension. Continuing.");
+  result->sink_extension_status = length == 0 ? COMPOSE_EXTENSION_MISSING : outcome.status;
+  result->sink_malformed_at = outcome.malformed_at;
+  const u32 blocks = std::min<u32>(edid->extension_count, length / block_size);
+  result->sink_blocks_unread = blocks > 1 ? blocks - 1 : 0;
 }
 
 void note_room(decisions_t *decisions, const extension_size_t &size, const u8 *new_edid) {
@@ -131,9 +130,9 @@ void note_room(decisions_t *decisions, const extension_size_t &size, const u8 *n
 }
 
 /// The stages, each from its inputs into the new record or the list of modes.
-bool run_stages(const site_t &site, const request_t &request, const platform_values_t *values, u8 port,
-                decisions_t *decisions, workspace_t *work) {
-  const compose_cfg_t *const cfg = request.cfg;
+bool run_stages(const site_t &site, const compose_request_t &request, const platform_values_t *values, u8 port,
+                decisions_t *decisions, workspace_t *work, compose_result_t *result) {
+  const compose_cfg_t *const cfg = request.settings;
   if (_filter_video_modes(&work->edid, cfg, &work->modes, values, decisions) != 1) {
     LOG_ERROR_AS(site, "Failed filtering the video modes.");
     return false;
@@ -154,14 +153,19 @@ bool run_stages(const site_t &site, const request_t &request, const platform_val
     return false;
   }
   extension_size_t size{};
-  if (encode_and_measure_edid(request.new_edid_block, static_cast<i32>(request.new_edid_bytes), &work->new_edid,
-                              cfg->spa_offset, values, &size) != 1) {
+  u8 spa_offset = 0;
+  const bool encoded = encode_and_measure_edid(request.new_edid, static_cast<i32>(request.new_edid_bytes),
+                                               &work->new_edid, &spa_offset, values, &size) == 1;
+  if (spa_offset != 0 && cfg->spa_offset != nullptr) *cfg->spa_offset = spa_offset;
+  if (!encoded) {
     LOG_ERROR_AS(site, "Failed encoding the new edid.");
     return false;
   }
+  result->bytes_written = largest_size;
+  result->physical_address_offset = spa_offset;
   if (decisions != nullptr) {
-    note_room(decisions, size, request.new_edid_block);
-    settle_decisions(decisions, request.new_edid_block);
+    note_room(decisions, size, request.new_edid);
+    settle_decisions(decisions, request.new_edid);
   }
   return true;
 }
@@ -184,8 +188,8 @@ void trace_result(const site_t &site, const u8 *new_edid_block) {
   if (edid_destroy(&edid) != 1) LOG_WARNING_AS(site, "Failed to destroy the debug edid.");
 }
 
-bool compose(const site_t &site, const request_t &request, bool sink_usable, decisions_t *decisions,
-             workspace_t *work) {
+bool compose(const site_t &site, const compose_request_t &request, bool sink_usable, decisions_t *decisions,
+             workspace_t *work, compose_result_t *result) {
   const platform_values_t *values = request.platform_values;
   if (values == nullptr) {
     values = &work->platform_values;
@@ -194,16 +198,16 @@ bool compose(const site_t &site, const request_t &request, bool sink_usable, dec
       return false;
     }
   }
-  const auto port = static_cast<u8>((request.cfg->port + 1) & 0xFF);
+  const auto port = static_cast<u8>((request.settings->port + 1) & 0xFF);
   if (!prepare(site, work)) return false;
   if (sink_usable) {
-    decode_sink(site, request, &work->edid);
+    decode_sink(site, request, &work->edid, result);
   } else {
     LOG_TRACE_AS(site, "Valid edid not available. Continuing composing edid. Passed in edid:%p size:%d bytes",
-                 address(request.edid_block), request.edid_bytes);
+                 address(request.sink), request.sink_bytes);
   }
-  if (!run_stages(site, request, values, port, decisions, work)) return false;
-  trace_result(site, request.new_edid_block);
+  if (!run_stages(site, request, values, port, decisions, work, result)) return false;
+  trace_result(site, request.new_edid);
   return true;
 }
 
@@ -215,12 +219,19 @@ void clean_up(const site_t &site, workspace_t *work) {
   platform_values_destroy(&work->platform_values);
 }
 
+/// The status of a sink that is not decoded.
+compose_sink_status unread_status(const compose_request_t &request) {
+  return request.sink == nullptr || request.sink_bytes == 0 ? COMPOSE_SINK_NONE : COMPOSE_SINK_LENGTH_INVALID;
+}
+
 /// A composition, in the name of compose_edid_internal().
-bool compose_observed(const request_t &request, compose_observer_t observer, void *context) {
+bool compose_request(const compose_request_t &request, compose_result_t *result) {
   const site_t site{EDID_COMPOSER_MODULE, "compose_edid_internal", __LINE__};
   const bool sink_usable = is_sink_usable(site, request);
   if (!is_output_valid(site, request)) return false;
 
+  result->sink_status = unread_status(request);
+  result->sink_extension_status = COMPOSE_EXTENSION_NOT_LOOKED_AT;
   workspace_t work;
   if (!platform_values_init(&work.platform_values)) {
     LOG_ERROR_AS(site, "Failed initializing platfrom values.");
@@ -231,17 +242,22 @@ bool compose_observed(const request_t &request, compose_observer_t observer, voi
     return false;
   }
   std::optional<decisions_t> decisions;
-  if (observer != nullptr) decisions.emplace(site);
-  const bool composed = compose(site, request, sink_usable, decisions ? &*decisions : nullptr, &work);
+  if (request.observer != nullptr) decisions.emplace(site);
+  const bool composed = compose(site, request, sink_usable, decisions ? &*decisions : nullptr, &work, result);
   clean_up(site, &work);
-  if (composed && decisions) decisions->tell(observer, context);
+  if (composed && decisions) decisions->tell(request.observer, request.observer_context);
   return composed;
+}
+
+[[gnu::noinline]] bool compose_logged(const compose_request_t &request, compose_result_t *result) {
+  const log_redirection_t redirection(request.log, request.log_context);
+  return compose_request(request, result);
 }
 
 }  // namespace
 }  // namespace edid_composer
 
-using edid_composer::compose_observed;
+using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
 
 bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
                   const compose_cfg_t *cfg) {
@@ -250,13 +266,51 @@ bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 
 
 bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
                            const compose_cfg_t *cfg, const platform_values_t *platform_values) {
-  return compose_edid_observed(edid_block, edid_bytes, new_edid_block, new_edid_bytes, cfg, platform_values, nullptr,
-                               nullptr);
+  const compose_request_t request{.size = sizeof(compose_request_t),
+                                  .sink_bytes = edid_bytes,
+                                  .sink = edid_block,
+                                  .new_edid = new_edid_block,
+                                  .new_edid_bytes = new_edid_bytes,
+                                  .settings = cfg,
+                                  .platform_values = platform_values,
+                                  .observer = nullptr,
+                                  .observer_context = nullptr,
+                                  .log = nullptr,
+                                  .log_context = nullptr};
+  compose_result_t unasked{};
+  return compose_request(request, &unasked);
 }
 
-bool compose_edid_observed(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
-                           const compose_cfg_t *cfg, const platform_values_t *platform_values,
-                           compose_observer_t observer, void *context) {
-  return compose_observed({edid_block, edid_bytes, new_edid_block, new_edid_bytes, cfg, platform_values}, observer,
-                          context);
+bool compose_edid_request(const compose_request_t *request, compose_result_t *result) {
+  if (request == nullptr) {
+    LOG_ERROR("\"request\" parameter is NULL. request:%p", address(request));
+    return false;
+  }
+  if (request->size < sizeof *request) {
+    LOG_ERROR("The request's size is too small. Expected at least:%u Received:%u", static_cast<u32>(sizeof *request),
+              request->size);
+    return false;
+  }
+  if (result == nullptr) {
+    LOG_ERROR("\"result\" parameter is NULL. result:%p", address(result));
+    return false;
+  }
+  if (result->size < sizeof *result) {
+    LOG_ERROR("The result's size is too small. Expected at least:%u Received:%u", static_cast<u32>(sizeof *result),
+              result->size);
+    return false;
+  }
+  *result = {.size = sizeof *result,
+             .bytes_written = 0,
+             .physical_address_offset = 0,
+             .sink_status = 0,
+             .sink_extension_status = 0,
+             .sink_malformed_at = 0,
+             .sink_blocks_unread = 0};
+  const bool composed = request->log == nullptr ? compose_request(*request, result) : compose_logged(*request, result);
+  if (!composed) {
+    result->bytes_written = 0;
+    result->physical_address_offset = 0;
+  }
+  return composed;
 }

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <cstdint>
-#include <cstdio>
 #include <cstring>
 #include <iterator>
 
@@ -12,6 +11,7 @@
 #include "edid_composer/video_verdicts.h"
 #include "linked_list/new_entry.h"
 #include "linked_list/walk.h"
+#include "output.h"
 #include "text_field.h"
 
 namespace edid_composer {
@@ -304,10 +304,10 @@ void trace_video_modes(const site_t &site, const ll_list_t *video_list) {
   if (!debug_enabled()) return;
   log_trace(HERE_AS(site), "\tNew EDID List of VICs:");
   for (const auto &video : walk<const short_video_desc_t>(LIST_AS(site, video_list))) {
-    std::printf("\t\tVIC:%d %s %s %s %s %s\n", video.vic, short_video_timing_string(video.vic),
-                (video.stereo & STEREO_FRAME_PACKING) != 0 ? "FP" : "",
-                (video.stereo & STEREO_SIDE_BY_SIDE_HALF) != 0 ? "SBSH" : "",
-                (video.stereo & STEREO_TOP_AND_BOTTOM) != 0 ? "TBH" : "", video.native != 0 ? "Native" : "      ");
+    print("\t\tVIC:%d %s %s %s %s %s\n", video.vic, short_video_timing_string(video.vic),
+          (video.stereo & STEREO_FRAME_PACKING) != 0 ? "FP" : "",
+          (video.stereo & STEREO_SIDE_BY_SIDE_HALF) != 0 ? "SBSH" : "",
+          (video.stereo & STEREO_TOP_AND_BOTTOM) != 0 ? "TBH" : "", video.native != 0 ? "Native" : "      ");
   }
   log_trace(HERE_AS(site), "\tEncoding the video timings: Num:%d", ll_size(video_list));
   log_trace(HERE_AS(site), "\tCreating the first 2 DTDs.");

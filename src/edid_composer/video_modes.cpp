@@ -1,20 +1,19 @@
 #include "edid_composer/video_modes.h"
 
-#include <cstdio>
-
 #include "diagnostics.h"
 #include "edid_composer/video_verdicts.h"
 #include "linked_list/new_entry.h"
 #include "linked_list/walk.h"
+#include "output.h"
 
 namespace edid_composer {
 namespace {
 
 /// One mode of a list, as trace; @p otherwise stands where native modes say so.
 void print_mode(const short_video_desc_t &video, const char *otherwise) {
-  std::printf("\t\tVIC:%d %s ", video.vic, short_video_timing_string(video.vic));
+  print("\t\tVIC:%d %s ", video.vic, short_video_timing_string(video.vic));
   print_stereo_type(video.stereo);
-  std::printf(" %s\n", video.native != 0 ? "Native" : otherwise);
+  print(" %s\n", video.native != 0 ? "Native" : otherwise);
 }
 
 constexpr const char *not_native_column = "      ";

@@ -1,6 +1,7 @@
 #include "diagnostics.h"
 #include "edid_decode_encode/base_block_layout.h"
 #include "edid_decode_encode/checksum.h"
+#include "edid_decode_encode/decoder.h"
 #include "edid_decode_encode/descriptor_decoder.h"
 #include "edid_decode_encode/descriptor_layout.h"
 #include "edid_decode_encode/record_lists.h"
@@ -85,7 +86,7 @@ bool decode_standard_timings(const site_t &site, const byte_view_t &block, edid_
   return true;
 }
 
-bool decode_descriptors(const site_t &site, const byte_view_t &block, edid_t *edid) {
+compose_sink_status decode_descriptors(const site_t &site, const byte_view_t &block, edid_t *edid) {
   for (u32 i = 0; i < base_block::descriptor_count; ++i) {
     const byte_view_t d = block.from(base_block::descriptors + i * descriptor_size);
     if (_decode_edid_dtd(d, edid) != 1) {
@@ -95,13 +96,35 @@ bool decode_descriptors(const site_t &site, const byte_view_t &block, edid_t *ed
                    "0x%x 0x%x 0x%x 0x%x",
                    i, d[0], d[1], d[2], d[3], d[4], d[5], d[6], d[7], d[8], d[9], d[10], d[11], d[12], d[13], d[14],
                    d[15], d[16], d[17]);
-      return false;
+      return d.little_endian_16(0) == 0 ? COMPOSE_SINK_DESCRIPTOR_INVALID : COMPOSE_SINK_OUT_OF_MEMORY;
     }
   }
-  return true;
+  return COMPOSE_SINK_READ;
 }
 
 }  // namespace
+
+compose_sink_status decode_base_block(const u8 *edid_block, edid_t *edid) {
+  constexpr site_t site{EDID_COMPOSER_MODULE, "decode_edid_block_0", 0};
+  if (!is_prepared(site, *edid)) return COMPOSE_SINK_OUT_OF_MEMORY;
+
+  const byte_view_t block(edid_block, block_size);
+  if (!verify_header(site, block)) return COMPOSE_SINK_HEADER_INVALID;
+  edid->valid = 1;
+  edid->checksum = block[checksum_offset];
+  if (!verify_checksum(site, block)) return COMPOSE_SINK_CHECKSUM_INVALID;
+  decode_identity(block, edid);
+  if (!verify_version(site, *edid)) return COMPOSE_SINK_VERSION_UNSUPPORTED;
+  edid->digital = (block[base_block::video_input] & base_block::digital_input) != 0 ? 1 : 0;
+  if (edid->digital == 0) LOG_WARNING_AS(site, "EDID inappropriately set to analog. Continuing.");
+  decode_features(block, edid);
+  if (!decode_standard_timings(site, block, edid)) return COMPOSE_SINK_OUT_OF_MEMORY;
+  if (const compose_sink_status status = decode_descriptors(site, block, edid); status != COMPOSE_SINK_READ)
+    return status;
+  edid->extension_count = block[base_block::extension_count];
+  return COMPOSE_SINK_READ;
+}
+
 }  // namespace edid_composer
 
 using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operation below is the namespace's API
@@ -115,20 +138,5 @@ u8 decode_edid_block_0(const u8 *edid_block, edid_t *edid) {
     LOG_ERROR("Function called with edid set to NULL.");
     return 0;
   }
-  if (!is_prepared(HERE, *edid)) return 0;
-
-  const byte_view_t block(edid_block, block_size);
-  if (!verify_header(HERE, block)) return 0;
-  edid->valid = 1;
-  edid->checksum = block[checksum_offset];
-  if (!verify_checksum(HERE, block)) return 0;
-  decode_identity(block, edid);
-  if (!verify_version(HERE, *edid)) return 0;
-  edid->digital = (block[base_block::video_input] & base_block::digital_input) != 0 ? 1 : 0;
-  if (edid->digital == 0) LOG_WARNING("EDID inappropriately set to analog. Continuing.");
-  decode_features(block, edid);
-  if (!decode_standard_timings(HERE, block, edid)) return 0;
-  if (!decode_descriptors(HERE, block, edid)) return 0;
-  edid->extension_count = block[base_block::extension_count];
-  return 1;
+  return decode_base_block(edid_block, edid) == COMPOSE_SINK_READ ? 1 : 0;
 }

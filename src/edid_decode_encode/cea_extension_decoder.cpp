@@ -1,6 +1,7 @@
 #include "diagnostics.h"
 #include "edid_decode_encode/cea_extension_layout.h"
 #include "edid_decode_encode/checksum.h"
+#include "edid_decode_encode/decoder.h"
 #include "edid_decode_encode/descriptor_decoder.h"
 #include "edid_decode_encode/descriptor_layout.h"
 #include "edid_decode_encode/hdmi_vendor_block_decoder.h"
@@ -14,27 +15,27 @@ namespace layout = cea_extension;
 constexpr new_entry_texts_t video_texts{"Failed creating new entry.", "Failed adding entry to the back.",
                                         "Failed deleting unused entry."};
 
-bool verify(const site_t &site, const byte_view_t &extension) {
+compose_extension_status verify(const site_t &site, const byte_view_t &extension) {
   if (extension[layout::tag] != layout::cea_tag) {
     LOG_ERROR_AS(site, "The extension is not a CEA extension. Expected=0x2 Received=0x%X", extension[layout::tag]);
-    return false;
+    return COMPOSE_EXTENSION_NOT_CEA;
   }
   if (extension[layout::revision] != layout::supported_revision) {
     LOG_ERROR_AS(site, "Extension is the wrong version. Expected=0x3 Received=0x%X", extension[layout::revision]);
-    return false;
+    return COMPOSE_EXTENSION_REVISION_UNSUPPORTED;
   }
   const u8 calculated = _calculate_checksum(extension);
   if (calculated != extension[checksum_offset]) {
     LOG_ERROR_AS(site, "Edid failed the checksum. Calculated:0x%02X Received:0x%02X", calculated,
                  extension[checksum_offset]);
-    return false;
+    return COMPOSE_EXTENSION_CHECKSUM_INVALID;
   }
   if (extension[layout::timings_offset] > layout::largest_timings_offset) {
     LOG_ERROR_AS(site, "EDID DTD offset value is larger than the block. Offset:%d\n",
                  extension[layout::timings_offset]);
-    return false;
+    return COMPOSE_EXTENSION_OFFSET_UNSUPPORTED;
   }
-  return true;
+  return COMPOSE_EXTENSION_READ;
 }
 
 /// Decodes the detailed timings behind the data blocks. A malformed one only logs.
@@ -124,7 +125,7 @@ bool decode_data_block(const site_t &site, const byte_view_t &block, u32 tag, u3
   return true;
 }
 
-bool decode_data_blocks(const site_t &site, const byte_view_t &extension, edid_t *edid) {
+extension_outcome_t decode_data_blocks(const site_t &site, const byte_view_t &extension, edid_t *edid) {
   const u32 timings_offset = extension[layout::timings_offset];
   // An offset that points into the extension's header makes the collection's size wrap: the walk then has no bound but
   // the bytes that are there.
@@ -140,15 +141,27 @@ bool decode_data_blocks(const site_t &site, const byte_view_t &extension, edid_t
                    "exceeds the length of the CEA extension's data block. Tag:%d Len:%d Current Byte:%d Data Block "
                    "Len:%d",
                    tag, length, i, size);
-      return false;
+      return {COMPOSE_EXTENSION_MALFORMED, offset};
     }
-    if (!decode_data_block(site, extension.from(offset), tag, length, edid)) return false;
+    if (!decode_data_block(site, extension.from(offset), tag, length, edid))
+      return {COMPOSE_EXTENSION_OUT_OF_MEMORY, 0};
     i += length + 1;
   }
-  return true;
+  return {COMPOSE_EXTENSION_READ, 0};
 }
 
 }  // namespace
+
+extension_outcome_t decode_cea_extension(const u8 *edid_extension, u32 length, edid_t *edid) {
+  constexpr site_t site{EDID_COMPOSER_MODULE, "decode_edid_extensions", 0};
+  const byte_view_t extension(edid_extension, length);
+  const compose_extension_status status = verify(site, extension);
+  if (status != COMPOSE_EXTENSION_READ) return {status, 0};
+  decode_flags(layout::support_flags, extension[layout::flags], edid);
+  decode_timings(extension, edid);
+  return decode_data_blocks(site, extension, edid);
+}
+
 }  // namespace edid_composer
 
 using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operation below is the namespace's API
@@ -162,9 +175,5 @@ u8 decode_edid_extensions(const u8 *edid_extension, u32 length, edid_t *edid) {
     LOG_ERROR("Function called with edid set to NULL.");
     return 0;
   }
-  const byte_view_t extension(edid_extension, length);
-  if (!verify(HERE, extension)) return 0;
-  decode_flags(layout::support_flags, extension[layout::flags], edid);
-  decode_timings(extension, edid);
-  return decode_data_blocks(HERE, extension, edid) ? 1 : 0;
+  return decode_cea_extension(edid_extension, length, edid).status == COMPOSE_EXTENSION_READ ? 1 : 0;
 }

@@ -1,10 +1,10 @@
 // The report of a decoded record.
 #include <algorithm>
-#include <cstdio>
 #include <iterator>
 
 #include "diagnostics.h"
 #include "linked_list/walk.h"
+#include "output.h"
 #include "text_field.h"
 #include "utility/timing_lines.h"
 
@@ -28,33 +28,33 @@ u32 hdmi_vic_count(const edid_t &edid) {
 
 /// One mode with its 3D structures, indented; the line goes on behind it.
 void print_mode(const char *indent, const short_video_desc_t &video) {
-  std::printf("%s%d\t%s ", indent, video.vic, short_video_timing_string(video.vic));
+  print("%s%d\t%s ", indent, video.vic, short_video_timing_string(video.vic));
   print_stereo_type(video.stereo);
 }
 
 void print_modes(const site_t &site, const char *indent, const edid_t *edid) {
   for (const auto &video : walk<const short_video_desc_t>(LIST_AS(site, &edid->video_list))) {
     print_mode(indent, video);
-    std::printf(" %s\n", native(video.native));
+    print(" %s\n", native(video.native));
   }
 }
 
 void print_mandatory_3d_modes(const char *indent) {
   for (const auto &mode : _3d_man_modes) {
     print_mode(indent, mode);
-    std::printf("\n");
+    print("\n");
   }
 }
 
 void print_hdmi_vics(const char *indent, const edid_t &edid) {
   for (u32 i = 0; i < hdmi_vic_count(edid); ++i) {
-    std::printf("%s%d\t%s\n", indent, edid.hdmi_vic[i], hdmi_vic_string(edid.hdmi_vic[i]));
+    print("%s%d\t%s\n", indent, edid.hdmi_vic[i], hdmi_vic_string(edid.hdmi_vic[i]));
   }
 }
 
 void print_audio(const site_t &site, const char *indent, const edid_t *edid) {
   for (const auto &audio : walk<const short_audio_desc_t>(LIST_AS(site, &edid->audio_list))) {
-    std::printf("%s", indent);
+    print("%s", indent);
     print_audio_structure(&audio);
   }
 }
@@ -64,83 +64,83 @@ void print_brief(const site_t &site, const edid_t *edid, const char *title) {
   const text_field_t monitor_name(edid->monitor_name);
   const text_field_t serial_string(edid->serial_string);
   const text_field_t data_string(edid->data_string);
-  std::printf("%s\n", title);
-  std::printf("\tManufacter   : %s\n", text_field_t(edid->manufacturer).c_str());
-  if (!monitor_name.empty()) std::printf("\tMonitor Name : \"%s\"\n", monitor_name.c_str());
-  std::printf("\tSerial Number: %d\n", edid->serial_number);
-  if (!serial_string.empty()) std::printf("\tSerial String: \"%s\"\n", serial_string.c_str());
-  if (!data_string.empty()) std::printf("\tData String  : \"%s\"\n", data_string.c_str());
-  std::printf("\n\tVics:\n");
+  print("%s\n", title);
+  print("\tManufacter   : %s\n", text_field_t(edid->manufacturer).c_str());
+  if (!monitor_name.empty()) print("\tMonitor Name : \"%s\"\n", monitor_name.c_str());
+  print("\tSerial Number: %d\n", edid->serial_number);
+  if (!serial_string.empty()) print("\tSerial String: \"%s\"\n", serial_string.c_str());
+  if (!data_string.empty()) print("\tData String  : \"%s\"\n", data_string.c_str());
+  print("\n\tVics:\n");
   print_modes(site, indent, edid);
   if (edid->hdmi_vic_len != 0) {
-    std::printf("\n\t4k x 2k Modes:\n");
+    print("\n\t4k x 2k Modes:\n");
     print_hdmi_vics(indent, *edid);
   }
   if (edid->hdmi_3d_present != 0) {
-    std::printf("\n\tMandatory 3D modes:\n");
+    print("\n\tMandatory 3D modes:\n");
     print_mandatory_3d_modes(indent);
   }
   if (ll_size(&edid->audio_list) > 0) {
-    std::printf("\n\tAudio:\n");
+    print("\n\tAudio:\n");
     print_audio(site, indent, edid);
   }
   const u8 *const address = edid->physical_address;
-  std::printf("\n\tAddress=%d.%d.%d.%d\n", address[0], address[1], address[2], address[3]);
+  print("\n\tAddress=%d.%d.%d.%d\n", address[0], address[1], address[2], address[3]);
 }
 
 void print_identity(const edid_t &edid) {
   const text_field_t monitor_name(edid.monitor_name);
   const text_field_t serial_string(edid.serial_string);
   const text_field_t data_string(edid.data_string);
-  std::printf("Version.Revision    = %d.%d\n", edid.version, edid.revision);
-  std::printf("Manufacture Name    = %s\n", text_field_t(edid.manufacturer).c_str());
-  if (!monitor_name.empty()) std::printf("Monitor name        = \"%s\"\n", monitor_name.c_str());
-  std::printf("Serial Number       = 0x%x\n", edid.serial_number);
-  if (!serial_string.empty()) std::printf("Serial String       = \"%s\"\n", serial_string.c_str());
-  if (!data_string.empty()) std::printf("Monitor data        = \"%s\"\n", data_string.c_str());
-  std::printf("Product Code        = 0x%x\n", edid.product_code);
-  std::printf("Week of manufacture = %u\n", edid.week);
-  std::printf("Year of manufacture = %u\n", edid.year);
+  print("Version.Revision    = %d.%d\n", edid.version, edid.revision);
+  print("Manufacture Name    = %s\n", text_field_t(edid.manufacturer).c_str());
+  if (!monitor_name.empty()) print("Monitor name        = \"%s\"\n", monitor_name.c_str());
+  print("Serial Number       = 0x%x\n", edid.serial_number);
+  if (!serial_string.empty()) print("Serial String       = \"%s\"\n", serial_string.c_str());
+  if (!data_string.empty()) print("Monitor data        = \"%s\"\n", data_string.c_str());
+  print("Product Code        = 0x%x\n", edid.product_code);
+  print("Week of manufacture = %u\n", edid.week);
+  print("Year of manufacture = %u\n", edid.year);
 }
 
 void print_features(const edid_t &edid) {
   const u32 gamma = edid.gamma + 100;
   // kept: no leading zero in the fraction.
-  std::printf("Gamma               = %d.%d\n", gamma / 100, gamma % 100);
+  print("Gamma               = %d.%d\n", gamma / 100, gamma % 100);
   if (edid.h_size_cm == 0 || edid.v_size_cm == 0) {
-    std::printf("Horizontal/Vertical image sizes are set to 0.\n");
+    print("Horizontal/Vertical image sizes are set to 0.\n");
   } else {
-    std::printf("Horizontal size     = %d cm (%d in)\n", edid.h_size_cm, inches_of_cm(edid.h_size_cm));
-    std::printf("Vertical size       = %d cm (%d in)\n", edid.v_size_cm, inches_of_cm(edid.v_size_cm));
+    print("Horizontal size     = %d cm (%d in)\n", edid.h_size_cm, inches_of_cm(edid.h_size_cm));
+    print("Vertical size       = %d cm (%d in)\n", edid.v_size_cm, inches_of_cm(edid.v_size_cm));
   }
-  std::printf("\nPower Management\n");
-  std::printf("\tStand-by              = %s\n", supported(edid.standby));
-  std::printf("\tSuspend               = %s\n", supported(edid.suspend));
-  std::printf("\tActive-off            = %s\n", supported(edid.active_off));
-  std::printf("\tStandard colorspace   = %s\n", true_or_false(edid.standard_colorspace != 0));
-  std::printf("\tPreferred timing mode = %s\n", true_or_false(edid.preferred_timing != 0));
-  std::printf("\tGTF                   = %s\n", supported(edid.gtf));
+  print("\nPower Management\n");
+  print("\tStand-by              = %s\n", supported(edid.standby));
+  print("\tSuspend               = %s\n", supported(edid.suspend));
+  print("\tActive-off            = %s\n", supported(edid.active_off));
+  print("\tStandard colorspace   = %s\n", true_or_false(edid.standard_colorspace != 0));
+  print("\tPreferred timing mode = %s\n", true_or_false(edid.preferred_timing != 0));
+  print("\tGTF                   = %s\n", supported(edid.gtf));
   // kept: the timing bytes stand under this heading; the chromaticity coordinates are not printed.
-  std::printf("\nColorimetry:\n");
+  print("\nColorimetry:\n");
   print_est_man_type(edid.est_timings_1, est_timing_1_string, "Established Timings 1");
   print_est_man_type(edid.est_timings_2, est_timing_2_string, "Established Timings 2");
   print_est_man_type(edid.man_timings, man_timing_string, "Manufacturer Timings");
 }
 
 void print_standard_timings(const site_t &site, const edid_t *edid) {
-  std::printf("\nStandard Timings: - %d timings\n", ll_size(&edid->std_timings));
+  print("\nStandard Timings: - %d timings\n", ll_size(&edid->std_timings));
   for (const auto &timing : walk<const std_timing_t>(LIST_AS(site, &edid->std_timings))) {
     struct aspect_t {
       u32 width;
       u32 height;
     };
     constexpr aspect_t aspects[] = {{1, 1}, {4, 3}, {5, 4}, {16, 9}};
-    std::printf("\t%dx", timing.h_active);
+    print("\t%dx", timing.h_active);
     if (timing.aspect_ratio < std::size(aspects)) {
       const aspect_t &aspect = aspects[timing.aspect_ratio];
-      std::printf("%d", timing.h_active * aspect.height / aspect.width);
+      print("%d", timing.h_active * aspect.height / aspect.width);
     }
-    std::printf("p%d\n", timing.refresh_rate);
+    print("p%d\n", timing.refresh_rate);
   }
 }
 
@@ -148,14 +148,14 @@ void print_detailed_timing(i32 number, const detailed_timing_t &timing) {
   const bool progressive = timing.progressive != 0;
   const u32 rate = calculate_refresh_rate(timing.pixel_clock, timing.h_active, timing.h_blanking, timing.v_active,
                                           timing.v_blanking);
-  std::printf("Timing %d: %dx%d%s%d\n", number, timing.h_active, progressive ? timing.v_active : timing.v_active * 2,
-              progressive ? "p" : "i", rate);
+  print("Timing %d: %dx%d%s%d\n", number, timing.h_active, progressive ? timing.v_active : timing.v_active * 2,
+        progressive ? "p" : "i", rate);
   for (const auto &line : timing_lines_t(timing))
-    std::printf("%s\n", line);
+    print("%s\n", line);
 }
 
 void print_detailed_timings(const site_t &site, const edid_t *edid) {
-  std::printf("\nDetailed Timing Descriptions: - %d timings\n", ll_size(&edid->dtd_list));
+  print("\nDetailed Timing Descriptions: - %d timings\n", ll_size(&edid->dtd_list));
   i32 number = 0;
   for (const auto &timing : walk<const detailed_timing_t>(LIST_AS(site, &edid->dtd_list))) {
     if (timing.valid != 0) print_detailed_timing(number, timing);
@@ -164,53 +164,52 @@ void print_detailed_timings(const site_t &site, const edid_t *edid) {
 }
 
 void print_limits(const edid_t &edid) {
-  std::printf("\nMonitor Limits:\n");
-  std::printf("\tMin Vertical Rate:   %d Hz\n", edid.min_v_rate);
-  std::printf("\tMax Vertical Rate:   %d Hz\n", edid.max_v_rate);
-  std::printf("\tMin Horizontal Rate: %d KHz\n", edid.min_h_rate);
-  std::printf("\tMax Horizontal Rate: %d KHz\n", edid.max_h_rate);
-  std::printf("\tMax Pixel Clock:     %d MHz\n", edid.max_pixel_clock);
-  std::printf("Number of extension blocks = %d\n", edid.extension_count);
+  print("\nMonitor Limits:\n");
+  print("\tMin Vertical Rate:   %d Hz\n", edid.min_v_rate);
+  print("\tMax Vertical Rate:   %d Hz\n", edid.max_v_rate);
+  print("\tMin Horizontal Rate: %d KHz\n", edid.min_h_rate);
+  print("\tMax Horizontal Rate: %d KHz\n", edid.max_h_rate);
+  print("\tMax Pixel Clock:     %d MHz\n", edid.max_pixel_clock);
+  print("Number of extension blocks = %d\n", edid.extension_count);
 }
 
 void print_video_and_audio(const site_t &site, const edid_t *edid) {
   constexpr const char *indent = "\t";
-  std::printf("\nShort Video Codes: Num:%d\n", ll_size(&edid->video_list));
+  print("\nShort Video Codes: Num:%d\n", ll_size(&edid->video_list));
   print_modes(site, indent, edid);
   if (edid->hdmi_3d_present != 0) {
-    std::printf("\nMandatory 3D modes: Num:%d\n", static_cast<int>(std::size(_3d_man_modes)));
+    print("\nMandatory 3D modes: Num:%d\n", static_cast<int>(std::size(_3d_man_modes)));
     print_mandatory_3d_modes(indent);
   }
   if (edid->hdmi_vic_len != 0) {
-    std::printf("\n4k x 2k Modes: Num:%d\n", edid->hdmi_vic_len);
+    print("\n4k x 2k Modes: Num:%d\n", edid->hdmi_vic_len);
     print_hdmi_vics(indent, *edid);
   }
-  std::printf("\nShort Audio Codes: Num:%d\n", ll_size(&edid->audio_list));
+  print("\nShort Audio Codes: Num:%d\n", ll_size(&edid->audio_list));
   print_audio(site, indent, edid);
-  std::printf("\nSpeaker config    = ");
+  print("\nSpeaker config    = ");
   print_speaker(edid->speaker[0], edid->speaker[1], edid->speaker[2]);
 }
 
 void print_hdmi(const edid_t &edid) {
   const u8 *const address = edid.physical_address;
-  std::printf("Address           = %d.%d.%d.%d\n", address[0], address[1], address[2], address[3]);
-  std::printf("Supports AI       = %s\n", true_or_false(edid.supports_ai != 0));
-  std::printf("Bits per pixel    = %s%s%s%s\n", edid.dc_48bit != 0 ? "48bits " : "",
-              edid.dc_36bit != 0 ? "36bits " : "", edid.dc_30bit != 0 ? "30bits " : "",
-              edid.dc_y444 != 0 ? "Y444 " : "");
-  std::printf("Supports Dual DVI = %s\n", true_or_false(edid.dvi_dual != 0));
-  std::printf("Max TMDS Clock    = %d\n", edid.max_tmds_clock);
-  std::printf("CNC0              = %d\n", edid.cnc0);
-  std::printf("CNC1              = %d\n", edid.cnc1);
-  std::printf("CNC2              = %d\n", edid.cnc2);
-  std::printf("CNC3              = %d\n", edid.cnc3);
+  print("Address           = %d.%d.%d.%d\n", address[0], address[1], address[2], address[3]);
+  print("Supports AI       = %s\n", true_or_false(edid.supports_ai != 0));
+  print("Bits per pixel    = %s%s%s%s\n", edid.dc_48bit != 0 ? "48bits " : "", edid.dc_36bit != 0 ? "36bits " : "",
+        edid.dc_30bit != 0 ? "30bits " : "", edid.dc_y444 != 0 ? "Y444 " : "");
+  print("Supports Dual DVI = %s\n", true_or_false(edid.dvi_dual != 0));
+  print("Max TMDS Clock    = %d\n", edid.max_tmds_clock);
+  print("CNC0              = %d\n", edid.cnc0);
+  print("CNC1              = %d\n", edid.cnc1);
+  print("CNC2              = %d\n", edid.cnc2);
+  print("CNC3              = %d\n", edid.cnc3);
   // kept: these two belong to the extension, but are told with the HDMI block only.
-  std::printf("Underscan support = %s\n", true_or_false(edid.underscan != 0));
-  std::printf("Basic audio       = %s\n", true_or_false(edid.basic_audio != 0));
+  print("Underscan support = %s\n", true_or_false(edid.underscan != 0));
+  print("Basic audio       = %s\n", true_or_false(edid.basic_audio != 0));
 }
 
 void print_long(const site_t &site, const edid_t *edid, const char *title) {
-  std::printf("%s\n", title);
+  print("%s\n", title);
   if (edid->valid == 0) return;
   print_identity(*edid);
   print_features(*edid);
@@ -220,8 +219,8 @@ void print_long(const site_t &site, const edid_t *edid, const char *title) {
   print_video_and_audio(site, edid);
   if (edid->hdmi_present != 0) print_hdmi(*edid);
   if (edid->xvycc601 != 0 || edid->xvycc709 != 0) {
-    std::printf("Additional Colorimetry: %s%s\n", edid->xvycc601 != 0 ? "xvYCC601 " : "",
-                edid->xvycc709 != 0 ? "xvYCC709 " : "");
+    print("Additional Colorimetry: %s%s\n", edid->xvycc601 != 0 ? "xvYCC601 " : "",
+          edid->xvycc709 != 0 ? "xvYCC709 " : "");
   }
 }
 

@@ -4,6 +4,7 @@
 #include <iterator>
 
 #include "diagnostics.h"
+#include "output.h"
 
 namespace edid_composer {
 namespace {
@@ -80,7 +81,7 @@ void print_speaker(u8 byte1, u8 byte2, u8 byte3) {
   static_cast<void>(byte3);
   char speakers[200] = "";
   join_names(speaker_names, u32{byte1} | u32{byte2} << 8, speakers, sizeof speakers);
-  std::printf("%s\n", speakers);
+  print("%s\n", speakers);
 }
 
 void print_audio_structure(const short_audio_desc_t *audio) {
@@ -112,16 +113,16 @@ void print_audio_structure(const short_audio_desc_t *audio) {
   } else {
     std::snprintf(text, sizeof text, "Code:%d Unrecognized audio code.", type);
   }
-  std::printf("%s\n", text);
+  print("%s\n", text);
 }
 
 void print_stereo_type(u32 stereo_mask) {
   if (stereo_mask == 0) {
-    std::printf(" ");
+    print(" ");
     return;
   }
   for (const auto &row : stereo_names) {
-    if ((stereo_mask & row.bit) != 0) std::printf("%s", row.name);
+    if ((stereo_mask & row.bit) != 0) print("%s", row.name);
   }
 }
 
@@ -135,8 +136,8 @@ void print_est_man_type(u32 bits, const char *(*string_func)(u32), const char *s
     return;
   }
   if (bits == 0) return;
-  std::printf("\n%s: 0x%04X\n", str, bits);
+  print("\n%s: 0x%04X\n", str, bits);
   for (u32 bit = 1U << 7; bit != 0; bit >>= 1) {
-    if ((bits & bit) != 0) std::printf("\t%s\n", string_func(bit));
+    if ((bits & bit) != 0) print("\t%s\n", string_func(bit));
   }
 }

@@ -1,0 +1,20 @@
+// Decoding of a whole block, with the reason where it ends early.
+#pragma once
+
+#include "edid_composer.h"
+
+namespace edid_composer {
+
+/// decode_edid_block_0(), in whose name it reports, for pointers that are not null.
+compose_sink_status decode_base_block(const u8 *edid_block, edid_t *edid);
+
+/// What became of an extension.
+struct extension_outcome_t {
+  compose_extension_status status;
+  u32 malformed_at;  ///< Byte of the block at which the data block that overruns begins; else 0.
+};
+
+/// decode_edid_extensions(), in whose name it reports, for pointers that are not null.
+extension_outcome_t decode_cea_extension(const u8 *edid_extension, u32 length, edid_t *edid);
+
+}  // namespace edid_composer
