@@ -1,44 +1,52 @@
 #include "diagnostics.h"
 
+#include <atomic>
 #include <cstdarg>
 
 #include "output.h"
 
 namespace edid_composer {
+namespace {
 
-void log_error(const char *module, const char *function, int line, const char *format, ...) {
+// Atomic so that a host may switch tracing while another thread composes. No order is needed with anything else.
+constinit std::atomic<u8> g_debug_enabled{0};
+
+}  // namespace
+
+void log_error(const site_t &site, int line, const char *format, ...) {
   std::va_list arguments;
   va_start(arguments, format);
-  write_line(COMPOSE_LOG_ERROR, module, function, line, format, arguments);
+  write_line(COMPOSE_LOG_ERROR, site, line, format, arguments);
   va_end(arguments);
 }
 
-void log_warning(const char *module, const char *function, int line, const char *format, ...) {
+void log_warning(const site_t &site, int line, const char *format, ...) {
   std::va_list arguments;
   va_start(arguments, format);
-  write_line(COMPOSE_LOG_WARNING, module, function, line, format, arguments);
+  write_line(COMPOSE_LOG_WARNING, site, line, format, arguments);
   va_end(arguments);
 }
 
-void log_bug(const char *module, const char *function, int line, const char *format, ...) {
+void log_bug(const site_t &site, int line, const char *format, ...) {
   std::va_list arguments;
   va_start(arguments, format);
-  write_line(COMPOSE_LOG_BUG, module, function, line, format, arguments);
+  write_line(COMPOSE_LOG_BUG, site, line, format, arguments);
   va_end(arguments);
 }
 
-void log_trace(const char *function, int line, const char *format, ...) {
+void log_trace(const site_t &site, int line, const char *format, ...) {
   std::va_list arguments;
   va_start(arguments, format);
-  write_line(COMPOSE_LOG_TRACE, "", function, line, format, arguments);
-  va_end(arguments);
-}
-
-void log_trace(const site_t &site, const char *format, ...) {
-  std::va_list arguments;
-  va_start(arguments, format);
-  write_line(COMPOSE_LOG_TRACE, "", site.function, site.line, format, arguments);
+  write_line(COMPOSE_LOG_TRACE, site, line, format, arguments);
   va_end(arguments);
 }
 
 }  // namespace edid_composer
+
+void debug_enable(bool enable) {
+  edid_composer::g_debug_enabled.store(enable ? 1 : 0, std::memory_order_relaxed);
+}
+
+bool debug_enabled(void) {
+  return edid_composer::g_debug_enabled.load(std::memory_order_relaxed) != 0;
+}

@@ -1,33 +1,35 @@
-// The four kinds of diagnostic line, on C's stdout.
+// The four kinds of diagnostic line.
 //
-// A line names the operation that reports and the module that holds it. Code that several operations share takes the
-// site of the operation that it works for and reports in its name.
+// A line names the operation that reports and the module that holds it, also where a helper does the work. The operation
+// is declared once, for a file or for a function, and every line below reports in its name:
+//
+//   REPORTS_AS(decode_edid_block_0);
+//   ...
+//   LOG_ERROR("Failed decoding #%d standard timing.", number);
 #pragma once
 
 #include "edid_composer.h"
 
 namespace edid_composer {
 
-/// Who reports: module and function as the reader of the log knows them, and the line of the report.
+/// Who reports: module and operation as the reader of the log knows them.
 struct site_t {
   const char *module;
-  const char *function;
-  int line;
+  const char *operation;
 };
 
-// The writers of the lines take a site in pieces, which travel in registers, and are cold: code that has nothing to
-// report then builds no site, and its reports stand apart from it.
+// Cold: reports stand apart from the code that has nothing to report.
+[[gnu::cold, gnu::format(printf, 3, 4)]] void log_error(const site_t &site, int line, const char *format, ...);
+[[gnu::cold, gnu::format(printf, 3, 4)]] void log_warning(const site_t &site, int line, const char *format, ...);
+[[gnu::cold, gnu::format(printf, 3, 4)]] void log_bug(const site_t &site, int line, const char *format, ...);
+/// Writes a debug trace whatever the switch says; LOG_TRACE asks first.
+[[gnu::cold, gnu::format(printf, 3, 4)]] void log_trace(const site_t &site, int line, const char *format, ...);
 
-[[gnu::cold, gnu::format(printf, 4, 5)]] void log_error(const char *module, const char *function, int line,
-                                                        const char *format, ...);
-[[gnu::cold, gnu::format(printf, 4, 5)]] void log_warning(const char *module, const char *function, int line,
-                                                          const char *format, ...);
-[[gnu::cold, gnu::format(printf, 4, 5)]] void log_bug(const char *module, const char *function, int line,
-                                                      const char *format, ...);
-/// Writes a debug trace, which doesn't name its module, whatever the switch says; LOG_TRACE asks first.
-[[gnu::cold, gnu::format(printf, 3, 4)]] void log_trace(const char *function, int line, const char *format, ...);
-/// The same for a block that has asked the switch for all of its traces.
-[[gnu::cold, gnu::format(printf, 2, 3)]] void log_trace(const site_t &site, const char *format, ...);
+/// The name of an operation, which the compiler has found.
+template <typename operation_t>
+constexpr const char *operation_name(operation_t *, const char *name) {
+  return name;
+}
 
 /// For "%p", which takes pointers to void only.
 inline const void *address(const void *pointer) {
@@ -41,20 +43,13 @@ inline const char *true_or_false(bool value) {
 
 }  // namespace edid_composer
 
-/// The site of the function it stands in. The build gives each module's folder its name.
-#define HERE (::edid_composer::site_t{EDID_COMPOSER_MODULE, static_cast<const char *>(__func__), __LINE__})
-/// This line, in the name of another site's function.
-#define HERE_AS(site) (::edid_composer::site_t{(site).module, (site).function, __LINE__})
-/// A site in pieces, as the writers take it.
-#define PIECES(site) (site).module, (site).function, (site).line
+/// Declares `site`, in whose name the lines of the enclosing scope report. The build gives each module's folder its name.
+#define REPORTS_AS(operation)                    \
+  static constexpr ::edid_composer::site_t site { \
+    EDID_COMPOSER_MODULE, ::edid_composer::operation_name(&operation, #operation) \
+  }
 
-#define LOG_ERROR(...) ::edid_composer::log_error(PIECES(HERE), __VA_ARGS__)
-#define LOG_WARNING(...) ::edid_composer::log_warning(PIECES(HERE), __VA_ARGS__)
-#define LOG_BUG(...) ::edid_composer::log_bug(PIECES(HERE), __VA_ARGS__)
-#define LOG_TRACE(...) LOG_TRACE_AS(HERE, __VA_ARGS__)
-
-#define LOG_ERROR_AS(site, ...) ::edid_composer::log_error(PIECES(HERE_AS(site)), __VA_ARGS__)
-#define LOG_WARNING_AS(site, ...) ::edid_composer::log_warning(PIECES(HERE_AS(site)), __VA_ARGS__)
-#define LOG_BUG_AS(site, ...) ::edid_composer::log_bug(PIECES(HERE_AS(site)), __VA_ARGS__)
-#define LOG_TRACE_AS(site, ...) \
-  (debug_enabled() ? ::edid_composer::log_trace((site).function, __LINE__, __VA_ARGS__) : void())
+#define LOG_ERROR(...) ::edid_composer::log_error(site, __LINE__, __VA_ARGS__)
+#define LOG_WARNING(...) ::edid_composer::log_warning(site, __LINE__, __VA_ARGS__)
+#define LOG_BUG(...) ::edid_composer::log_bug(site, __LINE__, __VA_ARGS__)
+#define LOG_TRACE(...) (debug_enabled() ? ::edid_composer::log_trace(site, __LINE__, __VA_ARGS__) : void())

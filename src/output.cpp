@@ -9,15 +9,17 @@ namespace {
 /// The redirection in force on this thread; null: stdout.
 constinit thread_local log_redirection_t *g_redirection = nullptr;
 
-void write_to_stdout(compose_log_kind kind, const char *module, const char *function, int line, const char *format,
-                     std::va_list arguments) {
+/// Reports and dumps name nobody.
+constexpr site_t nobody{"", ""};
+
+void write_to_stdout(compose_log_kind kind, const site_t &site, int line, const char *format, std::va_list arguments) {
   if (kind == COMPOSE_LOG_TRACE) {
     std::vprintf(format, arguments);
-    std::printf(" \t\t\t%s():%d\n", function, line);
+    std::printf(" \t\t\t%s():%d\n", site.operation, line);
     return;
   }
   const char *const level = kind == COMPOSE_LOG_ERROR ? "ERROR" : kind == COMPOSE_LOG_WARNING ? "WARNING" : "BUG";
-  std::printf("%s:%d:%s() %s: ", module, line, function, level);
+  std::printf("%s:%d:%s() %s: ", site.module, line, site.operation, level);
   std::vprintf(format, arguments);
   std::putchar('\n');
 }
@@ -35,12 +37,11 @@ void print(const char *format, ...) {
   va_end(arguments);
 }
 
-void write_line(compose_log_kind kind, const char *module, const char *function, int line, const char *format,
-                std::va_list arguments) {
+void write_line(compose_log_kind kind, const site_t &site, int line, const char *format, std::va_list arguments) {
   if (g_redirection == nullptr) {
-    write_to_stdout(kind, module, function, line, format, arguments);
+    write_to_stdout(kind, site, line, format, arguments);
   } else {
-    g_redirection->add_line(kind, module, function, line, format, arguments);
+    g_redirection->add_line(kind, site, line, format, arguments);
   }
 }
 
@@ -64,32 +65,30 @@ void log_redirection_t::add_text(const char *format, std::va_list arguments) {
   char *begin = text_;
   for (char *end = nullptr; (end = std::strchr(begin, '\n')) != nullptr; begin = end + 1) {
     *end = '\0';
-    deliver(COMPOSE_LOG_TEXT, "", "", 0, begin);
+    deliver(COMPOSE_LOG_TEXT, nobody, 0, begin);
   }
   length_ -= static_cast<u32>(begin - text_);
   std::memmove(text_, begin, length_ + 1);
 }
 
-void log_redirection_t::add_line(compose_log_kind kind, const char *module, const char *function, int line,
-                                 const char *format, std::va_list arguments) {
+void log_redirection_t::add_line(compose_log_kind kind, const site_t &site, int line, const char *format, std::va_list arguments) {
   flush();
   std::vsnprintf(text_, sizeof text_, format, arguments);
-  deliver(kind, module, function, line, text_);
+  deliver(kind, site, line, text_);
 }
 
 /// Delivers what stands there of a line that was not ended.
 void log_redirection_t::flush() {
   if (length_ == 0) return;
   length_ = 0;
-  deliver(COMPOSE_LOG_TEXT, "", "", 0, text_);
+  deliver(COMPOSE_LOG_TEXT, nobody, 0, text_);
 }
 
-void log_redirection_t::deliver(compose_log_kind kind, const char *module, const char *function, int line,
-                                const char *text) {
+void log_redirection_t::deliver(compose_log_kind kind, const site_t &site, int line, const char *text) {
   const compose_log_line_t record{.size = sizeof(compose_log_line_t),
                                   .kind = kind,
-                                  .module = module,
-                                  .function = function,
+                                  .module = site.module,
+                                  .function = site.operation,
                                   .line = static_cast<u32>(line),
                                   .text = text};
   // What the callback itself makes the library print is not part of this composition.

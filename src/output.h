@@ -3,7 +3,7 @@
 
 #include <cstdarg>
 
-#include "edid_composer.h"
+#include "diagnostics.h"
 
 namespace edid_composer {
 
@@ -11,8 +11,8 @@ namespace edid_composer {
 [[gnu::format(printf, 1, 2)]] void print(const char *format, ...);
 
 /// Writes a line of a kind other than COMPOSE_LOG_TEXT.
-[[gnu::format(printf, 5, 0)]] void write_line(compose_log_kind kind, const char *module, const char *function, int line,
-                                              const char *format, std::va_list arguments);
+[[gnu::format(printf, 4, 0)]] void write_line(compose_log_kind kind, const site_t &site, int line, const char *format,
+                                              std::va_list arguments);
 
 /// While it lives, what this thread writes goes to a callback, line by line.
 class log_redirection_t {
@@ -24,13 +24,12 @@ class log_redirection_t {
 
  private:
   friend void print(const char *format, ...);
-  friend void write_line(compose_log_kind, const char *, const char *, int, const char *, std::va_list);
+  friend void write_line(compose_log_kind, const site_t &, int, const char *, std::va_list);
 
   void add_text(const char *format, std::va_list arguments);
-  void add_line(compose_log_kind kind, const char *module, const char *function, int line, const char *format,
-                std::va_list arguments);
+  void add_line(compose_log_kind kind, const site_t &site, int line, const char *format, std::va_list arguments);
   void flush();
-  void deliver(compose_log_kind kind, const char *module, const char *function, int line, const char *text);
+  void deliver(compose_log_kind kind, const site_t &site, int line, const char *text);
 
   compose_log_t log_;
   void *context_;

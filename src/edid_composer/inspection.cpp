@@ -1,27 +1,29 @@
 
 #include "diagnostics.h"
-#include "edid_decode_encode/checksum.h"
+#include "edid_decode_encode/layout.h"
 #include "output.h"
 
 namespace edid_composer {
 namespace {
 
+REPORTS_AS(print_edid);
+
 constexpr u32 smallest_size = block_size;
 constexpr u32 largest_size = 2 * block_size;
 
 /// The formats of an audio mask, from bit 0 on. kept: the enhanced AC-3 of bit 9 is called as the AC-3 of bit 1.
-constexpr char audio_mask_names[][16] = {
+constexpr const char *audio_mask_names[] = {
     "pcm ", "ac3 ",    "mpeg1 ", "mp3 ", "mpeg2 ",   "aac ",    "dts ",     "atrac ",         "dsd ",
     "ac3 ", "dts_hd ", "mlp ",   "dst ", "wma_pro ", "he_aac ", "he_aac2 ", "mpeg_surround ",
 };
 
-bool decode(const site_t &site, const u8 *edid_block, u32 size, edid_t *edid) {
+bool decode(const u8 *edid_block, u32 size, edid_t *edid) {
   if (decode_edid_block_0(edid_block, edid) != 1) {
-    LOG_ERROR_AS(site, "Failed decoding EDID block 0.");
+    LOG_ERROR("Failed decoding EDID block 0.");
     return false;
   }
   if (size >= largest_size && decode_edid_extensions(edid_block + block_size, size - block_size, edid) != 1) {
-    LOG_ERROR_AS(site, "Failed decoding EDID block 1.");
+    LOG_ERROR("Failed decoding EDID block 1.");
     return false;
   }
   return true;
@@ -46,7 +48,7 @@ void print_edid(const u8 *edid_block, u32 size, u8 brief, const char *title) {
     LOG_ERROR("Failed preparing edid.");
     return;
   }
-  if (decode(HERE, edid_block, size, &edid) && print_edid_struct(&edid, brief, title) != 1) {
+  if (decode(edid_block, size, &edid) && print_edid_struct(&edid, brief, title) != 1) {
     LOG_WARNING("Failed printing edid.");
   }
   if (edid_destroy(&edid) != 1) LOG_ERROR("Failed cleaning up edid.");

@@ -2,40 +2,43 @@
 #include "edid_decode_encode/base_block_layout.h"
 #include "edid_decode_encode/checksum.h"
 #include "edid_decode_encode/decoder.h"
-#include "edid_decode_encode/descriptor_decoder.h"
+#include "edid_decode_encode/descriptor.h"
 #include "edid_decode_encode/descriptor_layout.h"
 #include "edid_decode_encode/record_lists.h"
+#include "edid_decode_encode/standard_timing.h"
 
 namespace edid_composer {
 namespace {
 
+REPORTS_AS(decode_edid_block_0);
+
 using u64 = unsigned long long;
 
-bool is_prepared(const site_t &site, const edid_t &edid) {
+bool is_prepared(const edid_t &edid) {
   for (const auto &row : record_lists) {
     if (!ll_is_initialized(&(edid.*row.list))) {
-      LOG_ERROR_AS(site, "%s: List not initialized.", row.name);
+      LOG_ERROR("%s: List not initialized.", row.name);
       return false;
     }
   }
   return true;
 }
 
-bool verify_header(const site_t &site, const byte_view_t &block) {
+bool verify_header(const byte_view_t &block) {
   const auto little_endian_64 = [](const byte_view_t &bytes) {
     return u64{bytes.little_endian_32(4)} << 32 | bytes.little_endian_32(0);
   };
   const u64 expected = little_endian_64({base_block::header, sizeof base_block::header});
   const u64 received = little_endian_64(block);
   if (received == expected) return true;
-  LOG_ERROR_AS(site, "Failed verifying the header. Expected:%16llx Received:%16llx", expected, received);
+  LOG_ERROR("Failed verifying the header. Expected:%16llx Received:%16llx", expected, received);
   return false;
 }
 
-bool verify_checksum(const site_t &site, const byte_view_t &block) {
+bool verify_checksum(const byte_view_t &block) {
   const u8 calculated = _calculate_checksum(block);
   if (calculated == block[checksum_offset]) return true;
-  LOG_ERROR_AS(site, "Edid failed the checksum. Calculated:0x%02X Received:0x%02X", calculated, block[checksum_offset]);
+  LOG_ERROR("Edid failed the checksum. Calculated:0x%02X Received:0x%02X", calculated, block[checksum_offset]);
   return false;
 }
 
@@ -54,12 +57,12 @@ void decode_identity(const byte_view_t &block, edid_t *edid) {
   edid->revision = block[base_block::revision];
 }
 
-bool verify_version(const site_t &site, const edid_t &edid) {
+bool verify_version(const edid_t &edid) {
   constexpr u8 version = 1;
   constexpr u8 revision = 3;
   if (edid.version == version && edid.revision >= revision) return true;
-  LOG_ERROR_AS(site, "Failed EDID Version/Revision check. Expected:%d.%d Recieved:%d.%d", version, revision,
-               edid.version, edid.revision);
+  LOG_ERROR("Failed EDID Version/Revision check. Expected:%d.%d Recieved:%d.%d", version, revision, edid.version,
+            edid.revision);
   return false;
 }
 
@@ -74,30 +77,32 @@ void decode_features(const byte_view_t &block, edid_t *edid) {
   edid->man_timings = block[base_block::man_timings];
 }
 
-bool decode_standard_timings(const site_t &site, const byte_view_t &block, edid_t *edid) {
+bool decode_standard_timings(const byte_view_t &block, edid_t *edid) {
+  appender_t<std_timing_t> timings = standard_timing_appender(edid);
   for (u32 i = 0; i < base_block::standard_timing_count; ++i) {
     const u8 byte_a = block[base_block::standard_timings + 2 * i];
     const u8 byte_b = block[base_block::standard_timings + 2 * i + 1];
-    if (_decode_edid_standard_timing(byte_a, byte_b, edid) != 1) {
-      LOG_ERROR_AS(site, "Failed decoding #%d standard timing. Val1:0x%x Val2:0x%x", i + 1, byte_a, byte_b);
+    if (!_decode_edid_standard_timing(byte_a, byte_b, &timings)) {
+      LOG_ERROR("Failed decoding #%d standard timing. Val1:0x%x Val2:0x%x", i + 1, byte_a, byte_b);
       return false;
     }
   }
   return true;
 }
 
-compose_sink_status decode_descriptors(const site_t &site, const byte_view_t &block, edid_t *edid) {
+compose_sink_status decode_descriptors(const byte_view_t &block, edid_t *edid) {
+  appender_t<detailed_timing_t> timings = detailed_timing_appender(edid);
   for (u32 i = 0; i < base_block::descriptor_count; ++i) {
     const byte_view_t d = block.from(base_block::descriptors + i * descriptor_size);
-    if (_decode_edid_dtd(d, edid) != 1) {
-      // kept: counted from 0, unlike the standard timings.
-      LOG_ERROR_AS(site,
-                   "Failed decoding #%d DTD. 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x "
-                   "0x%x 0x%x 0x%x 0x%x",
-                   i, d[0], d[1], d[2], d[3], d[4], d[5], d[6], d[7], d[8], d[9], d[10], d[11], d[12], d[13], d[14],
-                   d[15], d[16], d[17]);
-      return d.little_endian_16(0) == 0 ? COMPOSE_SINK_DESCRIPTOR_INVALID : COMPOSE_SINK_OUT_OF_MEMORY;
-    }
+    if (_decode_edid_dtd(d, &timings, edid)) continue;
+    // kept: counted from 0, unlike the standard timings.
+    LOG_ERROR(
+        "Failed decoding #%d DTD. 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x 0x%x "
+        "0x%x 0x%x",
+        i, d[0], d[1], d[2], d[3], d[4], d[5], d[6], d[7], d[8], d[9], d[10], d[11], d[12], d[13], d[14], d[15], d[16],
+        d[17]);
+    // A timing is refused only where it can't be kept.
+    return is_display_descriptor(d) ? COMPOSE_SINK_DESCRIPTOR_INVALID : COMPOSE_SINK_OUT_OF_MEMORY;
   }
   return COMPOSE_SINK_READ;
 }
@@ -105,24 +110,21 @@ compose_sink_status decode_descriptors(const site_t &site, const byte_view_t &bl
 }  // namespace
 
 compose_sink_status decode_base_block(const u8 *edid_block, edid_t *edid) {
-  constexpr site_t site{EDID_COMPOSER_MODULE, "decode_edid_block_0", 0};
-  if (!is_prepared(site, *edid)) return COMPOSE_SINK_OUT_OF_MEMORY;
-
+  if (!is_prepared(*edid)) return COMPOSE_SINK_OUT_OF_MEMORY;
   const byte_view_t block(edid_block, block_size);
-  if (!verify_header(site, block)) return COMPOSE_SINK_HEADER_INVALID;
+  if (!verify_header(block)) return COMPOSE_SINK_HEADER_INVALID;
   edid->valid = 1;
   edid->checksum = block[checksum_offset];
-  if (!verify_checksum(site, block)) return COMPOSE_SINK_CHECKSUM_INVALID;
+  if (!verify_checksum(block)) return COMPOSE_SINK_CHECKSUM_INVALID;
   decode_identity(block, edid);
-  if (!verify_version(site, *edid)) return COMPOSE_SINK_VERSION_UNSUPPORTED;
-  edid->digital = (block[base_block::video_input] & base_block::digital_input) != 0 ? 1 : 0;
-  if (edid->digital == 0) LOG_WARNING_AS(site, "EDID inappropriately set to analog. Continuing.");
+  if (!verify_version(*edid)) return COMPOSE_SINK_VERSION_UNSUPPORTED;
+  edid->digital = (block[base_block::video_input] & base_block::digital_input) != 0;
+  if (edid->digital == 0) LOG_WARNING("EDID inappropriately set to analog. Continuing.");
   decode_features(block, edid);
-  if (!decode_standard_timings(site, block, edid)) return COMPOSE_SINK_OUT_OF_MEMORY;
-  if (const compose_sink_status status = decode_descriptors(site, block, edid); status != COMPOSE_SINK_READ)
-    return status;
-  edid->extension_count = block[base_block::extension_count];
-  return COMPOSE_SINK_READ;
+  if (!decode_standard_timings(block, edid)) return COMPOSE_SINK_OUT_OF_MEMORY;
+  const compose_sink_status status = decode_descriptors(block, edid);
+  if (status == COMPOSE_SINK_READ) edid->extension_count = block[base_block::extension_count];
+  return status;
 }
 
 }  // namespace edid_composer

@@ -2,11 +2,14 @@
 
 #include "edid_decode_encode/base_block_layout.h"
 #include "edid_decode_encode/checksum.h"
-#include "edid_decode_encode/descriptor_encoder.h"
+#include "edid_decode_encode/descriptor.h"
 #include "edid_decode_encode/descriptor_layout.h"
+#include "edid_decode_encode/standard_timing.h"
 
 namespace edid_composer {
 namespace {
+
+REPORTS_AS(encode_edid);
 
 constexpr u32 manufacturer_word(const char *letters) {
   u32 word = 0;
@@ -46,51 +49,35 @@ void encode_features(const edid_t &edid, u8 *block) {
   block[base_block::man_timings] = low_byte(edid.man_timings);
 }
 
-/// False when an entry of the list could not be had; its slot stays 0.
-bool encode_standard_timings(const site_t &site, const edid_t &edid, byte_writer_t *block) {
-  namespace layout = standard_timing;
-  bool all_found = true;
-  const i32 size = ll_size(&edid.std_timings);
+void encode_standard_timings(const edid_t &edid, byte_writer_t *block) {
   block->seek(base_block::standard_timings);
-  for (i32 i = 0; i < static_cast<i32>(base_block::standard_timing_count); ++i) {
-    void *payload = nullptr;
-    if (i >= size) {
-      block->put(layout::unused);
-      block->put(layout::unused);
-    } else if (ll_entry_at(&edid.std_timings, i, &payload)) {
-      const auto &timing = *static_cast<const std_timing_t *>(payload);
-      block->put(low_byte(timing.h_active / layout::h_active_unit - layout::h_active_base));
-      block->put(low_byte((timing.refresh_rate - layout::refresh_base) | timing.aspect_ratio << layout::aspect_shift));
-    } else {
-      LOG_ERROR_AS(site, "Failed to locate index #%d in the list.", i);
-      block->seek(block->position() + 2);
-      all_found = false;
-    }
+  u32 free = base_block::standard_timing_count;
+  for (const auto &timing : counted_elements<const std_timing_t>(edid.std_timings)) {
+    if (free == 0) break;
+    put_standard_timing(block, timing);
+    --free;
   }
-  return all_found;
+  for (; free > 0; --free)
+    put_unused_standard_timing(block);
 }
 
 /// The first two detailed timings.
-bool encode_timings(const site_t &site, const edid_t &edid, byte_writer_t *block, u32 *written) {
-  constexpr i32 expected = 2;
+bool encode_timings(const edid_t &edid, byte_writer_t *block) {
   const i32 size = ll_size(&edid.dtd_list);
-  if (size < expected) {
-    LOG_ERROR_AS(site, "The function expects there to be at least 2 DTDs. Total DTDs:%d", size);
+  if (size < base_block_timings) {
+    LOG_ERROR("The function expects there to be at least 2 DTDs. Total DTDs:%d", size);
     return false;
   }
-  for (i32 i = 0; i < expected; ++i) {
-    void *payload = nullptr;
-    if (!ll_entry_at(&edid.dtd_list, i, &payload)) {
-      LOG_ERROR_AS(site, "Failed to locate index #%d in the list.", i);
-      return false;
-    }
+  i32 index = 0;
+  for (const auto &timing : elements<const detailed_timing_t>(edid.dtd_list.head)) {
+    if (index == base_block_timings) break;
     u8 descriptor[descriptor_size];
-    if (_encode_edid_dtd(descriptor, static_cast<const detailed_timing_t *>(payload)) != 1) {
-      LOG_ERROR_AS(site, "Failed encoding DTD. index:%d Len:%d", i, size);
+    if (!_encode_edid_dtd(descriptor, &timing)) {
+      LOG_ERROR("Failed encoding DTD. index:%d Len:%d", index, size);
       return false;
     }
     block->put(descriptor, descriptor_size);
-    ++*written;
+    ++index;
   }
   return true;
 }
@@ -127,20 +114,18 @@ void encode_range_limits(const edid_t &edid, byte_writer_t *block) {
 
 }  // namespace
 
-base_block_result_t encode_base_block(const site_t &site, const edid_t &edid, u8 *block) {
-  base_block_result_t result{.complete = false, .all_found = true, .timings_written = 0};
+bool encode_base_block(const edid_t &edid, u8 *block) {
   byte_writer_t writer(block, block_size);
   encode_identity(edid, &writer);
   encode_features(edid, block);
-  result.all_found = encode_standard_timings(site, edid, &writer);
-  if (!encode_timings(site, edid, &writer, &result.timings_written)) return result;
+  encode_standard_timings(edid, &writer);
+  if (!encode_timings(edid, &writer)) return false;
   put_text_descriptor(&writer, display_descriptor::name_text, edid.monitor_name);
   encode_range_limits(edid, &writer);
   // kept: both bytes follow the last descriptor. They stand at 126 and 127 when name and range limits were written.
   writer.put(1);
   writer.put(_calculate_checksum({block, block_size}));
-  result.complete = true;
-  return result;
+  return true;
 }
 
 }  // namespace edid_composer

@@ -1,4 +1,4 @@
-// The 18-byte descriptor (EDID 1.3, section 3.10) and the standard timing (section 3.9).
+// The bytes of the 18-byte descriptor (EDID 1.3, section 3.10).
 #pragma once
 
 #include "edid_decode_encode/layout.h"
@@ -70,14 +70,4 @@ inline constexpr u32 max_pixel_clock_unit = 10;
 
 }  // namespace display_descriptor
 
-namespace standard_timing {
-
-inline constexpr u8 unused = 0x01;
-inline constexpr u32 h_active_unit = 8;
-inline constexpr u32 h_active_base = 31;
-inline constexpr u32 aspect_shift = 6;
-inline constexpr u8 refresh_mask = 0x3F;
-inline constexpr u32 refresh_base = 60;
-
-}  // namespace standard_timing
 }  // namespace edid_composer

@@ -3,9 +3,10 @@
 #include "diagnostics.h"
 #include "edid_decode_encode/record_lists.h"
 
-using edid_composer::record_lists;
+using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
 
 u8 edid_prepare(edid_t *edid) {
+  REPORTS_AS(edid_prepare);
   std::memset(edid, 0, sizeof *edid);
   for (const auto &row : record_lists) {
     if (ll_is_initialized(&(edid->*row.list))) {
@@ -24,6 +25,7 @@ u8 edid_prepare(edid_t *edid) {
 }
 
 u8 edid_destroy(edid_t *edid) {
+  REPORTS_AS(edid_destroy);
   for (const auto &row : record_lists) {
     if (!ll_is_initialized(&(edid->*row.list))) {
       LOG_ERROR("List is not initialized. List:%s.", row.name_when_missing);

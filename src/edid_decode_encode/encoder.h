@@ -1,12 +1,19 @@
 // Encoding of a whole EDID.
 #pragma once
 
-#include "edid_decode_encode/cea_extension_encoder.h"
+#include "edid_composer.h"
 
 namespace edid_composer {
 
-/// encode_edid(), in whose name it reports, which also tells how much the extension needed when it succeeds.
-u8 encode_and_measure_edid(u8 *edid_blocks, i32 size, edid_t *edid, u8 *spa_offset, const platform_values_t *values,
-                           extension_size_t *extension_size);
+/// What an encoding returns beside the bytes. The sizes count what was needed, also where that was more than there is.
+struct encoding_t {
+  bool complete = false;           ///< False: a list or descriptor stopped it.
+  u8 physical_address_offset = 0;  ///< Within the whole EDID; set as soon as the HDMI block is begun.
+  u32 extension_bytes = 0;         ///< Of the extension, before the checksum.
+  u32 longest_block = 0;           ///< Of the data blocks that can become too long, without its header.
+};
+
+/// encode_edid(), in whose name it reports.
+encoding_t encode(u8 *edid_blocks, i32 size, edid_t *edid, const platform_values_t *values);
 
 }  // namespace edid_composer

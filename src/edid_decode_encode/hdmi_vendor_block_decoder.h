@@ -6,6 +6,6 @@
 namespace edid_composer {
 
 /// Decodes the block whose header byte is the first of @p vendor_block. The view may reach past the block.
-u8 _decode_edid_vendor_block(const byte_view_t &vendor_block, edid_t *edid);
+bool _decode_edid_vendor_block(const byte_view_t &vendor_block, edid_t *edid);
 
 }  // namespace edid_composer

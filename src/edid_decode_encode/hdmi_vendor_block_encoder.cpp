@@ -2,11 +2,15 @@
 
 #include <algorithm>
 
+#include "diagnostics.h"
 #include "edid_decode_encode/cea_extension_layout.h"
-#include "edid_decode_encode/checksum.h"
+#include "edid_decode_encode/hdmi_vendor_block_layout.h"
+#include "linked_list/typed_list.h"
 
 namespace edid_composer {
 namespace {
+
+REPORTS_AS(encode_edid);
 
 namespace layout = hdmi_vendor_block;
 
@@ -21,7 +25,7 @@ void clear_mandatory_structures(short_video_desc_t *video) {
 }
 
 /// Writes the 2D_VIC_order entries of one mode.
-void encode_3d_structures(const site_t &site, u32 index, u32 stereo, byte_writer_t *block) {
+void encode_3d_structures(u32 index, u32 stereo, byte_writer_t *block) {
   for (const auto &structure : layout::structures_3d) {
     if ((stereo & structure.stereo) == 0) continue;
     const u8 order = low_byte(index << layout::index_shift | structure.code);
@@ -29,48 +33,42 @@ void encode_3d_structures(const site_t &site, u32 index, u32 stereo, byte_writer
     if (structure.code == layout::side_by_side_half) {
       constexpr u8 detail = 0;
       block->put(detail);
-      LOG_TRACE_AS(site, "order[%d] %s, %02x, %02x", index, structure.name, order, detail);
+      LOG_TRACE("order[%d] %s, %02x, %02x", index, structure.name, order, detail);
     } else {
-      LOG_TRACE_AS(site, "order[%d] %s, %02x", index, structure.name, order);
+      LOG_TRACE("order[%d] %s, %02x", index, structure.name, order);
     }
   }
 }
 
-bool encode_3d_modes(const site_t &site, edid_t *edid, byte_writer_t *block) {
-  const i32 count = std::min(ll_size(&edid->video_list), layout::most_3d_modes);
-  for (i32 i = 0; i < count; ++i) {
-    void *payload = nullptr;
-    if (!ll_entry_at(&edid->video_list, i, &payload)) {
-      LOG_ERROR_AS(site, "Failed trying to obtain index #%d list.", i);
-      return false;
-    }
-    auto *const video = static_cast<short_video_desc_t *>(payload);
-    clear_mandatory_structures(video);
-    encode_3d_structures(site, static_cast<u32>(i), video->stereo, block);
+void encode_3d_modes(edid_t *edid, byte_writer_t *block) {
+  u32 index = 0;
+  for (auto &video : counted_elements<short_video_desc_t>(edid->video_list)) {
+    if (index == layout::most_3d_modes) break;
+    clear_mandatory_structures(&video);
+    encode_3d_structures(index, video.stereo, block);
+    ++index;
   }
-  return true;
 }
 
 /// The flags byte, and the latencies that it announces.
 void encode_latencies(const edid_t &edid, byte_writer_t *block) {
-  const bool interlaced = edid.i_video_latency != 0 || edid.i_audio_latency != 0;
-  const bool progressive = edid.video_latency != 0 || edid.audio_latency != 0 || interlaced;
+  const layout::latency_fields_t fields = layout::latency_fields(edid);
   u32 flags = encode_flags(layout::content_flags, edid);
-  if (progressive) flags |= layout::latency_present;
-  if (interlaced) flags |= layout::i_latency_present;
+  if (fields.progressive) flags |= layout::latency_present;
+  if (fields.interlaced) flags |= layout::i_latency_present;
   block->put(low_byte(flags));
-  if (progressive) {
+  if (fields.progressive) {
     block->put(encode_edid_latency_value(edid.video_latency));
     block->put(encode_edid_latency_value(edid.audio_latency));
   }
-  if (interlaced) {
+  if (fields.interlaced) {
     block->put(encode_edid_latency_value(edid.i_video_latency));
     block->put(encode_edid_latency_value(edid.i_audio_latency));
   }
 }
 
 /// The HDMI video fields: 3D and 4Kx2K.
-bool encode_video(const site_t &site, edid_t *edid, byte_writer_t *block) {
+void encode_video(edid_t *edid, byte_writer_t *block) {
   const u32 present = edid->hdmi_3d_present != 0 ? layout::present_3d : 0U;
   block->put(low_byte(present | (edid->image_size & layout::image_size_mask) << layout::image_size_shift));
   const u32 lengths = block->reserve();
@@ -79,28 +77,33 @@ bool encode_video(const site_t &site, edid_t *edid, byte_writer_t *block) {
     block->put(low_byte(edid->hdmi_vic[i]));
 
   const u32 begin_3d = block->position();
-  if (edid->hdmi_3d_present != 0 && !encode_3d_modes(site, edid, block)) return false;
+  if (edid->hdmi_3d_present != 0) encode_3d_modes(edid, block);
   const u32 length_3d = block->position() - begin_3d;
   block->put_at(lengths, low_byte(vics << layout::vic_length_shift | (length_3d & layout::length_3d_mask)));
-  return true;
 }
 
 }  // namespace
 
-bool encode_hdmi_vendor_block(const site_t &site, edid_t *edid, byte_writer_t *extension, u8 *spa_offset) {
+void encode_hdmi_vendor_block(edid_t *edid, byte_writer_t *extension) {
   const u32 header = extension->reserve();
   extension->put(layout::oui_bytes, sizeof layout::oui_bytes);
-  if (spa_offset != nullptr) *spa_offset = low_byte(block_size + extension->position());
   const u8 *const address = edid->physical_address;
   extension->put(low_byte((address[0] & 0x0FU) << 4 | (address[1] & 0x0FU)));
   extension->put(low_byte((address[2] & 0x0FU) << 4 | (address[3] & 0x0FU)));
   extension->put(encode_flags(layout::support_flags, *edid));
   extension->put(low_byte(edid->max_tmds_clock / layout::max_tmds_clock_unit));
   encode_latencies(*edid, extension);
-  if (edid->hdmi_video_present != 0 && !encode_video(site, edid, extension)) return false;
+  if (edid->hdmi_video_present != 0) encode_video(edid, extension);
   const u32 length = extension->position() - header - 1;
   extension->put_at(header, data_block::header(data_block::vendor_specific, length));
-  return true;
 }
 
 }  // namespace edid_composer
+
+u8 encode_edid_latency_value(u16 latency_ms) {
+  REPORTS_AS(encode_edid_latency_value);
+  constexpr u16 longest_ms = 500;
+  constexpr u16 not_supported_ms = 65535;
+  if (latency_ms > longest_ms && latency_ms != not_supported_ms) LOG_TRACE("latency = %d exceed 500ms", latency_ms);
+  return edid_composer::hdmi_vendor_block::latency_code(latency_ms);
+}

@@ -5,6 +5,9 @@
 
 namespace edid_composer {
 
+/// Size of the base block and of each extension, bytes.
+inline constexpr u32 block_size = 128;
+
 /// A boolean of the record and the bit that it has in a byte.
 struct flag_t {
   u8 edid_t::*field;

@@ -1,7 +1,7 @@
 // The lists that a record consists of.
 #pragma once
 
-#include "linked_list/element_types.h"
+#include "linked_list/typed_list.h"
 
 namespace edid_composer {
 
@@ -10,8 +10,8 @@ namespace edid_composer {
 struct record_list_t {
   ll_list_t edid_t::*list;
   const char *element_type;
-  char name[32];
-  char name_when_missing[40];
+  const char *name;
+  const char *name_when_missing;
 };
 
 inline constexpr record_list_t record_lists[] = {

@@ -3,13 +3,16 @@
 #include <iterator>
 
 #include "diagnostics.h"
-#include "linked_list/walk.h"
+#include "linked_list/typed_list.h"
 #include "output.h"
 #include "text_field.h"
+#include "utility/timing.h"
 #include "utility/timing_lines.h"
 
 namespace edid_composer {
 namespace {
+
+REPORTS_AS(print_edid_struct);
 
 const char *supported(u8 flag) {
   return flag != 0 ? "supported" : "unsupported";
@@ -26,14 +29,14 @@ u32 hdmi_vic_count(const edid_t &edid) {
   return std::min<u32>(edid.hdmi_vic_len, static_cast<u32>(std::size(edid.hdmi_vic)));
 }
 
-/// One mode with its 3D structures, indented; the line goes on behind it.
+/// One mode with its 3D structures, indented; the line goes on after it.
 void print_mode(const char *indent, const short_video_desc_t &video) {
   print("%s%d\t%s ", indent, video.vic, short_video_timing_string(video.vic));
   print_stereo_type(video.stereo);
 }
 
-void print_modes(const site_t &site, const char *indent, const edid_t *edid) {
-  for (const auto &video : walk<const short_video_desc_t>(LIST_AS(site, &edid->video_list))) {
+void print_modes(const char *indent, const edid_t *edid) {
+  for (const auto &video : walk<const short_video_desc_t>(LIST(&edid->video_list))) {
     print_mode(indent, video);
     print(" %s\n", native(video.native));
   }
@@ -52,14 +55,14 @@ void print_hdmi_vics(const char *indent, const edid_t &edid) {
   }
 }
 
-void print_audio(const site_t &site, const char *indent, const edid_t *edid) {
-  for (const auto &audio : walk<const short_audio_desc_t>(LIST_AS(site, &edid->audio_list))) {
+void print_audio(const char *indent, const edid_t *edid) {
+  for (const auto &audio : walk<const short_audio_desc_t>(LIST(&edid->audio_list))) {
     print("%s", indent);
     print_audio_structure(&audio);
   }
 }
 
-void print_brief(const site_t &site, const edid_t *edid, const char *title) {
+void print_brief(const edid_t *edid, const char *title) {
   constexpr const char *indent = "\t  ";
   const text_field_t monitor_name(edid->monitor_name);
   const text_field_t serial_string(edid->serial_string);
@@ -71,7 +74,7 @@ void print_brief(const site_t &site, const edid_t *edid, const char *title) {
   if (!serial_string.empty()) print("\tSerial String: \"%s\"\n", serial_string.c_str());
   if (!data_string.empty()) print("\tData String  : \"%s\"\n", data_string.c_str());
   print("\n\tVics:\n");
-  print_modes(site, indent, edid);
+  print_modes(indent, edid);
   if (edid->hdmi_vic_len != 0) {
     print("\n\t4k x 2k Modes:\n");
     print_hdmi_vics(indent, *edid);
@@ -82,7 +85,7 @@ void print_brief(const site_t &site, const edid_t *edid, const char *title) {
   }
   if (ll_size(&edid->audio_list) > 0) {
     print("\n\tAudio:\n");
-    print_audio(site, indent, edid);
+    print_audio(indent, edid);
   }
   const u8 *const address = edid->physical_address;
   print("\n\tAddress=%d.%d.%d.%d\n", address[0], address[1], address[2], address[3]);
@@ -127,17 +130,12 @@ void print_features(const edid_t &edid) {
   print_est_man_type(edid.man_timings, man_timing_string, "Manufacturer Timings");
 }
 
-void print_standard_timings(const site_t &site, const edid_t *edid) {
+void print_standard_timings(const edid_t *edid) {
   print("\nStandard Timings: - %d timings\n", ll_size(&edid->std_timings));
-  for (const auto &timing : walk<const std_timing_t>(LIST_AS(site, &edid->std_timings))) {
-    struct aspect_t {
-      u32 width;
-      u32 height;
-    };
-    constexpr aspect_t aspects[] = {{1, 1}, {4, 3}, {5, 4}, {16, 9}};
+  for (const auto &timing : walk<const std_timing_t>(LIST(&edid->std_timings))) {
     print("\t%dx", timing.h_active);
-    if (timing.aspect_ratio < std::size(aspects)) {
-      const aspect_t &aspect = aspects[timing.aspect_ratio];
+    if (timing.aspect_ratio < std::size(aspect_ratios)) {
+      const aspect_ratio_t &aspect = aspect_ratios[timing.aspect_ratio];
       print("%d", timing.h_active * aspect.height / aspect.width);
     }
     print("p%d\n", timing.refresh_rate);
@@ -145,19 +143,16 @@ void print_standard_timings(const site_t &site, const edid_t *edid) {
 }
 
 void print_detailed_timing(i32 number, const detailed_timing_t &timing) {
-  const bool progressive = timing.progressive != 0;
-  const u32 rate = calculate_refresh_rate(timing.pixel_clock, timing.h_active, timing.h_blanking, timing.v_active,
-                                          timing.v_blanking);
-  print("Timing %d: %dx%d%s%d\n", number, timing.h_active, progressive ? timing.v_active : timing.v_active * 2,
-        progressive ? "p" : "i", rate);
+  print("Timing %d: %dx%d%s%d\n", number, timing.h_active, frame_height(timing), timing.progressive != 0 ? "p" : "i",
+        refresh_rate(timing));
   for (const auto &line : timing_lines_t(timing))
     print("%s\n", line);
 }
 
-void print_detailed_timings(const site_t &site, const edid_t *edid) {
+void print_detailed_timings(const edid_t *edid) {
   print("\nDetailed Timing Descriptions: - %d timings\n", ll_size(&edid->dtd_list));
   i32 number = 0;
-  for (const auto &timing : walk<const detailed_timing_t>(LIST_AS(site, &edid->dtd_list))) {
+  for (const auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list))) {
     if (timing.valid != 0) print_detailed_timing(number, timing);
     ++number;
   }
@@ -173,10 +168,10 @@ void print_limits(const edid_t &edid) {
   print("Number of extension blocks = %d\n", edid.extension_count);
 }
 
-void print_video_and_audio(const site_t &site, const edid_t *edid) {
+void print_video_and_audio(const edid_t *edid) {
   constexpr const char *indent = "\t";
   print("\nShort Video Codes: Num:%d\n", ll_size(&edid->video_list));
-  print_modes(site, indent, edid);
+  print_modes(indent, edid);
   if (edid->hdmi_3d_present != 0) {
     print("\nMandatory 3D modes: Num:%d\n", static_cast<int>(std::size(_3d_man_modes)));
     print_mandatory_3d_modes(indent);
@@ -186,7 +181,7 @@ void print_video_and_audio(const site_t &site, const edid_t *edid) {
     print_hdmi_vics(indent, *edid);
   }
   print("\nShort Audio Codes: Num:%d\n", ll_size(&edid->audio_list));
-  print_audio(site, indent, edid);
+  print_audio(indent, edid);
   print("\nSpeaker config    = ");
   print_speaker(edid->speaker[0], edid->speaker[1], edid->speaker[2]);
 }
@@ -203,20 +198,20 @@ void print_hdmi(const edid_t &edid) {
   print("CNC1              = %d\n", edid.cnc1);
   print("CNC2              = %d\n", edid.cnc2);
   print("CNC3              = %d\n", edid.cnc3);
-  // kept: these two belong to the extension, but are told with the HDMI block only.
+  // kept: these two belong to the extension, but are printed with the HDMI block only.
   print("Underscan support = %s\n", true_or_false(edid.underscan != 0));
   print("Basic audio       = %s\n", true_or_false(edid.basic_audio != 0));
 }
 
-void print_long(const site_t &site, const edid_t *edid, const char *title) {
+void print_long(const edid_t *edid, const char *title) {
   print("%s\n", title);
   if (edid->valid == 0) return;
   print_identity(*edid);
   print_features(*edid);
-  print_standard_timings(site, edid);
-  print_detailed_timings(site, edid);
+  print_standard_timings(edid);
+  print_detailed_timings(edid);
   print_limits(*edid);
-  print_video_and_audio(site, edid);
+  print_video_and_audio(edid);
   if (edid->hdmi_present != 0) print_hdmi(*edid);
   if (edid->xvycc601 != 0 || edid->xvycc709 != 0) {
     print("Additional Colorimetry: %s%s\n", edid->xvycc601 != 0 ? "xvYCC601 " : "",
@@ -236,9 +231,9 @@ u8 print_edid_struct(const edid_t *edid, u8 brief, const char *title) {
   }
   const char *const heading = title == nullptr ? "" : title;
   if (brief != 0) {
-    print_brief(HERE, edid, heading);
+    print_brief(edid, heading);
   } else {
-    print_long(HERE, edid, heading);
+    print_long(edid, heading);
   }
   return 1;
 }

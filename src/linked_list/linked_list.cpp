@@ -9,28 +9,29 @@
 namespace edid_composer {
 
 u32 _get_magic_number(const ll_list_t *list) {
+  REPORTS_AS(_get_magic_number);
   constexpr u32 key = 0xA0A06060;
   if (list == nullptr) {
-    LOG_ERROR("list ptr is NULL.%s", "");
+    LOG_ERROR("list ptr is NULL.");
     return 0;
   }
   const auto bits = reinterpret_cast<std::uintptr_t>(list);
   return static_cast<u32>(bits & 0xFFFFFFFF) ^ key;
 }
 
-bool create_entry(i32 size, ll_entry_t **entry, void **data, u32 tag) {
-  constexpr site_t site{EDID_COMPOSER_MODULE, "ll_create_entry", 0};
+bool create_entry(u32 size, ll_entry_t **entry, void **data, u32 tag) {
+  REPORTS_AS(ll_create_entry);
   *entry = nullptr;
   *data = nullptr;
 
   auto *const created = static_cast<ll_entry_t *>(std::calloc(1, sizeof(ll_entry_t)));
   if (created == nullptr) {
-    LOG_BUG_AS(site, "calloc failed to allocate memory for the entry. ptr:%p", address(entry));
+    LOG_BUG("calloc failed to allocate memory for the entry. ptr:%p", address(entry));
     return false;
   }
-  created->data = std::calloc(1, static_cast<std::size_t>(size));
+  created->data = std::calloc(1, size);
   if (created->data == nullptr) {
-    LOG_BUG_AS(site, "calloc failed to allocate memory for the data storage. ptr:%p", address(data));
+    LOG_BUG("calloc failed to allocate memory for the data storage. ptr:%p", address(data));
     std::free(created);
     return false;
   }
@@ -42,106 +43,109 @@ bool create_entry(i32 size, ll_entry_t **entry, void **data, u32 tag) {
 
 namespace {
 
-// The integrity test, in the name of ll_verify_integrity. Answers the link that ends the list, so that an addition at
-// the back needs no walk of its own; null when the list is corrupt.
-ll_entry_t *const *verified_end(const ll_list_t *list) {
-  constexpr site_t site{EDID_COMPOSER_MODULE, "ll_verify_integrity", 0};
-  if (list == nullptr) {
-    LOG_ERROR_AS(site, "\"list\" parameter is NULL. list:%p", address(list));
-    return nullptr;
-  }
-  if (const u32 magic = _get_magic_number(list); list->magic != magic) {
-    // kept: the stored magic stands under the label ExpectedMagic.
-    LOG_ERROR_AS(site, "Corrupt List: List not initialized. Ptr:%p ExpectedMagic:%d Magic:%d Size:%d Head:%p ",
-                 address(list), list->magic, magic, list->size, address(list->head));
-    return nullptr;
-  }
-  if (list->head == nullptr) {
-    if (list->size == 0) return &list->head;
-    LOG_ERROR_AS(site, "Corrupt List: The list's head is NULL, but the size isn't zero. Size:%d", list->size);
-    return nullptr;
-  }
-  if (list->size == 0) {
-    LOG_ERROR_AS(site, "Corrupt List: The list's size is zero, but the head isn't NULL. HeadPtr:%p",
-                 address(list->head));
-    return nullptr;
-  }
-
-  const auto size = static_cast<i32>(list->size);
+/// Follows the entries from the head as far as the size says and compares both.
+bool verify_entries(const ll_list_t &list) {
+  REPORTS_AS(ll_verify_integrity);
+  const auto size = static_cast<i32>(list.size);
   i32 counter = 0;
-  ll_entry_t *const *link = &list->head;
+  const ll_entry_t *entry = list.head;
   do {
-    const ll_entry_t *const entry = *link;
     if (entry->list == nullptr) {
-      LOG_BUG_AS(site, "Corrupt List: An entry's list attribute is set to NULL. Ptr:%p", address(entry->list));
-      return nullptr;
+      LOG_BUG("Corrupt List: An entry's list attribute is set to NULL. Ptr:%p", address(entry->list));
+      return false;
     }
-    if (entry->type != list->type) {
-      LOG_BUG_AS(site, "Corrupt List: An entry's type does not match the lists. Count:%d", counter);
-      return nullptr;
+    if (entry->type != list.type) {
+      LOG_BUG("Corrupt List: An entry's type does not match the lists. Count:%d", counter);
+      return false;
     }
     ++counter;
-    link = &entry->next;
-  } while (counter < size && *link != nullptr);
+    entry = entry->next;
+  } while (counter < size && entry != nullptr);
 
-  if (*link != nullptr) {
-    LOG_ERROR_AS(site,
-                 "Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d "
-                 "NextPtr=%p",
-                 counter, size, address(*link));
-    return nullptr;
+  if (entry != nullptr) {
+    LOG_ERROR(
+        "Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d NextPtr=%p",
+        counter, size, address(entry));
+    return false;
   }
   if (counter != size) {
     // kept: the counted number stands under the label ListSize.
-    LOG_ERROR_AS(site,
-                 "Corrupt List: Either the list's size doesn't match the number of entries. ListSize:%d Counted:%d",
-                 counter, size);
-    return nullptr;
+    LOG_ERROR("Corrupt List: Either the list's size doesn't match the number of entries. ListSize:%d Counted:%d",
+              counter, size);
+    return false;
   }
+  return true;
+}
+
+bool verify_integrity(const ll_list_t *list) {
+  REPORTS_AS(ll_verify_integrity);
+  if (list == nullptr) {
+    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
+    return false;
+  }
+  if (const u32 magic = _get_magic_number(list); list->magic != magic) {
+    // kept: the stored magic stands under the label ExpectedMagic.
+    LOG_ERROR("Corrupt List: List not initialized. Ptr:%p ExpectedMagic:%d Magic:%d Size:%d Head:%p ", address(list),
+              list->magic, magic, list->size, address(list->head));
+    return false;
+  }
+  if (list->head == nullptr) {
+    if (list->size == 0) return true;
+    LOG_ERROR("Corrupt List: The list's head is NULL, but the size isn't zero. Size:%d", list->size);
+    return false;
+  }
+  if (list->size == 0) {
+    LOG_ERROR("Corrupt List: The list's size is zero, but the head isn't NULL. HeadPtr:%p", address(list->head));
+    return false;
+  }
+  return verify_entries(*list);
+}
+
+/// The link to the entry at @p index of a verified list; at its size: the link that ends it.
+ll_entry_t **link_at(ll_list_t *list, u32 index) {
+  ll_entry_t **link = &list->head;
+  for (; index > 0; --index)
+    link = &(*link)->next;
   return link;
 }
 
-// What every operation on entries asks of its list; answers as verified_end().
-ll_entry_t *const *sound_end(const site_t &site, const ll_list_t *list) {
+// What several operations check alike; each reports in its own name.
+
+template <const site_t &site>
+bool is_sound(const ll_list_t *list) {
   if (list == nullptr) {
-    LOG_ERROR_AS(site, "\"list\" parameter is NULL. list:%p", address(list));
-    return nullptr;
+    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
+    return false;
   }
-  ll_entry_t *const *const end = verified_end(list);
-  if (end == nullptr) LOG_BUG_AS(site, "List failed integrity test.%s", "");
-  return end;
+  if (verify_integrity(list)) return true;
+  LOG_BUG("List failed integrity test.");
+  return false;
 }
 
-// The checks that both additions share; only their words for a type mismatch differ. Answers as verified_end().
-ll_entry_t *const *accepting_end(const site_t &site, const ll_list_t *list, const ll_entry_t *new_entry) {
-  ll_entry_t *const *const end = sound_end(site, list);
-  if (end != nullptr && new_entry == nullptr) {
-    LOG_ERROR_AS(site, "\"new_entry\" parameter is NULL. new_entry:%p", address(new_entry));
-    return nullptr;
-  }
-  return end;
+template <const site_t &site>
+bool accepts_entries(const ll_list_t *list, const ll_entry_t *new_entry) {
+  if (!is_sound<site>(list)) return false;
+  if (new_entry != nullptr) return true;
+  LOG_ERROR("\"new_entry\" parameter is NULL. new_entry:%p", address(new_entry));
+  return false;
 }
 
-void report_range(const site_t &site, i32 index, u32 size) {
-  LOG_ERROR_AS(site, "Index Out of Range: Requesting a value outside the range of the list. Index:%d Size:%d", index,
-               size);
+template <const site_t &site>
+bool is_within(const ll_list_t &list, i32 index) {
+  if (index >= 0 && static_cast<u32>(index) < list.size) return true;
+  LOG_ERROR("Index Out of Range: Requesting a value outside the range of the list. Index:%d Size:%d", index, list.size);
+  return false;
 }
 
 }  // namespace
 }  // namespace edid_composer
 
-using edid_composer::_calculate_str_checksum;
-using edid_composer::_get_magic_number;
-using edid_composer::accepting_end;
-using edid_composer::address;
-using edid_composer::create_entry;
-using edid_composer::report_range;
-using edid_composer::sound_end;
-using edid_composer::verified_end;
+using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
 
 bool ll_init(ll_list_t *list, const char *type) {
+  REPORTS_AS(ll_init);
   if (list == nullptr) {
-    LOG_ERROR("list ptr is NULL.%s", "");
+    LOG_ERROR("list ptr is NULL.");
     return false;
   }
   if (type == nullptr) {
@@ -157,24 +161,26 @@ bool ll_init(ll_list_t *list, const char *type) {
   list->head = nullptr;
   list->magic = _get_magic_number(list);
   list->type = _calculate_str_checksum(type);
-  if (verified_end(list) == nullptr) {
-    LOG_BUG("Failed verifying the integrity of the list.%s", "");
+  if (!verify_integrity(list)) {
+    LOG_BUG("Failed verifying the integrity of the list.");
     return false;
   }
   return true;
 }
 
 bool ll_is_initialized(const ll_list_t *list) {
+  REPORTS_AS(ll_is_initialized);
   if (list == nullptr) {
-    LOG_ERROR("list ptr is NULL.%s", "");
+    LOG_ERROR("list ptr is NULL.");
     return false;
   }
   return list->magic == _get_magic_number(list);
 }
 
 bool ll_verify_list_type(const ll_list_t *list, const char *type) {
+  REPORTS_AS(ll_verify_list_type);
   if (list == nullptr) {
-    LOG_ERROR("list ptr is NULL.%s", "");
+    LOG_ERROR("list ptr is NULL.");
     return false;
   }
   if (type == nullptr) {
@@ -185,15 +191,16 @@ bool ll_verify_list_type(const ll_list_t *list, const char *type) {
 }
 
 bool ll_verify_integrity(const ll_list_t *list) {
-  return verified_end(list) != nullptr;
+  return verify_integrity(list);
 }
 
 i32 ll_size(const ll_list_t *list) {
+  REPORTS_AS(ll_size);
   if (list == nullptr) {
-    LOG_ERROR("list ptr is NULL.%s", "");
+    LOG_ERROR("list ptr is NULL.");
     return 0;
   }
-  if (verified_end(list) == nullptr) {
+  if (!verify_integrity(list)) {
     LOG_BUG("Failed integrity test. list:%p", address(list));
     return 0;
   }
@@ -201,6 +208,7 @@ i32 ll_size(const ll_list_t *list) {
 }
 
 bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type) {
+  REPORTS_AS(ll_create_entry);
   if (size < 1) {
     LOG_ERROR("Create entry called with an invalid size. size:%d", size);
     return false;
@@ -217,10 +225,11 @@ bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type
     LOG_ERROR("\"type\" pointer is NULL. type:%p", address(type));
     return false;
   }
-  return create_entry(size, entry, data, _calculate_str_checksum(type));
+  return create_entry(static_cast<u32>(size), entry, data, _calculate_str_checksum(type));
 }
 
 bool ll_delete_entry(ll_entry_t *delete_entry) {
+  REPORTS_AS(ll_delete_entry);
   if (delete_entry == nullptr) {
     LOG_ERROR("\"delete_entry\" parameter is NULL. delete_entry:%p", address(delete_entry));
     return false;
@@ -234,24 +243,18 @@ bool ll_delete_entry(ll_entry_t *delete_entry) {
 }
 
 bool ll_delete_entry_at(ll_list_t *list, u32 index) {
-  if (sound_end(HERE, list) == nullptr) return false;
-  if (index >= list->size) {
-    report_range(HERE, static_cast<i32>(index), list->size);
-    return false;
-  }
-
-  ll_entry_t **link = &list->head;
-  for (; index > 0; --index)
-    link = &(*link)->next;
+  REPORTS_AS(ll_delete_entry_at);
+  if (!is_sound<site>(list) || !is_within<site>(*list, static_cast<i32>(index))) return false;
+  ll_entry_t **const link = link_at(list, index);
   ll_entry_t *const victim = *link;
   *link = victim->next;
   victim->list = nullptr;
   if (!ll_delete_entry(victim)) {
-    LOG_ERROR("Failed deleting entry.%s", "");
+    LOG_ERROR("Failed deleting entry.");
     return false;
   }
   --list->size;
-  if (verified_end(list) == nullptr) {
+  if (!verify_integrity(list)) {
     LOG_BUG("List failed the integrity check. list:%p", address(list));
     return false;
   }
@@ -259,22 +262,22 @@ bool ll_delete_entry_at(ll_list_t *list, u32 index) {
 }
 
 bool ll_add_entry_to_back(ll_list_t *list, ll_entry_t *new_entry) {
-  ll_entry_t *const *const end = accepting_end(HERE, list, new_entry);
-  if (end == nullptr) return false;
+  REPORTS_AS(ll_add_entry_to_back);
+  if (!accepts_entries<site>(list, new_entry)) return false;
   if (list->type != new_entry->type) {
     LOG_BUG("This entry represents a different type and cannot be added to this list. List:0x%08X Entry:0x%08X",
             list->type, new_entry->type);
     return false;
   }
-  // The list and its entries are the caller's to change.
-  *const_cast<ll_entry_t **>(end) = new_entry;
+  *link_at(list, list->size) = new_entry;
   new_entry->list = list;
   ++list->size;
   return true;
 }
 
 bool ll_add_entry_to_front(ll_list_t *list, ll_entry_t *new_entry) {
-  if (accepting_end(HERE, list, new_entry) == nullptr) return false;
+  REPORTS_AS(ll_add_entry_to_front);
+  if (!accepts_entries<site>(list, new_entry)) return false;
   if (list->type != new_entry->type) {
     // kept: "tothis".
     LOG_BUG("This entry represents a different type and cannot be added tothis list. List:0x%08X Entry:0x%08X",
@@ -289,16 +292,13 @@ bool ll_add_entry_to_front(ll_list_t *list, ll_entry_t *new_entry) {
 }
 
 bool ll_entry_at(const ll_list_t *list, i32 index, void **entry_data) {
+  REPORTS_AS(ll_entry_at);
   if (entry_data == nullptr) {
     LOG_ERROR("\"entry_data\" parameter is NULL. entry_data:%p", address(entry_data));
     return false;
   }
   *entry_data = nullptr;
-  if (sound_end(HERE, list) == nullptr) return false;
-  if (index < 0 || index >= static_cast<i32>(list->size)) {
-    report_range(HERE, index, list->size);
-    return false;
-  }
+  if (!is_sound<site>(list) || !is_within<site>(*list, index)) return false;
   const ll_entry_t *entry = list->head;
   for (; index > 0; --index)
     entry = entry->next;
@@ -307,11 +307,12 @@ bool ll_entry_at(const ll_list_t *list, i32 index, void **entry_data) {
 }
 
 bool ll_delete_list(ll_list_t *list) {
+  REPORTS_AS(ll_delete_list);
   if (list == nullptr) {
-    LOG_ERROR("list ptr is NULL.%s", "");
+    LOG_ERROR("list ptr is NULL.");
     return false;
   }
-  if (verified_end(list) == nullptr) {
+  if (!verify_integrity(list)) {
     LOG_BUG("Failed verifying integrity of the list. list:%p", address(list));
     return false;
   }
@@ -332,6 +333,7 @@ bool ll_delete_list(ll_list_t *list) {
 }
 
 bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size) {
+  REPORTS_AS(ll_copy_list);
   if (src_list == nullptr) {
     LOG_ERROR("\"src_list\" parameter is NULL. src_list:%p", address(src_list));
     return false;
@@ -340,12 +342,12 @@ bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size) {
     LOG_ERROR("\"dst_list\" parameter is NULL. dst_list:%p", address(dst_list));
     return false;
   }
-  if (verified_end(src_list) == nullptr) {
-    LOG_BUG("Source list failed integrity test.%s", "");
+  if (!verify_integrity(src_list)) {
+    LOG_BUG("Source list failed integrity test.");
     return false;
   }
-  if (verified_end(dst_list) == nullptr) {
-    LOG_BUG("Destination list failed integrity test.%s", "");
+  if (!verify_integrity(dst_list)) {
+    LOG_BUG("Destination list failed integrity test.");
     return false;
   }
   // Counted, not followed to the end: a list that is copied onto itself grows while it is read.
@@ -354,16 +356,16 @@ bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size) {
     ll_entry_t *copy = nullptr;
     void *payload = nullptr;
     if (!ll_create_entry(static_cast<i32>(size), &copy, &payload, "")) {
-      LOG_BUG("Failed creating entry for the destination list.%s", "");
+      LOG_BUG("Failed creating entry for the destination list.");
       return false;
     }
     copy->type = source->type;
     std::memcpy(payload, source->data, size);
     if (!ll_add_entry_to_back(dst_list, copy)) {
       if (ll_delete_entry(copy)) {
-        LOG_BUG("Failed adding entry to back of the destination list.%s", "");
+        LOG_BUG("Failed adding entry to back of the destination list.");
       } else {
-        LOG_BUG("Failed deleting entry.%s", "");
+        LOG_BUG("Failed deleting entry.");
       }
       return false;
     }

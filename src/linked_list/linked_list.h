@@ -21,6 +21,6 @@ constexpr u32 _calculate_str_checksum(const char *name) {
 }
 
 /// ll_create_entry, in whose name it reports, for arguments that are known to be valid.
-bool create_entry(i32 size, ll_entry_t **entry, void **data, u32 tag);
+bool create_entry(u32 size, ll_entry_t **entry, void **data, u32 tag);
 
 }  // namespace edid_composer

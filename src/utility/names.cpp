@@ -1,17 +1,11 @@
 // The names of codes and single bits.
-#include <iterator>
-
-#include "edid_composer.h"
+#include "utility/timing.h"
 
 namespace {
 
 constexpr const char *unknown_value = "Unknown Value";
 
-// The tables hold their names, as wide as the longest: pointers to them would have to be relocated at each load.
-
-constexpr char aspect_names[][5] = {"1:1", "4:3", "5:4", "16:9"};
-
-constexpr char audio_names[][21] = {
+constexpr const char *audio_names[] = {
     "AUDIO_TYPE_INVALID",
     "PCM",
     "AC3",
@@ -33,17 +27,17 @@ constexpr char audio_names[][21] = {
     "MPEG SURROUND",
 };
 
-constexpr char hdmi_vic_names[][15] = {"3840x2160p30Hz", "3840x2160p25Hz", "3840x2160p24Hz", "4096x2160p24Hz"};
+constexpr const char *hdmi_vic_names[] = {"3840x2160p30Hz", "3840x2160p25Hz", "3840x2160p24Hz", "4096x2160p24Hz"};
 
 // Bit 0 first.
-constexpr char est_timing_1_names[][11] = {"800x600p60", "800x600p56", "640x480p75", "640x480p72",
-                                           "640x480p67", "640x480p60", "720x400p88", "720x400p70"};
-constexpr char est_timing_2_names[][13] = {"1280x1024p75", "1024x768p75", "1024x768p70", "1024x768p60",
-                                           "1024x768p87",  "832x624p75",  "800x600p75",  "800x600p72"};
+constexpr const char *est_timing_1_names[] = {"800x600p60", "800x600p56", "640x480p75", "640x480p72",
+                                              "640x480p67", "640x480p60", "720x400p88", "720x400p70"};
+constexpr const char *est_timing_2_names[] = {"1280x1024p75", "1024x768p75", "1024x768p70", "1024x768p60",
+                                              "1024x768p87",  "832x624p75",  "800x600p75",  "800x600p72"};
 constexpr u32 man_timing_1152x870p75 = 1U << 7;
 
 // VIC 1 first.
-constexpr char vic_names[][24] = {
+constexpr const char *vic_names[] = {
     "640x480p60Hz4x3",        "720x480p60Hz4x3",         "720x480p60Hz16x9",       "1280x720p60Hz16x9",
     "1920x1080i60Hz16x9",     "720(1440)x480i60Hz4x3",   "720(1440)x480i60Hz16x9", "720(1440)x240p60Hz4x3",
     "720(1440)x240p60Hz16x9", "2880x480i60Hz4x3",        "2880x480i60Hz16x9",      "2880x240p60Hz4x3",
@@ -65,14 +59,14 @@ constexpr char vic_names[][24] = {
 };
 
 /// The name at @p index, which may lie anywhere.
-template <u32 size, u32 width>
-constexpr const char *name_at(const char (&names)[size][width], u32 index, const char *otherwise) {
+template <u32 size>
+constexpr const char *name_at(const char *const (&names)[size], u32 index, const char *otherwise) {
   return index < size ? names[index] : otherwise;
 }
 
 /// The name of a value in which one bit is set.
-template <u32 size, u32 width>
-constexpr const char *name_of_bit(const char (&names)[size][width], u32 value) {
+template <u32 size>
+constexpr const char *name_of_bit(const char *const (&names)[size], u32 value) {
   for (u32 bit = 0; bit < size; ++bit) {
     if (value == 1U << bit) return names[bit];
   }
@@ -82,7 +76,7 @@ constexpr const char *name_of_bit(const char (&names)[size][width], u32 value) {
 }  // namespace
 
 const char *std_aspect_string(u32 ratio) {
-  return name_at(aspect_names, ratio, "InvalidRatio");
+  return ratio < std::size(edid_composer::aspect_ratios) ? edid_composer::aspect_ratios[ratio].name : "InvalidRatio";
 }
 
 const char *short_audio_string(u32 type) {
@@ -109,31 +103,3 @@ const char *est_timing_2_string(u32 bit) {
 const char *man_timing_string(u32 bit) {
   return bit == man_timing_1152x870p75 ? "1152x870p75" : unknown_value;
 }
-
-// kept: bit 15 stands for side-by-side (half), as bit 8 does.
-constinit const u32 _3d_struct_all_array[16] = {
-    STEREO_FRAME_PACKING,
-    STEREO_FIELD_ALTERNATIVE,
-    STEREO_LINE_ALTERNATIVE,
-    STEREO_SIDE_BY_SIDE_FULL,
-    STEREO_L_DEPTH,
-    STEREO_L_DEPTH_GRAPHICS,
-    STEREO_TOP_AND_BOTTOM,
-    0,
-    STEREO_SIDE_BY_SIDE_HALF,
-    0,
-    0,
-    0,
-    0,
-    0,
-    0,
-    STEREO_SIDE_BY_SIDE_HALF,
-};
-
-constinit const short_video_desc_t _3d_man_modes[5] = {
-    {0, 32, STEREO_FRAME_PACKING | STEREO_TOP_AND_BOTTOM},
-    {0, 4, STEREO_FRAME_PACKING | STEREO_TOP_AND_BOTTOM},
-    {0, 5, STEREO_SIDE_BY_SIDE_HALF},
-    {0, 19, STEREO_FRAME_PACKING | STEREO_TOP_AND_BOTTOM},
-    {0, 20, STEREO_SIDE_BY_SIDE_HALF},
-};

@@ -1,7 +1,7 @@
 #include <cstring>
 
 #include "diagnostics.h"
-#include "linked_list/element_types.h"
+#include "linked_list/typed_list.h"
 
 namespace edid_composer {
 namespace {
@@ -10,8 +10,8 @@ namespace {
 struct platform_list_t {
   ll_list_t platform_values_t::*list;
   const char *element_type;
-  char initialised_name[24];
-  char removed_name[24];
+  const char *initialised_name;
+  const char *removed_name;
 };
 
 constexpr platform_list_t platform_lists[] = {
@@ -30,10 +30,10 @@ constexpr platform_list_t platform_lists[] = {
 }  // namespace
 }  // namespace edid_composer
 
-using edid_composer::address;
-using edid_composer::platform_lists;
+using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
 
 bool platform_values_init(platform_values_t *values) {
+  REPORTS_AS(platform_values_init);
   if (values == nullptr) {
     LOG_ERROR("\"values\" parameter is NULL. values:%p", address(values));
     return false;
@@ -49,6 +49,7 @@ bool platform_values_init(platform_values_t *values) {
 }
 
 bool platform_values_destroy(platform_values_t *values) {
+  REPORTS_AS(platform_values_destroy);
   if (values == nullptr) {
     LOG_ERROR("\"values\" parameter is NULL. values:%p", address(values));
     return false;

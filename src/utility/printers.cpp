@@ -11,7 +11,7 @@ namespace {
 
 struct bit_name_t {
   u32 bit;
-  char name[12];
+  const char *name;
 };
 
 constexpr bit_name_t sample_rate_names[] = {
@@ -34,7 +34,7 @@ constexpr bit_name_t stereo_names[] = {
     {STEREO_L_DEPTH, "LD "},           {STEREO_L_DEPTH_GRAPHICS, "LD+G "},
 };
 
-/// Appends the names of the set bits; what doesn't fit is cut. Answers the length of the whole text.
+/// Appends the names of the set bits; what doesn't fit is cut. Returns the length of the whole text.
 template <std::size_t count>
 int join_names(const bit_name_t (&names)[count], u32 mask, char *string, u32 string_len) {
   std::size_t length = 0;
@@ -47,17 +47,16 @@ int join_names(const bit_name_t (&names)[count], u32 mask, char *string, u32 str
 }
 
 /// What both mask formatters do; @p unspecified stands for an empty mask.
-template <std::size_t count>
-int mask_string(const site_t &site, const bit_name_t (&names)[count], const char *unspecified, u32 mask, char *string,
-                u32 string_len) {
+template <const site_t &site, std::size_t count>
+int mask_string(const bit_name_t (&names)[count], const char *unspecified, u32 mask, char *string, u32 string_len) {
   constexpr u32 minimum = 17;
   if (string == nullptr) {
-    LOG_ERROR_AS(site, "\"string\" parameter is NULL. string:%p", address(string));
+    LOG_ERROR("\"string\" parameter is NULL. string:%p", address(string));
     return 0;
   }
   std::memset(string, 0, string_len);
   if (string_len < minimum) {
-    LOG_ERROR_AS(site, "\"string_len\" invalid. string_len:%d minimum:%d", string_len, minimum);
+    LOG_ERROR("\"string_len\" invalid. string_len:%d minimum:%d", string_len, minimum);
     return 0;
   }
   if (mask == 0) return std::snprintf(string, string_len, "%s", unspecified);
@@ -70,11 +69,13 @@ int mask_string(const site_t &site, const bit_name_t (&names)[count], const char
 using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
 
 int audio_freq_string(u32 freq_mask, char *string, u32 string_len) {
-  return mask_string(HERE, sample_rate_names, " NoFreqSpecified", freq_mask, string, string_len);
+  REPORTS_AS(audio_freq_string);
+  return mask_string<site>(sample_rate_names, " NoFreqSpecified", freq_mask, string, string_len);
 }
 
 int audio_pcm_bits_string(u32 bits_mask, char *string, u32 string_len) {
-  return mask_string(HERE, sample_size_names, " NoBitsSpecified", bits_mask, string, string_len);
+  REPORTS_AS(audio_pcm_bits_string);
+  return mask_string<site>(sample_size_names, " NoBitsSpecified", bits_mask, string, string_len);
 }
 
 void print_speaker(u8 byte1, u8 byte2, u8 byte3) {
@@ -85,6 +86,7 @@ void print_speaker(u8 byte1, u8 byte2, u8 byte3) {
 }
 
 void print_audio_structure(const short_audio_desc_t *audio) {
+  REPORTS_AS(print_audio_structure);
   if (audio == nullptr) {
     LOG_ERROR("\"audio\" parameter is NULL. str:%p", address(audio));
     return;
@@ -127,6 +129,7 @@ void print_stereo_type(u32 stereo_mask) {
 }
 
 void print_est_man_type(u32 bits, const char *(*string_func)(u32), const char *str) {
+  REPORTS_AS(print_est_man_type);
   if (string_func == nullptr) {
     LOG_BUG("string_func is:%p", address(nullptr));
     return;

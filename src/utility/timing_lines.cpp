@@ -2,12 +2,13 @@
 
 #include <cstdio>
 
+#include "utility/timing.h"
+
 namespace edid_composer {
 
 timing_lines_t::timing_lines_t(const detailed_timing_t &timing) {
   add("Pixel Clock:", timing.pixel_clock);
-  add("Refresh Rate:", calculate_refresh_rate(timing.pixel_clock, timing.h_active, timing.h_blanking, timing.v_active,
-                                              timing.v_blanking));
+  add("Refresh Rate:", refresh_rate(timing));
   add("H Active:", timing.h_active);
   add("H Blanking:", timing.h_blanking);
   add("V Active:", timing.v_active);

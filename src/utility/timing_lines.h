@@ -1,4 +1,4 @@
-// The lines that tell a detailed timing, in the report and in traces.
+// The lines that describe a detailed timing, in the report and in traces.
 #pragma once
 
 #include "edid_composer.h"

@@ -1,0 +1,172 @@
+#include "edid_composer/compose.h"
+
+#include "diagnostics.h"
+#include "edid_composer/edid_reading.h"
+#include "edid_composer/explain/explain.h"
+#include "edid_composer/journal.h"
+#include "edid_composer/new_edid/population.h"
+#include "edid_composer/platform/platform_values_reader.h"
+#include "edid_composer/selection/audio_formats.h"
+#include "edid_composer/selection/modes_4k_x_2k.h"
+#include "edid_composer/selection/video_modes.h"
+#include "edid_decode_encode/encoder.h"
+#include "edid_decode_encode/layout.h"
+
+namespace edid_composer {
+namespace {
+
+REPORTS_AS(compose_edid_internal);
+
+constexpr u32 smallest_size = block_size;
+constexpr u32 largest_size = 2 * block_size;
+
+/// The records of one composition. They start zero-filled, so that one that was never prepared is destroyed cleanly.
+struct workspace_t {
+  platform_values_t platform{};
+  edid_t sink{};
+  edid_t new_edid{};
+};
+
+/// A sink's EDID that can't be read is left out, not refused. Null: it can be read.
+compose_sink_status unreadable(const compose_request_t &request) {
+  compose_sink_status status = COMPOSE_SINK_READ;
+  if (request.sink == nullptr) {
+    status = COMPOSE_SINK_NONE;
+    LOG_TRACE(
+        "\"edid_block\" memory block parameter is NULL. Skipping edid reading and proceeding with creation. "
+        "edid_block:%p",
+        address(request.sink));
+  }
+  if (request.sink_bytes == 0 || request.sink_bytes % block_size != 0) {
+    if (status == COMPOSE_SINK_READ) {
+      status = request.sink_bytes == 0 ? COMPOSE_SINK_NONE : COMPOSE_SINK_LENGTH_INVALID;
+    }
+    LOG_TRACE(
+        "Edid is not an valid value. edid_bytes=%d Range=(%d-%d) Skipping edid reading and proceeding with creation.",
+        request.sink_bytes, smallest_size, largest_size);
+  }
+  return status;
+}
+
+bool is_output_valid(const compose_request_t &request) {
+  if (request.new_edid == nullptr) {
+    LOG_ERROR("\"new_edid_block\" memory block parameter is NULL. Unable to proceed. new_edid_block:%p",
+              address(request.new_edid));
+    return false;
+  }
+  if (request.new_edid_bytes < smallest_size || request.new_edid_bytes > largest_size) {
+    LOG_ERROR("New EDID size is not an valid value. Unable to proceed. edid_bytes=%d Expected=%d",
+              request.new_edid_bytes, largest_size);
+    return false;
+  }
+  if (request.settings == nullptr) {
+    LOG_ERROR("cfg is NULL. Unable to proceed. cfg : %p.", address(request.settings));
+    return false;
+  }
+  return true;
+}
+
+/// The caller's platform values, else those of the configuration; null when that can't be read.
+const platform_values_t *platform_of(const compose_request_t &request, workspace_t *work) {
+  if (request.platform_values != nullptr) return request.platform_values;
+  if (_read_platform_values(&work->platform)) return &work->platform;
+  LOG_ERROR("Failed trying to read the platform config file.");
+  return nullptr;
+}
+
+/// The stages, each from its inputs to its outcome or into the new record. False when one can't go on.
+bool run_stages(const inputs_t &inputs, edid_t *new_edid, journal_t *journal, outcomes_t *outcomes) {
+  outcomes->video = _filter_video_modes(inputs, &new_edid->video_list, journal);
+  if (!outcomes->video.complete) {
+    LOG_ERROR("Failed filtering the video modes.");
+    return false;
+  }
+  outcomes->modes_4k = _filter_4k_modes(inputs);
+  if (!_filter_audio_formats(inputs, &new_edid->audio_list, journal)) {
+    LOG_ERROR("Failed filtering the audio formats.");
+    return false;
+  }
+  outcomes->population = _populate_new_edid(inputs, outcomes->modes_4k.selected, new_edid);
+  if (!outcomes->population.complete) {
+    LOG_ERROR("Failed populating the new edid.");
+    return false;
+  }
+  return true;
+}
+
+/// Encodes the new record into the caller's buffer.
+bool write(const compose_request_t &request, const platform_values_t &platform, edid_t *new_edid, encoding_t *encoding,
+           compose_result_t *result) {
+  *encoding = encode(request.new_edid, static_cast<i32>(request.new_edid_bytes), new_edid, &platform);
+  const u8 offset = encoding->physical_address_offset;
+  if (offset != 0 && request.settings->spa_offset != nullptr) *request.settings->spa_offset = offset;
+  if (!encoding->complete) {
+    LOG_ERROR("Failed encoding the new edid.");
+    return false;
+  }
+  result->bytes_written = largest_size;
+  result->physical_address_offset = offset;
+  return true;
+}
+
+void read_sink_into(const compose_request_t &request, compose_sink_status status, edid_t *sink,
+                    compose_result_t *result) {
+  sink_reading_t reading{.status = status};
+  if (status == COMPOSE_SINK_READ) {
+    reading = read_sink(request.sink, request.sink_bytes, sink);
+  } else {
+    LOG_TRACE("Valid edid not available. Continuing composing edid. Passed in edid:%p size:%d bytes",
+              address(request.sink), request.sink_bytes);
+  }
+  result->sink_status = reading.status;
+  result->sink_extension_status = reading.extension_status;
+  result->sink_malformed_at = reading.malformed_at;
+  result->sink_blocks_unread = reading.blocks_unread;
+}
+
+bool compose_with(const compose_request_t &request, compose_sink_status status, workspace_t *work,
+                  decisions_t *decisions, compose_result_t *result) {
+  const platform_values_t *const platform = platform_of(request, work);
+  if (platform == nullptr) return false;
+  edid_prepare(&work->sink);
+  edid_prepare(&work->new_edid);
+  read_sink_into(request, status, &work->sink, result);
+
+  const inputs_t inputs{work->sink, *platform, *request.settings};
+  outcomes_t outcomes;
+  journal_t journal(request.observer != nullptr);
+  if (!run_stages(inputs, &work->new_edid, &journal, &outcomes) ||
+      !write(request, *platform, &work->new_edid, &outcomes.encoding, result)) {
+    return false;
+  }
+  if (request.observer != nullptr) explain(inputs, outcomes, journal, work->new_edid, request.new_edid, decisions);
+  trace_new_edid(request.new_edid);
+  return true;
+}
+
+/// All of it, always, in this order; what fails here doesn't change the result.
+void clean_up(workspace_t *work) {
+  if (edid_destroy(&work->sink) != 1) LOG_ERROR("Failed cleaning up edid.");
+  if (edid_destroy(&work->new_edid) != 1) LOG_ERROR("Failed cleaning up new_edid.");
+  platform_values_destroy(&work->platform);
+}
+
+}  // namespace
+
+bool compose(const compose_request_t &request, compose_result_t *result) {
+  const compose_sink_status status = unreadable(request);
+  if (!is_output_valid(request)) return false;
+  if (request.platform_values != nullptr && !ll_is_initialized(&request.platform_values->audio_list)) {
+    LOG_ERROR("The passed in platform_values has not been initialized.");
+    return false;
+  }
+  workspace_t work;
+  decisions_t decisions;
+  platform_values_init(&work.platform);
+  const bool composed = compose_with(request, status, &work, &decisions, result);
+  clean_up(&work);
+  if (composed) decisions.pass_on(request.observer, request.observer_context);
+  return composed;
+}
+
+}  // namespace edid_composer

@@ -1,0 +1,61 @@
+// The operations that compose: three ways to hand over one request.
+#include "diagnostics.h"
+#include "edid_composer/compose.h"
+#include "output.h"
+
+namespace edid_composer {
+namespace {
+
+REPORTS_AS(compose_edid_request);
+
+/// True when a record is there and has the members of this version.
+template <typename record_t>
+bool has_members(const char *name, const record_t *record) {
+  if (record == nullptr) {
+    LOG_ERROR("\"%s\" parameter is NULL. %s:%p", name, name, address(record));
+    return false;
+  }
+  if (record->size >= sizeof *record) return true;
+  LOG_ERROR("The size of the %s is too small. Expected at least:%u Received:%u", name, static_cast<u32>(sizeof *record),
+            record->size);
+  return false;
+}
+
+// A frame of its own for the redirection's line.
+[[gnu::noinline]] bool compose_redirected(const compose_request_t &request, compose_result_t *result) {
+  const log_redirection_t redirection(request.log, request.log_context);
+  return compose(request, result);
+}
+
+}  // namespace
+}  // namespace edid_composer
+
+using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
+
+bool compose_edid(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
+                  const compose_cfg_t *cfg) {
+  return compose_edid_internal(edid_block, edid_bytes, new_edid_block, new_edid_bytes, cfg, nullptr);
+}
+
+bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_block, u32 new_edid_bytes,
+                           const compose_cfg_t *cfg, const platform_values_t *platform_values) {
+  compose_request_t request{};
+  request.size = sizeof request;
+  request.sink = edid_block;
+  request.sink_bytes = edid_bytes;
+  request.new_edid = new_edid_block;
+  request.new_edid_bytes = new_edid_bytes;
+  request.settings = cfg;
+  request.platform_values = platform_values;
+  compose_result_t result{};
+  return compose(request, &result);
+}
+
+bool compose_edid_request(const compose_request_t *request, compose_result_t *result) {
+  if (!has_members("request", request) || !has_members("result", result)) return false;
+  *result = {};
+  result->size = sizeof *result;
+  const bool composed = request->log == nullptr ? compose(*request, result) : compose_redirected(*request, result);
+  if (!composed) result->bytes_written = result->physical_address_offset = 0;
+  return composed;
+}
