@@ -20,9 +20,18 @@ std::optional<explanation_t> explain_composition(const composition_options_t &op
   settings.port = options.ports.first;
   explanation_t explanation;
   debug_enable(options.debug);
-  if (!compose_edid_observed(sink.empty() ? nullptr : sink.data(), static_cast<u32>(sink.size()),
-                             explanation.new_edid.data(), static_cast<u32>(explanation.new_edid.size()), &settings,
-                             nullptr, take, &explanation.decisions)) {
+  compose_request_t request{};
+  request.size = sizeof request;
+  request.sink = sink.empty() ? nullptr : sink.data();
+  request.sink_bytes = static_cast<u32>(sink.size());
+  request.new_edid = explanation.new_edid.data();
+  request.new_edid_bytes = static_cast<u32>(explanation.new_edid.size());
+  request.settings = &settings;
+  request.observer = take;
+  request.observer_context = &explanation.decisions;
+  compose_result_t result{};
+  result.size = sizeof result;
+  if (!compose_edid_request(&request, &result)) {
     return std::nullopt;
   }
   return explanation;
