@@ -21,11 +21,17 @@ namespace {
   throw bad_input_t(name + ": cannot write: " + std::strerror(errno));
 }
 
-/// The permissions of a new file, as the user's mask has them.
-mode_t default_mode() {
+mode_t creation_mask() {
   const mode_t mask = umask(0);
   umask(mask);
-  return 0666 & ~mask;
+  return mask;
+}
+
+/// The permissions of a new file, as the user's mask has them. It can only be read by changing it, which another thread
+/// would notice: so it is read once.
+mode_t default_mode() {
+  static const mode_t mode = 0666 & ~creation_mask();
+  return mode;
 }
 
 std::string directory_of(const std::string &file) {

@@ -5,21 +5,19 @@
 
 #include <cstdio>
 #include <filesystem>
-#include <memory>
 #include <thread>
 
 #include "atomic_file.h"
 #include "bad_input.h"
 #include "batch_summary.h"
 #include "batch_tasks.h"
-#include "diagnostic_lines.h"
 #include "edid_file.h"
 #include "exit_status.h"
-#include "output_capture.h"
+#include "file_descriptor.h"
+#include "library_line.h"
+#include "ordered_workers.h"
 #include "progress_bar.h"
 #include "standard_output.h"
-#include "text_lines.h"
-#include "worker_pool.h"
 
 namespace edid_cli {
 namespace {
@@ -28,45 +26,43 @@ std::span<const u8> bytes_of(const std::string &text) {
   return {reinterpret_cast<const u8 *>(text.data()), text.size()};
 }
 
-/// The lines that tell of something wrong.
-std::string diagnostics_in(const std::string &output) {
-  std::string diagnostics;
-  for (const text_line_t &line : lines_of(output)) {
-    if (parse_diagnostic(line.text)) {
-      diagnostics.append(line.text).append("\n");
+/// What the library writes during one composition.
+class heard_t {
+ public:
+  explicit heard_t(bool keeps_all) : keeps_all_(keeps_all) {}
+
+  void hear(const compose_log_line_t &line) {
+    if (keeps_all_) {
+      text += printed(line);
+    }
+    if (is_diagnostic(line)) {
+      diagnostics.push_back(std::string(kind_of(line)) + ": " + message_of(line));
+      if (first_error.empty() && line.kind != COMPOSE_LOG_WARNING) {
+        first_error = message_of(line);
+      }
     }
   }
-  return diagnostics;
-}
 
-/// The library's first error, as the end of a sentence.
-std::string first_error_in(const std::string &output) {
-  for (const text_line_t &line : lines_of(output)) {
-    const auto diagnostic = parse_diagnostic(line.text);
-    if (diagnostic && diagnostic->kind != "WARNING") {
-      return ": " + std::string(trimmed(diagnostic->message));
-    }
-  }
-  return "";
-}
+  std::string text;
+  std::vector<std::string> diagnostics;
+  std::string first_error;
 
-/// Does the compositions one at a time, in a worker process.
+ private:
+  bool keeps_all_;
+};
+
+/// Does any of the compositions, on any thread.
 class batch_worker_t {
  public:
   batch_worker_t(const compose_options_t &options, const std::vector<task_t> &tasks)
       : options_(options), tasks_(tasks), shared_sink_(read_shared_sink(options, tasks)) {}
 
-  std::string work(std::size_t number) {
-    if (capture_ == nullptr) {
-      capture_ = std::make_unique<output_capture_t>();
-    }
-    batch_result_t result;
+  batch_result_t work(std::size_t number) const {
     try {
-      result = compose_one(tasks_[number]);
+      return compose_one(tasks_[number]);
     } catch (const std::exception &problem) {
-      result.failure = problem.what();
+      return {problem.what(), "", {}};
     }
-    return packed(result);
   }
 
  private:
@@ -75,30 +71,35 @@ class batch_worker_t {
     return tasks.front().sink_file.empty() ? read_sink(options.composition) : std::vector<u8>{};
   }
 
-  batch_result_t compose_one(const task_t &task) {
+  batch_result_t compose_one(const task_t &task) const {
     if (task.output_file.empty()) {
       throw bad_input_t("another EDID has its file name");
     }
-    const std::vector<u8> sink = task.sink_file.empty() ? shared_sink_ : read_edid_file(task.sink_file);
-    const auto new_edid = compose(options_.composition, task.port, sink);
-    const std::string output = capture_->take();
-    batch_result_t result;
-    result.output = options_.composition.debug ? output : diagnostics_in(output);
-    if (new_edid) {
-      write_file_atomically(task.output_file, bytes_of(formatted(*new_edid, options_.format)), durability_t::later);
-    } else {
-      result.failure = "the library refused to compose an EDID" + first_error_in(output);
+    const bool is_traced = options_.composition.debug;
+    heard_t heard(is_traced || options_.log);
+    const composition_t composition =
+        compose(options_.composition, task.port, task.sink_file.empty() ? shared_sink_ : read_edid_file(task.sink_file),
+                [&heard](const compose_log_line_t &line) { heard.hear(line); });
+    if (composition.is_composed) {
+      write_file_atomically(task.output_file, bytes_of(formatted(composition.new_edid, options_.format)),
+                            durability_t::later);
     }
     if (options_.log) {
-      write_file_atomically(task.log_file, bytes_of(output), durability_t::later);
+      write_file_atomically(task.log_file, bytes_of(heard.text), durability_t::later);
     }
+    batch_result_t result;
+    if (!composition.is_composed) {
+      result.failure = "the library refused to compose an EDID" +
+                       (heard.first_error.empty() ? std::string() : ": " + heard.first_error);
+    }
+    result.output = is_traced ? std::move(heard.text) : std::string();
+    result.diagnostics = std::move(heard.diagnostics);
     return result;
   }
 
   const compose_options_t &options_;
   const std::vector<task_t> &tasks_;
   std::vector<u8> shared_sink_;
-  std::unique_ptr<output_capture_t> capture_;
 };
 
 /// Once for all files instead of once for each.
@@ -118,12 +119,11 @@ std::size_t jobs_of(const compose_options_t &options) {
 
 int compose_several(const compose_options_t &options) {
   const std::vector<task_t> tasks = plan_tasks(options);
-  batch_worker_t worker(options, tasks);
+  const batch_worker_t worker(options, tasks);
   batch_summary_t summary;
   {
     progress_bar_t progress(tasks.size());
-    const auto take = [&](std::size_t number, const outcome_t &outcome) {
-      const batch_result_t result = outcome.is_done ? unpacked(outcome.text) : batch_result_t{outcome.text, ""};
+    const auto take = [&](std::size_t number, const batch_result_t &result) {
       const std::string &label = tasks[number].label;
       summary.add(label, result);
       if (options.composition.debug) {
@@ -132,7 +132,7 @@ int compose_several(const compose_options_t &options) {
       }
       progress.show(number + 1);
     };
-    run_in_workers(
+    run_in_order(
         tasks.size(), jobs_of(options), [&worker](std::size_t number) { return worker.work(number); }, take);
   }
   flush_file_system_of(tasks.front().output_file);

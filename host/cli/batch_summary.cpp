@@ -2,8 +2,6 @@
 
 #include <algorithm>
 
-#include "diagnostic_lines.h"
-#include "text_lines.h"
 #include "text_table.h"
 
 namespace edid_cli {
@@ -11,6 +9,11 @@ namespace {
 
 /// So many different diagnostics are told one by one.
 constexpr std::size_t most_diagnostics = 20;
+
+/// Bug lines end with an address in memory, of which each thread has its own.
+std::string without_address(const std::string &diagnostic) {
+  return diagnostic.starts_with("BUG") ? diagnostic.substr(0, diagnostic.rfind("0x")) : diagnostic;
+}
 
 }  // namespace
 
@@ -20,24 +23,20 @@ void batch_summary_t::add(const std::string &label, const batch_result_t &result
   } else {
     failures_.push_back({label, result.failure});
   }
-  count_diagnostics(label, result.output);
+  for (const std::string &diagnostic : result.diagnostics) {
+    count(diagnostic, label);
+  }
 }
 
-void batch_summary_t::count_diagnostics(const std::string &label, std::string_view output) {
-  for (const text_line_t &line : lines_of(output)) {
-    const auto diagnostic = parse_diagnostic(line.text);
-    if (!diagnostic) {
-      continue;
-    }
-    const std::string text = std::string(diagnostic->kind) + ": " + std::string(trimmed(diagnostic->message));
-    const auto known = diagnostics_.find(text);
-    if (known != diagnostics_.end()) {
-      ++known->second.times;
-    } else if (diagnostics_.size() < most_diagnostics) {
-      diagnostics_[text] = {1, diagnostics_.size(), label};
-    } else {
-      ++uncounted_;
-    }
+void batch_summary_t::count(const std::string &diagnostic, const std::string &label) {
+  const std::string subject = without_address(diagnostic);
+  const auto known = diagnostics_.find(subject);
+  if (known != diagnostics_.end()) {
+    ++known->second.times;
+  } else if (diagnostics_.size() < most_diagnostics) {
+    diagnostics_[subject] = {1, diagnostics_.size(), label, diagnostic};
+  } else {
+    ++uncounted_;
   }
 }
 
@@ -56,8 +55,8 @@ std::string batch_summary_t::text() const {
   }
   if (!diagnostics_.empty()) {
     std::vector<text_table_t::row_t> rows(diagnostics_.size());
-    for (const auto &[message, count] : diagnostics_) {
-      rows[count.order] = {std::to_string(count.times), count.first_label, message};
+    for (const auto &[subject, count] : diagnostics_) {
+      rows[count.order] = {std::to_string(count.times), count.first_label, count.first_text};
     }
     text_table_t table;
     table.add({"TIMES", "FIRST", "THE LIBRARY SAID"});

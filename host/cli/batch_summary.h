@@ -3,7 +3,6 @@
 
 #include <map>
 #include <string>
-#include <string_view>
 #include <vector>
 
 #include "batch_result.h"
@@ -26,13 +25,14 @@ class batch_summary_t {
     std::size_t times = 0;
     std::size_t order = 0;
     std::string first_label;
+    std::string first_text;
   };
 
-  void count_diagnostics(const std::string &label, std::string_view output);
+  void count(const std::string &diagnostic, const std::string &label);
 
   std::size_t composed_ = 0;
   std::vector<failure_t> failures_;
-  std::map<std::string, diagnostic_count_t> diagnostics_;
+  std::map<std::string, diagnostic_count_t> diagnostics_;  ///< By what they say.
   std::size_t uncounted_ = 0;
 };
 

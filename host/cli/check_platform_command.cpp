@@ -4,9 +4,9 @@
 #include "composition.h"
 #include "exit_status.h"
 #include "input.h"
-#include "output_capture.h"
 #include "platform_check.h"
 #include "printable_text.h"
+#include "standard_output.h"
 #include "text_table.h"
 
 namespace edid_cli {
@@ -36,7 +36,7 @@ int run(const check_platform_options_t &options) {
   platform_check_t check;
   {
     // What is found is told in other words.
-    const output_capture_t unseen;
+    const discarded_output_t unseen;
     check = check_platform();
   }
   text_table_t table;

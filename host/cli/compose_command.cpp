@@ -1,7 +1,6 @@
 #include <unistd.h>
 
 #include <cstdio>
-#include <memory>
 #include <vector>
 
 #include "atomic_file.h"
@@ -20,22 +19,16 @@ namespace {
 int compose_single(const compose_options_t &options) {
   const std::vector<u8> sink = read_sink(options.composition);
   const bool to_standard_output = options.output == standard_stream;
-  std::optional<new_edid_t> new_edid;
-  {
-    // Nothing but the EDID may arrive where the EDID is awaited.
-    std::unique_ptr<standard_output_redirect_t> redirect;
-    if (to_standard_output) {
-      redirect = std::make_unique<standard_output_redirect_t>(STDERR_FILENO);
-    }
-    new_edid = compose(options.composition, options.composition.ports.first, sink);
-  }
-  if (!new_edid) {
+  // Nothing but the EDID may arrive where the EDID is awaited.
+  const composition_t composition = compose(options.composition, options.composition.ports.first, sink,
+                                            written_to(to_standard_output ? stderr : stdout));
+  if (!composition.is_composed) {
     flush_standard_output();
     std::fprintf(stderr, "%s: the library refused to compose an EDID\n", program_name);
     return refused_status;
   }
 
-  const std::string written = formatted(*new_edid, options.format);
+  const std::string written = formatted(composition.new_edid, options.format);
   const std::span<const u8> bytes(reinterpret_cast<const u8 *>(written.data()), written.size());
   if (to_standard_output) {
     write_all(STDOUT_FILENO, bytes, "standard output");

@@ -2,6 +2,8 @@
 #pragma once
 
 #include <array>
+#include <cstdio>
+#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
@@ -30,8 +32,24 @@ void load_platform(const std::optional<std::string> &file);
 /// The sink's EDID, empty when there is no sink. Throws bad_input_t.
 std::vector<u8> read_sink(const composition_options_t &options);
 
-/// Composes for one port with the platform that is loaded. None: the library refused, and has said why on standard
-/// output.
-std::optional<new_edid_t> compose(const composition_options_t &options, u32 port, const std::vector<u8> &sink);
+/// What came of a composition.
+struct composition_t {
+  bool is_composed = false;  ///< If not, the library has refused, and has said why.
+  new_edid_t new_edid{};
+  compose_result_t result{};
+  std::vector<compose_decision_t> decisions;
+};
+
+enum class decisions_t { dropped, kept };
+
+/// Receives each line that the library writes; must not throw.
+using line_listener_t = std::function<void(const compose_log_line_t &line)>;
+
+/// A listener that writes each line to a stream, as the library does it to standard output.
+line_listener_t written_to(std::FILE *stream);
+
+/// Composes for one port with the platform that is loaded. May run on several threads at once.
+composition_t compose(const composition_options_t &options, u32 port, const std::vector<u8> &sink,
+                      const line_listener_t &listener, decisions_t decisions = decisions_t::dropped);
 
 }  // namespace edid_cli

@@ -2,21 +2,18 @@
 
 #include <algorithm>
 #include <iterator>
-#include <optional>
 #include <string_view>
 
 #include "composition.h"
-#include "diagnostic_lines.h"
-#include "output_capture.h"
-#include "text_lines.h"
+#include "library_line.h"
 
 namespace edid_cli {
 namespace {
 
-// With tracing on, each list and each of its entries is announced before it is read.
+// With tracing on, this operation announces each list, and each of its entries, before it is read.
+constexpr std::string_view announcer = "print_platform_node";
 constexpr std::string_view list_announcement = "\tRoot Node:Name of node is:";
 constexpr std::string_view entry_announcement = "\tNext Node:Name of node is:";
-constexpr std::string_view name_end = " \t\t\tprint_platform_node():";
 
 /// The operations that report on the entry that was announced last.
 constexpr std::string_view entry_readers[] = {
@@ -26,23 +23,13 @@ constexpr std::string_view entry_readers[] = {
 /// This one is taken, with its refresh rate rounded up.
 constexpr std::string_view rounded_entry = "Only whole refresh rates";
 
-std::optional<std::string_view> announced(std::string_view line, std::string_view announcement) {
-  const std::size_t end = line.rfind(name_end);
-  if (!line.starts_with(announcement) || end == std::string_view::npos) {
-    return std::nullopt;
-  }
-  return line.substr(announcement.size(), end - announcement.size());
-}
-
 class listener_t {
  public:
-  void hear(std::string_view line) {
-    if (const auto name = announced(line, list_announcement)) {
-      entries_ = &reading_.lists[std::string(*name)];
-    } else if (entries_ != nullptr && announced(line, entry_announcement)) {
-      entries_->emplace_back();
-    } else if (const auto diagnostic = parse_diagnostic(line)) {
-      hear(*diagnostic);
+  void hear(const compose_log_line_t &line) {
+    if (is_diagnostic(line)) {
+      hear_diagnostic(line);
+    } else if (line.kind == COMPOSE_LOG_TRACE && line.function == announcer) {
+      hear_announcement(line.text);
     }
   }
 
@@ -52,15 +39,23 @@ class listener_t {
   }
 
  private:
-  void hear(const diagnostic_t &diagnostic) {
-    std::string message(trimmed(diagnostic.message));
+  void hear_announcement(std::string_view text) {
+    if (text.starts_with(list_announcement)) {
+      entries_ = &reading_.lists[std::string(text.substr(list_announcement.size()))];
+    } else if (text.starts_with(entry_announcement) && entries_ != nullptr) {
+      entries_->emplace_back();
+    }
+  }
+
+  void hear_diagnostic(const compose_log_line_t &line) {
+    std::string message = message_of(line);
     const bool is_of_entry =
-        std::find(std::begin(entry_readers), std::end(entry_readers), diagnostic.function) != std::end(entry_readers);
+        std::find(std::begin(entry_readers), std::end(entry_readers), line.function) != std::end(entry_readers);
     if (is_of_entry && message.starts_with("Unabled to find")) {
       entries_ = nullptr;
     } else if (is_of_entry && entries_ != nullptr && !entries_->empty()) {
       entries_->back().push_back(std::move(message));
-    } else if (diagnostic.kind == "ERROR") {
+    } else if (line.kind == COMPOSE_LOG_ERROR) {
       reading_.refusal = std::move(message);
     }
   }
@@ -75,18 +70,10 @@ list_reading_t read_lists() {
   composition_options_t options;
   options.settings.audio_mask = 0xFFFFFFFF;
   options.debug = true;
-  bool was_composed = false;
-  std::string output;
-  {
-    output_capture_t capture;
-    was_composed = compose(options, 0, {}).has_value();
-    output = capture.take();
-  }
-  debug_enable(false);
   listener_t listener;
-  for (const text_line_t &line : lines_of(output)) {
-    listener.hear(line.text);
-  }
+  const bool was_composed =
+      compose(options, 0, {}, [&listener](const compose_log_line_t &line) { listener.hear(line); }).is_composed;
+  debug_enable(false);
   return std::move(listener).finish(was_composed);
 }
 

@@ -8,7 +8,6 @@
 #include "exit_status.h"
 #include "input.h"
 #include "option_values.h"
-#include "output_capture.h"
 #include "standard_output.h"
 
 namespace edid_cli {
@@ -16,7 +15,7 @@ namespace {
 
 /// Printing tells no result, so the same decoding is tried first, unseen.
 bool decodes(const std::vector<u8> &edid) {
-  const output_capture_t unseen;
+  const discarded_output_t unseen;
   return decoded_edid_t(edid).is_complete();
 }
 

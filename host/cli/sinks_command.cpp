@@ -9,8 +9,8 @@
 #include "edid_file.h"
 #include "exit_status.h"
 #include "input.h"
-#include "output_capture.h"
 #include "physical_address_text.h"
+#include "standard_output.h"
 #include "text_table.h"
 
 namespace edid_cli {
@@ -26,7 +26,7 @@ text_table_t::row_t describe(const connector_t &connector) {
       return {connector.name, "(not connected)", "-"};
     }
     const std::vector<u8> bytes = read_edid_file(connector.edid_file);
-    const output_capture_t unseen;
+    const discarded_output_t unseen;
     const decoded_edid_t edid(bytes);
     if (!edid.is_complete()) {
       return {connector.name, "(EDID does not decode)", "-"};

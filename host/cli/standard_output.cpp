@@ -32,6 +32,9 @@ standard_output_redirect_t::~standard_output_redirect_t() {
   dup2(original_.get(), STDOUT_FILENO);
 }
 
+discarded_output_t::discarded_output_t()
+    : nowhere_(open("/dev/null", O_WRONLY | O_CLOEXEC)), redirect_(nowhere_.get()) {}
+
 void flush_standard_output() {
   if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {
     refuse();

@@ -18,6 +18,17 @@ class standard_output_redirect_t {
   file_descriptor_t original_;
 };
 
+/// While it lives, what is printed on standard output is not seen.
+class discarded_output_t {
+ public:
+  /// Throws bad_input_t like the redirection, and where there is no null device.
+  discarded_output_t();
+
+ private:
+  file_descriptor_t nowhere_;
+  standard_output_redirect_t redirect_;
+};
+
 /// Writes out what is buffered. Throws bad_input_t when any of the output could not be written.
 void flush_standard_output();
 

@@ -20,7 +20,6 @@ target_sources(
           ${CMAKE_CURRENT_LIST_DIR}/descriptor_bytes.cpp
           ${CMAKE_CURRENT_LIST_DIR}/explain_command.cpp
           ${CMAKE_CURRENT_LIST_DIR}/explained.cpp
-          ${CMAKE_CURRENT_LIST_DIR}/explanation.cpp
           ${CMAKE_CURRENT_LIST_DIR}/explanation_json.cpp
           ${CMAKE_CURRENT_LIST_DIR}/explanation_page.cpp
           ${CMAKE_CURRENT_LIST_DIR}/explanation_text.cpp

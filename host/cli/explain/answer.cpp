@@ -35,7 +35,7 @@ mode_kind_t kind_of(const wanted_t &wanted, const explained_t &explained) {
 }
 
 const compose_decision_t *find(const wanted_t &wanted, const explained_t &explained) {
-  const auto &decisions = explained.explanation.decisions;
+  const auto &decisions = explained.composition.decisions;
   const auto found = std::find_if(decisions.begin(), decisions.end(), [&wanted](const auto &decision) {
     return decision.subject == static_cast<u32>(wanted.subject) && decision.code == wanted.code;
   });
@@ -47,7 +47,7 @@ bool names(const compose_decision_t *decision, u32 origins) {
 }
 
 bool is_too_tall(u32 vic, const explained_t &explained) {
-  const compose_decision_t *const limit = find_decision(explained.explanation, COMPOSE_SUBJECT_GEOMETRY_LIMIT);
+  const compose_decision_t *const limit = find_decision(explained.composition, COMPOSE_SUBJECT_GEOMETRY_LIMIT);
   detailed_timing_t timing{};
   if (limit == nullptr || limit->reason == COMPOSE_REASON_GEOMETRY_UNLIMITED || convert_vic_to_dtd(vic, &timing) != 1) {
     return false;
@@ -62,16 +62,16 @@ bool was_chosen(const compose_decision_t &decision) {
 
 /// Only the HDMI data block's 3D formats can make it too long.
 bool is_block_too_long(const explained_t &explained) {
-  const compose_decision_t *const room = find_decision(explained.explanation, COMPOSE_SUBJECT_EXTENSION_ROOM);
+  const compose_decision_t *const room = find_decision(explained.composition, COMPOSE_SUBJECT_EXTENSION_ROOM);
   return room != nullptr && room->reason == COMPOSE_REASON_BLOCK_TOO_LONG;
 }
 
 /// Takes modes out of the priority list, those chosen last first, until there is room for what is wanted.
 void make_room(const wanted_t &wanted, bool is_chosen, const explained_t &explained, steps_t &steps) {
-  const compose_decision_t *const padding = find_decision(explained.explanation, COMPOSE_SUBJECT_PADDING);
+  const compose_decision_t *const padding = find_decision(explained.composition, COMPOSE_SUBJECT_PADDING);
   const i32 chosen = (padding != nullptr ? padding->value[0] : 0) + (is_chosen ? 0 : 1);
   std::vector<compose_decision_t> others;
-  for (const compose_decision_t &decision : explained.explanation.decisions) {
+  for (const compose_decision_t &decision : explained.composition.decisions) {
     const bool is_mode = decision.subject == COMPOSE_SUBJECT_VIDEO_MODE && decision.code != wanted.code;
     if (is_mode && was_chosen(decision) && names(&decision, COMPOSE_ORIGIN_PRIORITY_LIST)) {
       others.push_back(decision);
@@ -119,7 +119,7 @@ std::vector<step_t> mode_steps(const wanted_t &wanted, const compose_decision_t 
 void add_general_reasons(const explained_t &explained, answer_t &answer) {
   if (!explained.is_extension_announced()) {
     answer.reasons.push_back(
-        reason_sentence(*find_decision(explained.explanation, COMPOSE_SUBJECT_EXTENSION_ROOM), explained));
+        reason_sentence(*find_decision(explained.composition, COMPOSE_SUBJECT_EXTENSION_ROOM), explained));
   }
 }
 

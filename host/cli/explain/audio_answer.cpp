@@ -26,7 +26,7 @@ u32 mask_bit(u32 type) {
 class audio_question_t {
  public:
   audio_question_t(u32 type, const explained_t &explained) : type_(type), explained_(explained), steps_(explained) {
-    for (const compose_decision_t &decision : explained.explanation.decisions) {
+    for (const compose_decision_t &decision : explained.composition.decisions) {
       if (decision.subject == COMPOSE_SUBJECT_AUDIO_FORMAT && decision.code == type) {
         decisions_.push_back(decision);
       }
@@ -99,7 +99,7 @@ class audio_question_t {
 
   /// Takes formats of the platform out, the last first, until there is room for one more.
   void make_room() {
-    const auto &all = explained_.explanation.decisions;
+    const auto &all = explained_.composition.decisions;
     const bool is_chosen = any_of([](const auto &decision) {
       return decision.verdict != COMPOSE_VERDICT_LEFT_OUT || decision.reason == COMPOSE_REASON_NO_ROOM;
     });

@@ -15,7 +15,6 @@
 #include "explain/outputs.h"
 #include "input.h"
 #include "option_values.h"
-#include "output_capture.h"
 #include "standard_output.h"
 
 namespace edid_cli {
@@ -29,7 +28,7 @@ class sink_record_t {
  public:
   explicit sink_record_t(const std::vector<u8> &bytes) {
     // The composition decodes it as well, and what the library says of it is told there.
-    const output_capture_t unseen;
+    const discarded_output_t unseen;
     if (!bytes.empty()) {
       decoded_ = std::make_unique<decoded_edid_t>(bytes);
     }
@@ -48,12 +47,6 @@ std::string platform_name(const composition_options_t &options) {
   }
   return *options.platform_file == standard_stream ? input_name(*options.platform_file)
                                                    : std::filesystem::path(*options.platform_file).filename().string();
-}
-
-/// What the library says goes to standard error: standard output is for the explanation.
-std::optional<explanation_t> explain_aside(const composition_options_t &options, const std::vector<u8> &sink) {
-  const standard_output_redirect_t redirect(STDERR_FILENO);
-  return explain_composition(options, sink);
 }
 
 void write_page(const std::string &file, const std::string &page) {
@@ -96,13 +89,15 @@ int run(const explain_options_t &options) {
   const std::vector<u8> sink = read_sink(options.composition);
   const sink_record_t record(sink);
   const platform_places_t places(platform_name(options.composition));
-  const auto explanation = explain_aside(options.composition, sink);
-  if (!explanation) {
+  // What the library says goes to standard error: standard output is for the explanation.
+  const composition_t composition =
+      compose(options.composition, options.composition.ports.first, sink, written_to(stderr), decisions_t::kept);
+  if (!composition.is_composed) {
     std::fprintf(stderr, "%s: the library refused to compose an EDID\n", program_name);
     return options.want ? bad_input_status : refused_status;
   }
   const std::string sink_name = options.composition.sink ? input_name(*options.composition.sink) : "";
-  const explained_t explained{*explanation, sink, record.get(), sink_name, places, options.composition};
+  const explained_t explained{composition, sink, record.get(), sink_name, places, options.composition};
   if (options.want) {
     return tell_answers(options, wanted, explained);
   }

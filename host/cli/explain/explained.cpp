@@ -5,19 +5,19 @@
 namespace edid_cli {
 
 u32 explained_t::family() const {
-  const compose_decision_t *const rate = find_decision(explanation, COMPOSE_SUBJECT_NATIVE_RATE);
+  const compose_decision_t *const rate = find_decision(composition, COMPOSE_SUBJECT_NATIVE_RATE);
   return rate != nullptr && rate->code == 50 ? 50 : 60;
 }
 
 bool explained_t::is_extension_announced() const {
-  const compose_decision_t *const room = find_decision(explanation, COMPOSE_SUBJECT_EXTENSION_ROOM);
+  const compose_decision_t *const room = find_decision(composition, COMPOSE_SUBJECT_EXTENSION_ROOM);
   return room == nullptr || room->reason != COMPOSE_REASON_NOT_ANNOUNCED;
 }
 
-const compose_decision_t *find_decision(const explanation_t &explanation, compose_subject subject) {
-  const auto found = std::find_if(explanation.decisions.begin(), explanation.decisions.end(),
+const compose_decision_t *find_decision(const composition_t &composition, compose_subject subject) {
+  const auto found = std::find_if(composition.decisions.begin(), composition.decisions.end(),
                                   [subject](const auto &decision) { return decision.subject == subject; });
-  return found != explanation.decisions.end() ? &*found : nullptr;
+  return found != composition.decisions.end() ? &*found : nullptr;
 }
 
 }  // namespace edid_cli

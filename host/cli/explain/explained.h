@@ -6,13 +6,12 @@
 
 #include "composition.h"
 #include "decoded_edid.h"
-#include "explain/explanation.h"
 #include "explain/platform_places.h"
 
 namespace edid_cli {
 
 struct explained_t {
-  const explanation_t &explanation;
+  const composition_t &composition;
   const std::vector<u8> &sink_bytes;  ///< Empty: no sink.
   const edid_t &sink;                 ///< What could be decoded of it.
   std::string sink_name;              ///< Empty: no sink.
@@ -26,6 +25,6 @@ struct explained_t {
 };
 
 /// The first decision about a subject; nullptr when there is none.
-const compose_decision_t *find_decision(const explanation_t &explanation, compose_subject subject);
+const compose_decision_t *find_decision(const composition_t &composition, compose_subject subject);
 
 }  // namespace edid_cli

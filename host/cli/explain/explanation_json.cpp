@@ -96,7 +96,7 @@ std::string explanation_json(const explained_t &explained) {
   write_sink(json, explained);
   json.member("platform", explained.places.name());
   write_settings(json, explained.options);
-  json.member("edid", hexadecimal(explained.explanation.new_edid));
+  json.member("edid", hexadecimal(explained.composition.new_edid));
   json.key("decisions").open_list();
   for (const row_t &row : rows_of(explained)) {
     write_row(json, row);

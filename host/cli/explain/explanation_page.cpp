@@ -6,7 +6,7 @@
 #include "explain/page_template.h"
 #include "explain/utf8_text.h"
 #include "option_values.h"
-#include "output_capture.h"
+#include "standard_output.h"
 
 namespace edid_cli {
 namespace {
@@ -49,11 +49,11 @@ std::string title_of(const explained_t &explained) {
 }  // namespace
 
 std::string explanation_page(const explained_t &explained) {
-  const new_edid_t &bytes = explained.explanation.new_edid;
+  const new_edid_t &bytes = explained.composition.new_edid;
   const std::vector<row_t> rows = rows_of(explained);
   const std::vector<byte_field_t> fields = name_bytes(bytes);
   // What the library says here it has said before, or it is told in other words.
-  const output_capture_t unseen;
+  const discarded_output_t unseen;
   const decoded_edid_t new_edid(std::vector<u8>(bytes.begin(), bytes.end()));
   const platform_check_t check = check_platform();
   const std::array parts{

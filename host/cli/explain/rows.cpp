@@ -171,7 +171,7 @@ std::string source_text(const row_t &row) {
 
 std::vector<row_t> rows_of(const explained_t &explained) {
   std::vector<row_t> rows;
-  for (const compose_decision_t &decision : explained.explanation.decisions) {
+  for (const compose_decision_t &decision : explained.composition.decisions) {
     rows.push_back({section_of(decision.subject), decision, name_of(decision, explained),
                     reason_sentence(decision, explained), sources_of(decision, explained)});
   }

@@ -8,6 +8,7 @@
 #include "config_store.h"
 #include "edid_file.h"
 #include "explain/byte_names.h"
+#include "library_line.h"
 
 namespace edid_cli {
 namespace {
@@ -20,9 +21,11 @@ std::vector<u8> composed_for(const std::string &sink) {
   composition_options_t options;
   options.settings.audio_mask = 0xFFFFFFFF;
   options.settings.hdmi_3d_mode = follow_sink_3d_mode;
-  const auto edid = compose(options, 0, read_edid_file(std::string(SAMPLE_SINKS_DIRECTORY) + "/" + sink + ".txt"));
-  EXPECT_TRUE(edid.has_value());
-  return edid ? std::vector<u8>(edid->begin(), edid->end()) : std::vector<u8>(256);
+  const composition_t composition =
+      compose(options, 0, read_edid_file(std::string(SAMPLE_SINKS_DIRECTORY) + "/" + sink + ".txt"),
+              [](const compose_log_line_t &line) { ADD_FAILURE() << printed(line); });
+  EXPECT_TRUE(composition.is_composed);
+  return {composition.new_edid.begin(), composition.new_edid.end()};
 }
 
 /// Each byte in one field, in order, with a name and a meaning.

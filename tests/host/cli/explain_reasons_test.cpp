@@ -67,15 +67,15 @@ class Reasons : public testing::Test {
   }
 
   void use_50_hz() {
-    explanation_.decisions.push_back(
+    composition_.decisions.push_back(
         decision(COMPOSE_SUBJECT_NATIVE_RATE, 50, COMPOSE_VERDICT_OFFERED, COMPOSE_REASON_RATE_OF_PLATFORM));
   }
 
-  explained_t explained() { return {explanation_, no_bytes_, sink_, "", places_(), options_}; }
+  explained_t explained() { return {composition_, no_bytes_, sink_, "", places_(), options_}; }
   std::string sentence(const compose_decision_t &decision) { return reason_sentence(decision, explained()); }
 
   std::vector<std::string> sources(const compose_decision_t &decision) {
-    explanation_.decisions.push_back(decision);
+    composition_.decisions.push_back(decision);
     std::vector<std::string> texts;
     for (const row_t &row : rows_of(explained())) {
       if (row.decision.subject == decision.subject && row.decision.code == decision.code) {
@@ -95,7 +95,7 @@ class Reasons : public testing::Test {
   }
 
   std::optional<platform_places_t> read_;
-  explanation_t explanation_;
+  composition_t composition_;
   const std::vector<u8> no_bytes_;
   edid_t sink_{};
   composition_options_t options_;

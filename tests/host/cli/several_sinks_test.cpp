@@ -174,23 +174,37 @@ TEST_F(SeveralSinks, AnEdidThatCannotBeWrittenIsAFailureOfThatSink) {
   EXPECT_EQ(content_of(edids_ + "/b.bin").size(), 256U);
 }
 
-TEST_F(SeveralSinks, AWorkerThatIsEndedFailsItsSinkOnly) {
+TEST_F(SeveralSinks, AnEdidThatDoesNotFitTheDiskFailsItsSinkOnly) {
   add_sink("a.bin", sample_bytes("tv_4k"));
   add_sink("b.bin", sample_bytes("tv_4k"));
   add_sink("c.bin", sample_bytes("tv_4k"));
   std::filesystem::create_directory(edids_);
-  // The EDIDs outgrow the limit, which ends the process that writes them. That of b goes to a device without a size.
+  directory_.write("edids/a.bin", "old");
+  // The EDIDs outgrow the limit. That of b goes to a device without a size.
   std::filesystem::create_symlink("/dev/null", edids_ + "/b.bin");
   for (const std::string jobs : {"1", "3"}) {
     terminal_t terminal;
     process_t process{EDID_COMPOSER_PROGRAM, {"compose", "--sink", sinks_, "-o", edids_, "--jobs", jobs}};
     process.output_file = terminal.name();
     process.file_size_limit = 200;
-    process.dies_of_file_size = true;
     EXPECT_EQ(process.run().status, 1);
-    const std::string end = "the worker process was ended by signal 25 (File size limit exceeded)\n";
-    EXPECT_EQ(terminal.content(), "composed  1\nfailed    2\n\nFAILED  REASON\na.bin   " + end + "c.bin   " + end);
+    const std::string end = ".bin: cannot write: File too large\n";
+    EXPECT_EQ(terminal.content(), "composed  1\nfailed    2\n\nFAILED  REASON\na.bin   " + edids_ + "/a" + end +
+                                      "c.bin   " + edids_ + "/c" + end);
+    EXPECT_EQ(content_of(edids_ + "/a.bin"), "old");
+    EXPECT_THAT(edids(), ElementsAre(Key("a.bin"), Key("b.bin")));
   }
+}
+
+// Each thread has its own addresses, and the library prints some.
+TEST_F(SeveralSinks, AMessageWithAnAddressIsCountedOnceWhicheverThreadSaysIt) {
+  for (int number = 0; number < 20; ++number) {
+    add_sink("sink" + std::to_string(number), std::string(128, '\0'));
+  }
+  const std::string platform = std::string(SAMPLE_SINKS_DIRECTORY) + "/../platforms/receiver_50hz.toml";
+  const process_result_t result = compose({"--platform", platform, "--sink", sinks_, "--jobs", "7"});
+  EXPECT_THAT(result.output, HasSubstr("20     sink0  BUG: Received a list that contains no entries. List:0x"));
+  EXPECT_EQ(result.output.find("List:0x"), result.output.rfind("List:0x"));
 }
 
 TEST_F(SeveralSinks, ProgressIsShownOnATerminalOnly) {

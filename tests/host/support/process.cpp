@@ -30,7 +30,7 @@ void redirect(int descriptor, const std::string &file, int flags) {
   redirect(STDOUT_FILENO, output, process.output_file ? O_WRONLY : O_WRONLY | O_CREAT);
   redirect(STDERR_FILENO, error, process.error_file ? O_WRONLY | O_NOCTTY : O_WRONLY | O_CREAT);
   if (process.file_size_limit) {
-    signal(SIGXFSZ, process.dies_of_file_size ? SIG_DFL : SIG_IGN);
+    signal(SIGXFSZ, SIG_IGN);
     const rlimit limit{*process.file_size_limit, *process.file_size_limit};
     setrlimit(RLIMIT_FSIZE, &limit);
   }

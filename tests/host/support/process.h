@@ -22,7 +22,6 @@ struct process_t {
   std::optional<std::string> output_file{};      ///< Where standard output goes instead of into the result.
   std::optional<std::string> error_file{};       ///< Where standard error goes instead of into the result.
   std::optional<std::size_t> file_size_limit{};  ///< Files that would grow beyond it cannot be written.
-  bool dies_of_file_size = false;                ///< Growing beyond that limit ends what tries it.
   std::optional<mode_t> creation_mask{};         ///< The umask.
   std::vector<std::string> environment{};        ///< "NAME=value" each, in addition to the test's own.
 
