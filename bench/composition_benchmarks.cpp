@@ -8,6 +8,7 @@
 #include "registration.h"
 #include "sinks.h"
 #include "stack_meter.h"
+#include "support/observation.h"
 
 namespace bench {
 namespace {
@@ -47,8 +48,7 @@ void run_observed(benchmark::State &state, const sink_t &sink, compose_observer_
   output_t output;
   u64_t decisions = 0;
   const auto compose = [&] {
-    compose_edid_observed(sink.data(), sink.size(), output.data(), output.size(), &cfg, values.get(), observer,
-                          &decisions);
+    test_support::compose_observed({sink.data(), sink.size()}, output, &cfg, values.get(), observer, &decisions);
   };
   compose();
   state.counters["decisions"] = static_cast<double>(decisions);

@@ -6,6 +6,7 @@
 #include "fuzz_target.h"
 #include "sink_bytes.h"
 #include "support/configuration_tree.h"
+#include "support/observation.h"
 
 namespace {
 
@@ -123,8 +124,8 @@ int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
     FUZZ_REQUIRE(std::strcmp(compose_verdict_string(decision->verdict), "unknown") != 0);
   };
   const auto again = input.block(edid_size);
-  FUZZ_REQUIRE(compose_edid_observed(sink.bytes.get(), sink.size, again.bytes.get(), edid_size, &cfg, nullptr, observer,
-                                     nullptr));
+  FUZZ_REQUIRE(test_support::compose_observed({sink.bytes.get(), sink.size}, {again.bytes.get(), edid_size}, &cfg,
+                                              nullptr, observer, nullptr));
   FUZZ_REQUIRE(std::memcmp(composed.bytes.get(), again.bytes.get(), edid_size) == 0);
   return 0;
 }

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <sstream>
 
+#include "support/observation.h"
 #include "support/output_capture.h"
 
 namespace observed {
@@ -12,9 +13,8 @@ composition_t compose(const situation_t &situation, const platform_values_t *val
   composition_t composition;
   const bytes_t sink = situation.sink.build();
   composition.output = test_support::output_of([&] {
-    composition.result = compose_edid_observed(sink.empty() ? nullptr : sink.data(), static_cast<u32>(sink.size()),
-                                               composition.bytes.data(), static_cast<u32>(composition.bytes.size()),
-                                               &situation.settings, values, observer, &composition.decisions);
+    composition.result = test_support::compose_observed(sink, composition.bytes, &situation.settings, values, observer,
+                                                        &composition.decisions);
   });
   return composition;
 }

@@ -5,6 +5,7 @@
 #include <type_traits>
 
 #include "observed_composition.h"
+#include "support/observation.h"
 #include "support/output_capture.h"
 
 namespace observed {
@@ -115,9 +116,9 @@ TEST(Observer, OfListsThatCantBeWalkedReportsNothing) {
         values.get()->*list = {};
         if (is_of_other_type) ll_init(&(values.get()->*list), "another type");
         composition.output = test_support::output_of([&] {
-          composition.result = compose_edid_observed(sink.data(), static_cast<u32>(sink.size()),
-                                                     composition.bytes.data(), 256, &situation.settings, values.get(),
-                                                     is_observed ? keep : nullptr, &composition.decisions);
+          composition.result =
+              test_support::compose_observed(sink, composition.bytes, &situation.settings, values.get(),
+                                             is_observed ? keep : nullptr, &composition.decisions);
         });
         if (!is_of_other_type) ll_init(&(values.get()->*list), "any type");  // For the destruction of the values.
       }
@@ -147,8 +148,8 @@ TEST(Observer, OfARefusedCompositionHearsNothing) {
     bytes_t bytes(512);
     std::vector<compose_decision_t> decisions;
     const std::string output = test_support::output_of([&] {
-      EXPECT_FALSE(compose_edid_observed(sink.data(), static_cast<u32>(sink.size()),
-                                         refusal.buffer ? bytes.data() : nullptr, refusal.size,
+      EXPECT_FALSE(
+          test_support::compose_observed(sink, refusal.buffer ? std::span(bytes).first(refusal.size) : std::span<u8>(),
                                          refusal.settings ? &situation.settings : nullptr,
                                          refusal.initialised ? values.get() : &moved, keep, &decisions));
     });
@@ -194,8 +195,7 @@ TEST(Observer, IsHandedItsContextBeforeTheCallReturns) {
   context_t context;
   context.self = &context;
   context.bytes = bytes.data();
-  EXPECT_TRUE(
-      compose_edid_observed(nullptr, 0, bytes.data(), 256, &situation.settings, values.get(), count_call, &context));
+  EXPECT_TRUE(test_support::compose_observed({}, bytes, &situation.settings, values.get(), count_call, &context));
   context.returned = true;
   EXPECT_EQ(context.calls, static_cast<int>(observe(situation).decisions.size()));
 }
@@ -209,8 +209,8 @@ TEST(Observer, MayDoWithoutContext) {
   test_support::scoped_values_t values;
   situation.platform.write_to(values.get());
   bytes_t bytes(256);
-  EXPECT_TRUE(compose_edid_observed(nullptr, 0, bytes.data(), 256, &situation.settings, values.get(),
-                                    count_without_context, nullptr));
+  EXPECT_TRUE(
+      test_support::compose_observed({}, bytes, &situation.settings, values.get(), count_without_context, nullptr));
 }
 
 void compose_again(const compose_decision_t *decision, void *context) {

@@ -8,6 +8,7 @@
 #include "annotation.h"
 #include "config_store.h"
 #include "support/hex_text.h"
+#include "support/observation.h"
 #include "support/output_capture.h"
 #include "text_format.h"
 
@@ -98,8 +99,7 @@ composition_t observed(const golden_case_t &golden_case, bool tracing, int *deci
   const composer_t composer = [](const std::vector<u8> &sink, std::vector<u8> *edid, const compose_cfg_t *settings,
                                  void *context) {
     const compose_observer_t count = [](const compose_decision_t *, void *number) { ++*static_cast<int *>(number); };
-    return compose_edid_observed(sink.data(), size_of(sink), edid->data(), size_of(*edid), settings, nullptr, count,
-                                 context);
+    return test_support::compose_observed(sink, *edid, settings, nullptr, count, context);
   };
   *decisions = 0;
   return composed_by(composer, decisions, golden_case, tracing);

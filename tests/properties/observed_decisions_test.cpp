@@ -12,6 +12,7 @@
 #include "random_sink.h"
 #include "random_situation.h"
 #include "support/list_contents.h"
+#include "support/observation.h"
 #include "support/output_capture.h"
 #include "support/records.h"
 
@@ -36,9 +37,8 @@ observed_t observe(const situation_t &situation, compose_observer_t observer) {
   values_of_t values(situation.platform);
   const bytes_t &sink = situation.sink.bytes;
   observed.output = test_support::output_of([&] {
-    observed.result = compose_edid_observed(sink.empty() ? nullptr : sink.data(), static_cast<u32>(sink.size()),
-                                            observed.bytes.data(), static_cast<u32>(observed.bytes.size()),
-                                            &situation.settings, values.get(), observer, &observed.decisions);
+    observed.result = test_support::compose_observed(sink, observed.bytes, &situation.settings, values.get(), observer,
+                                                     &observed.decisions);
   });
   return observed;
 }

@@ -9,6 +9,7 @@
 #include "sample.h"
 #include "support/allocation_ledger.h"
 #include "support/failing_allocation.h"
+#include "support/observation.h"
 #include "support/output_capture.h"
 
 namespace robustness {
@@ -56,8 +57,8 @@ class FailingObservation : public testing::Test {
     told_ = {};
     test_support::composition_t composition;
     const compose_cfg_t settings = rich_settings();
-    composition.result = compose_edid_observed(sink_.data(), static_cast<u32>(sink_.size()), memory.data() + margin,
-                                               256, &settings, from_, observer, &told_);
+    composition.result = test_support::compose_observed(sink_, std::span(memory).subspan(margin, 256), &settings, from_,
+                                                        observer, &told_);
     composition.bytes.assign(memory.begin() + margin, memory.end() - margin);
     memory.erase(memory.begin() + margin, memory.end() - margin);
     composition.rest_untouched = memory == bytes_t(2 * margin, 0xA5);
