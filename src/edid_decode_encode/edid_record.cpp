@@ -15,7 +15,7 @@ u8 edid_prepare(edid_t *edid) {
     }
   }
   for (const auto &row : record_lists) {
-    if (!ll_init(&(edid->*row.list), row.element_type)) {
+    if (!init_list(&(edid->*row.list), row.element_tag)) {
       LOG_ERROR("Failed initailzing list.");
       return 0;
     }

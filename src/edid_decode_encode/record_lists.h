@@ -9,17 +9,17 @@ namespace edid_composer {
 /// kept: two lists are called otherwise when they are missing at destruction.
 struct record_list_t {
   ll_list_t edid_t::*list;
-  const char *element_type;
+  u32 element_tag;
   const char *name;
   const char *name_when_missing;
 };
 
 inline constexpr record_list_t record_lists[] = {
-    {&edid_t::std_timings, element_type_name<std_timing_t>, "standard_timing_list", "standard_timing_list"},
-    {&edid_t::dtd_list, element_type_name<detailed_timing_t>, "detailed_timing_list", "detailed_timing_list"},
-    {&edid_t::video_list, element_type_name<short_video_desc_t>, "short_video_description_list",
+    {&edid_t::std_timings, element_tag<std_timing_t>, "standard_timing_list", "standard_timing_list"},
+    {&edid_t::dtd_list, element_tag<detailed_timing_t>, "detailed_timing_list", "detailed_timing_list"},
+    {&edid_t::video_list, element_tag<short_video_desc_t>, "short_video_description_list",
      "short_video_description_timing_list"},
-    {&edid_t::audio_list, element_type_name<short_audio_desc_t>, "short_audio_description_list",
+    {&edid_t::audio_list, element_tag<short_audio_desc_t>, "short_audio_description_list",
      "short_audio_description_timing_list"},
 };
 

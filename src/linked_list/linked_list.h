@@ -20,7 +20,11 @@ constexpr u32 _calculate_str_checksum(const char *name) {
   return tag;
 }
 
-/// ll_create_entry, in whose name it reports, for arguments that are known to be valid.
-bool create_entry(u32 size, ll_entry_t **entry, void **data, u32 tag);
+/// ll_init, in whose name it reports, for a tag that is known.
+bool init_list(ll_list_t *list, u32 tag);
+
+/// ll_create_entry, in whose name it reports, for a payload that the caller fills. Null when there is no memory for it;
+/// the two outputs are then named in the report.
+ll_entry_t *create_unfilled_entry(u32 size, u32 tag, const void *entry_output, const void *data_output);
 
 }  // namespace edid_composer

@@ -17,7 +17,11 @@ template <typename record_t, u32 capacity>
 inline constexpr const char *element_type_name<record_block_t<record_t, capacity>> = "record_block_t";
 
 /// Grows at its end and frees all when it goes. Addresses of records stay valid.
-template <typename record_t, u32 capacity = 64>
+/// As many as a block of some 1000 bytes holds, which the heap keeps at hand for the next composition.
+template <typename record_t>
+inline constexpr u32 records_per_block = 960 / sizeof(record_t);
+
+template <typename record_t, u32 capacity = records_per_block<record_t>>
 class record_blocks_t {
   using block_t = record_block_t<record_t, capacity>;
 
@@ -68,11 +72,19 @@ class record_blocks_t {
 
  private:
   bool add_block(const site_t &site, int line) {
-    new_entry_t<block_t> block(site, new_entry_texts, line);
-    if (!block || !block.add_to_front(&blocks_)) return false;
+    ll_entry_t *entry = nullptr;
+    entry = create_unfilled_entry(sizeof(block_t), element_tag<block_t>, &entry, this);
+    if (entry == nullptr) {
+      log_error(site, line, "%s", new_entry_texts.creation_failed);
+      return false;
+    }
+    ll_add_entry_to_front(&blocks_, entry);
+    auto *const block = static_cast<block_t *>(entry->data);
     block->previous = last_;
-    (last_ == nullptr ? first_ : last_->next) = &*block;
-    last_ = &*block;
+    block->next = nullptr;
+    block->count = 0;
+    (last_ == nullptr ? first_ : last_->next) = block;
+    last_ = block;
     return true;
   }
 

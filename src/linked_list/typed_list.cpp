@@ -1,5 +1,7 @@
 #include "linked_list/typed_list.h"
 
+#include <cstring>
+
 namespace edid_composer {
 
 const ll_entry_t *begin_checked_walk(const named_list_t &named, const char *type_name) {
@@ -11,19 +13,49 @@ const ll_entry_t *begin_checked_walk(const named_list_t &named, const char *type
   return named.list->head;
 }
 
-untyped_new_entry_t::untyped_new_entry_t(u32 size, u32 tag, const site_t &site, const new_entry_texts_t &texts,
-                                         int line)
-    : site_(site), texts_(texts), line_(line) {
-  if (create_entry(size, &entry_, &payload_, tag)) return;
-  log_error(site_, line_, "%s", texts_.creation_failed);
-  entry_ = nullptr;
-  payload_ = nullptr;
+namespace {
+
+/// An entry that is in no list yet.
+ll_entry_t *new_entry(const void *record, u32 size, u32 tag, const char *failure, const site_t &site, int line) {
+  ll_entry_t *entry = nullptr;
+  entry = create_unfilled_entry(size, tag, &entry, &record);
+  if (entry == nullptr) {
+    log_error(site, line, "%s", failure);
+  } else {
+    std::memcpy(entry->data, record, size);
+  }
+  return entry;
 }
 
-bool untyped_new_entry_t::settle(bool added) {
-  if (added) return true;
+}  // namespace
+
+bool untyped_appender_t::append(const void *record, u32 size, u32 tag) {
+  ll_entry_t *const entry = new_entry(record, size, tag, texts_.creation_failed, site_, line_);
+  if (entry == nullptr) return false;
+  if (add(entry)) return true;
   log_error(site_, line_, "%s", texts_.addition_failed);
-  discard();
+  ll_delete_entry(entry);
+  return false;
+}
+
+bool untyped_appender_t::add(ll_entry_t *entry) {
+  if (last_ == nullptr) {
+    if (!ll_add_entry_to_back(list_, entry)) return false;
+  } else {
+    last_->next = entry;
+    entry->list = list_;
+    ++list_->size;
+  }
+  last_ = entry;
+  return true;
+}
+
+bool prepend_untyped(ll_list_t *list, const void *record, u32 size, u32 tag, const site_t &site, int line) {
+  ll_entry_t *const entry = new_entry(record, size, tag, new_entry_texts.creation_failed, site, line);
+  if (entry == nullptr || ll_add_entry_to_front(list, entry)) return entry != nullptr;
+  // kept: the words for the back of the list.
+  log_error(site, line, "%s", new_entry_texts.addition_failed);
+  ll_delete_entry(entry);
   return false;
 }
 

@@ -5,14 +5,12 @@
 //
 //   for (const auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list))) ...
 //
-// An element that is at hand is appended as a copy, one that has to be filled step by step as a new entry:
+// Elements are appended as copies, one or several:
 //
 //   if (!append(&edid->std_timings, timing, site)) return false;
 //
-//   new_entry_t<detailed_timing_t> timing(site);
-//   if (!timing) return false;
-//   timing->h_active = ...;
-//   if (!timing.add_to_back(&edid->dtd_list)) return false;
+//   appender_t<short_video_desc_t> modes(&edid->video_list, site);
+//   for (...) if (!modes.append(mode)) return false;
 #pragma once
 
 #include <type_traits>
@@ -42,7 +40,7 @@ inline constexpr u32 element_tag = _calculate_str_checksum(element_type_name<rec
 
 template <typename record_t>
 [[nodiscard]] bool init_list(ll_list_t *list) {
-  return ll_init(list, element_type_name<record_t>);
+  return init_list(list, element_tag<record_t>);
 }
 
 /// True, without a line, when a walk over the list has nothing to report.
@@ -121,92 +119,55 @@ struct new_entry_texts_t {
   const char *addition_failed;
 };
 
-/// The wording of most operations, also of some that add to the front.
+/// The wording of most operations.
 inline constexpr new_entry_texts_t new_entry_texts{"Failed creating entry.",
                                                    "Failed adding entry to the back of the list."};
 
-/// An entry that is in no list yet, whatever its element type.
-class untyped_new_entry_t {
- public:
-  untyped_new_entry_t(u32 size, u32 tag, const site_t &site, const new_entry_texts_t &texts, int line);
-  untyped_new_entry_t(const untyped_new_entry_t &) = delete;
-  untyped_new_entry_t &operator=(const untyped_new_entry_t &) = delete;
-
-  explicit operator bool() const { return entry_ != nullptr; }
-
-  /// Hands the entry to a list. An entry that the list refuses is deleted.
-  [[nodiscard]] bool add_to_back(ll_list_t *list) { return settle(ll_add_entry_to_back(list, entry_)); }
-  [[nodiscard]] bool add_to_front(ll_list_t *list) { return settle(ll_add_entry_to_front(list, entry_)); }
-
-  /// Hands the entry to a verified list whose end is known.
-  bool link(ll_list_t *list, ll_entry_t **end) const {
-    *end = entry_;
-    entry_->list = list;
-    ++list->size;
-    return true;
-  }
-  /// The link after the entry, once a list holds it.
-  ll_entry_t **next() const { return &entry_->next; }
-
-  /// Deletes the entry instead.
-  void discard() { ll_delete_entry(entry_); }
-
- protected:
-  void *payload() const { return payload_; }
-
- private:
-  bool settle(bool added);
-
-  const site_t &site_;
-  const new_entry_texts_t &texts_;
-  int line_;
-  ll_entry_t *entry_ = nullptr;
-  void *payload_ = nullptr;
-};
-
-/// An entry for an element of @p record_t, zero-filled. Failures are reported in the name of @p site.
-template <typename record_t>
-class new_entry_t : public untyped_new_entry_t {
- public:
-  explicit new_entry_t(const site_t &site, const new_entry_texts_t &texts = new_entry_texts,
-                       int line = __builtin_LINE())
-      : untyped_new_entry_t(sizeof(record_t), element_tag<record_t>, site, texts, line) {}
-
-  record_t &operator*() const { return *static_cast<record_t *>(payload()); }
-  record_t *operator->() const { return static_cast<record_t *>(payload()); }
-};
-
 /// Appends records to one list. The first addition verifies the list; the following ones know its end, so nobody else
 /// may change the list in between. Failures are reported in the name of @p site.
-template <typename record_t>
-class appender_t {
+class untyped_appender_t {
  public:
-  explicit appender_t(ll_list_t *list, const site_t &site, const new_entry_texts_t &texts = new_entry_texts,
-                      int line = __builtin_LINE())
+  untyped_appender_t(ll_list_t *list, const site_t &site, const new_entry_texts_t &texts, int line)
       : list_(list), site_(site), texts_(texts), line_(line) {}
 
-  [[nodiscard]] bool append(const record_t &record) {
-    new_entry_t<record_t> entry(site_, texts_, line_);
-    if (!entry) return false;
-    *entry = record;
-    if (end_ == nullptr ? !entry.add_to_back(list_) : !entry.link(list_, end_)) return false;
-    end_ = entry.next();
-    return true;
-  }
+ protected:
+  [[nodiscard]] bool append(const void *record, u32 size, u32 tag);
 
  private:
+  bool add(ll_entry_t *entry);
+
   ll_list_t *list_;
   const site_t &site_;
   const new_entry_texts_t &texts_;
   int line_;
-  ll_entry_t **end_ = nullptr;  ///< The link that ends the list, once it is known.
+  ll_entry_t *last_ = nullptr;  ///< Once the list is verified.
+};
+
+template <typename record_t>
+class appender_t : private untyped_appender_t {
+ public:
+  explicit appender_t(ll_list_t *list, const site_t &site, const new_entry_texts_t &texts = new_entry_texts,
+                      int line = __builtin_LINE())
+      : untyped_appender_t(list, site, texts, line) {}
+
+  [[nodiscard]] bool append(const record_t &record) {
+    return untyped_appender_t::append(&record, sizeof record, element_tag<record_t>);
+  }
 };
 
 /// Appends a copy of @p record to @p list. Failures are reported in the name of @p site.
 template <typename record_t>
-[[nodiscard]] bool append(ll_list_t *list, const record_t &record, const site_t &site,
-                          const new_entry_texts_t &texts = new_entry_texts, int line = __builtin_LINE()) {
-  return appender_t<record_t>(list, site, texts, line).append(record);
+[[nodiscard]] bool append(ll_list_t *list, const record_t &record, const site_t &site, int line = __builtin_LINE()) {
+  return appender_t<record_t>(list, site, new_entry_texts, line).append(record);
+}
+
+[[nodiscard]] bool prepend_untyped(ll_list_t *list, const void *record, u32 size, u32 tag, const site_t &site,
+                                   int line);
+
+/// Puts a copy of @p record before the others. Failures are reported in the name of @p site.
+template <typename record_t>
+[[nodiscard]] bool prepend(ll_list_t *list, const record_t &record, const site_t &site, int line = __builtin_LINE()) {
+  return prepend_untyped(list, &record, sizeof record, element_tag<record_t>, site, line);
 }
 
 }  // namespace edid_composer

@@ -9,22 +9,22 @@ namespace {
 /// The six lists of a record, in the order in which they are initialised and deleted, and their names in reports.
 struct platform_list_t {
   ll_list_t platform_values_t::*list;
-  const char *element_type;
+  u32 element_tag;
   const char *initialised_name;
   const char *removed_name;
 };
 
 constexpr platform_list_t platform_lists[] = {
-    {&platform_values_t::audio_list, element_type_name<i32>, "audio_list", "audio_list"},
-    {&platform_values_t::video_50_priority, element_type_name<short_video_desc_t>, "video_50_priority",
+    {&platform_values_t::audio_list, element_tag<i32>, "audio_list", "audio_list"},
+    {&platform_values_t::video_50_priority, element_tag<short_video_desc_t>, "video_50_priority",
      "video_50_priority"},
-    {&platform_values_t::video_50_additional, element_type_name<short_video_desc_t>, "video_50_additional",
+    {&platform_values_t::video_50_additional, element_tag<short_video_desc_t>, "video_50_additional",
      "video_50_additional"},
-    {&platform_values_t::video_60_priority, element_type_name<short_video_desc_t>, "video_60_priority",
+    {&platform_values_t::video_60_priority, element_tag<short_video_desc_t>, "video_60_priority",
      "video_60_priority"},
-    {&platform_values_t::video_60_additional, element_type_name<short_video_desc_t>, "video_60_additional",
+    {&platform_values_t::video_60_additional, element_tag<short_video_desc_t>, "video_60_additional",
      "video_60_additional"},
-    {&platform_values_t::std_timings, element_type_name<std_timing_t>, "standard timings", "values standard timings"},
+    {&platform_values_t::std_timings, element_tag<std_timing_t>, "standard timings", "values standard timings"},
 };
 
 }  // namespace
@@ -40,7 +40,7 @@ bool platform_values_init(platform_values_t *values) {
   }
   std::memset(values, 0, sizeof *values);
   for (const auto &row : platform_lists) {
-    if (!ll_init(&(values->*row.list), row.element_type)) {
+    if (!init_list(&(values->*row.list), row.element_tag)) {
       LOG_BUG("Failed to initialize the platform values %s", row.initialised_name);
       return false;
     }

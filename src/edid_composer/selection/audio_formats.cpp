@@ -123,22 +123,22 @@ bool ensure_basic_audio(ll_list_t *formats, journal_t *journal) {
     }
   }
   LOG_TRACE("\tNo \"basic audio\" PCM 2-chan entry found. Adding one.");
-  new_entry_t<short_audio_desc_t> basic(site);
-  if (!basic) return false;
-  basic->type = audio_pcm;
-  basic->channels = 2;
-  basic->frequencies = 0x07;  // 32, 44.1 and 48 kHz
-  basic->pcm_bits = 0x05;     // 16 and 24 bit
-  // kept: the words for the back of the list.
-  if (!basic.add_to_front(formats)) return false;
+  constexpr short_audio_desc_t basic{.type = audio_pcm,
+                                     .channels = 2,
+                                     .frequencies = 0x07,  // 32, 44.1 and 48 kHz
+                                     .pcm_bits = 0x05,     // 16 and 24 bit
+                                     .max_bitrate = 0,
+                                     .value = 0,
+                                     .wma_profile = 0};
+  if (!prepend(formats, basic, site)) return false;
   journal->note({.subject = COMPOSE_SUBJECT_AUDIO_FORMAT,
                  .origin = COMPOSE_ORIGIN_LIBRARY,
-                 .code = basic->type,
+                 .code = basic.type,
                  .reason = COMPOSE_REASON_BASIC_AUDIO,
-                 .values = reason_values(basic->channels)});
+                 .values = reason_values(basic.channels)});
   if (debug_enabled()) {
     print("\t");
-    print_audio_structure(&*basic);
+    print_audio_structure(&basic);
   }
   return true;
 }

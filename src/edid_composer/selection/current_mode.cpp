@@ -19,12 +19,8 @@ bool delete_first(u32 vic, ll_list_t *modes) {
 
 bool put_first(u32 vic, ll_list_t *modes) {
   if (!delete_first(vic, modes)) return false;
-  new_entry_t<short_video_desc_t> current(site);
-  if (!current) return false;
-  current->vic = vic;
   LOG_TRACE("\tAdding hdmi output mode as the priority mode:%s", short_video_timing_string(vic));
-  // kept: the words for the back of the list.
-  return current.add_to_front(modes);
+  return prepend(modes, short_video_desc_t{.native = 0, .vic = vic, .stereo = 0}, site);
 }
 
 }  // namespace

@@ -77,7 +77,7 @@ bool prioritize(const ll_list_t *list, const candidates_t &candidates, ll_list_t
 video_selection_t _filter_video_modes(const inputs_t &inputs, ll_list_t *modes, journal_t *journal) {
   const platform_values_t &platform = inputs.platform;
   video_selection_t selection;
-  candidates_t candidates;
+  candidates_t candidates(debug_enabled() || platform.geometry_limit != 0);
   if (!add_sink_modes(&inputs.sink, &candidates, journal)) return selection;
   selection.native_rate = _determine_tv_native_refresh_rate(inputs);
   const i32 rate = selection.native_rate.hz;
