@@ -7,7 +7,7 @@ cd "$(dirname "$0")/.."
 
 echo 'Building and measuring; takes 3 minutes. Figures are steadier on a machine that does nothing else.'
 install_packages build-essential cmake ninja-build libbenchmark-dev libgtest-dev libgmock-dev libtomlplusplus-dev \
-  libcli11-dev python3 valgrind
+  libcli11-dev nlohmann-json3-dev libutfcpp-dev python3 valgrind
 
 build=build/bench
 cmake --preset release -B "$build" -DEDID_COMPOSER_BENCH=ON

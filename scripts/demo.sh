@@ -6,7 +6,7 @@ cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 
 echo 'Building edid-composer and composing an EDID for a 4K television; takes 1 to 5 minutes.'
-install_packages build-essential cmake ninja-build libtomlplusplus-dev libcli11-dev
+install_packages build-essential cmake ninja-build libtomlplusplus-dev libcli11-dev nlohmann-json3-dev libutfcpp-dev
 
 build() {
   cmake --preset release -DBUILD_TESTING=OFF && cmake --build --preset release

@@ -9,7 +9,7 @@ cd "$(dirname "$0")/.."
 
 echo 'Building everything twice (optimised, with sanitizers) and running all tests; takes 5 to 15 minutes.'
 install_packages build-essential cmake ninja-build git libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev \
-  edid-decode python3 doxygen groff-base man-db pkg-config fakeroot file valgrind chromium chromium-driver
+  nlohmann-json3-dev libutfcpp-dev edid-decode python3 doxygen groff-base man-db pkg-config fakeroot file valgrind chromium chromium-driver
 
 warnings_are_errors=OFF
 if [ "${CI:-}" = true ]; then

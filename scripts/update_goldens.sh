@@ -7,7 +7,8 @@ cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 
 echo 'Building the library and the golden maker, and making the goldens anew; takes 1 to 5 minutes.'
-install_packages build-essential cmake ninja-build libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev
+install_packages build-essential cmake ninja-build libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev \
+  nlohmann-json3-dev libutfcpp-dev
 
 build() {
   cmake --preset release -DBUILD_TESTING=ON && cmake --build --preset release --target golden_maker

@@ -1,36 +1,17 @@
 // edid-composer: composes and prints EDIDs from the command line.
 #include <cstdio>
 #include <exception>
-#include <variant>
 
-#include "arguments.h"
-#include "bad_input.h"
-#include "commands.h"
-#include "exit_status.h"
-#include "option_values.h"
-#include "standard_output.h"
-
-namespace edid_cli {
-namespace {
-
-int run(const help_t &help) {
-  std::fputs(help.text.c_str(), stdout);
-  return done_status;
-}
-
-int run_command(int argument_count, char **arguments) {
-  const arguments_t parsed = parse_arguments(argument_count, arguments);
-  const int status = std::visit([](const auto &options) { return run(options); }, parsed);
-  flush_standard_output();
-  return status;
-}
-
-}  // namespace
-}  // namespace edid_cli
+#include "commands/command_line.h"
+#include "commands/exit_status.h"
+#include "io/program_name.h"
+#include "io/standard_output.h"
 
 int main(int argument_count, char **arguments) {
   try {
-    return edid_cli::run_command(argument_count, arguments);
+    const int status = edid_cli::run_command_line(argument_count, arguments);
+    edid_cli::flush_standard_output();
+    return status;
   } catch (const std::exception &problem) {
     // What standard output still holds comes first, as it happened first.
     std::fflush(stdout);

@@ -9,7 +9,7 @@
 #include <vector>
 
 #include "composition.h"
-#include "edid_file.h"
+#include "edid_input/edid_file.h"
 #include "first_difference.h"
 #include "golden_cases.h"
 #include "support/hex_text.h"

@@ -1,5 +1,5 @@
 #!/bin/bash
-# Modules include downward only, no two files include each other, and internal headers stay inside the library and the
+# Modules include downward only, the program's rooms likewise, no two files include each other, and internal headers stay inside the library and the
 # tests of its private functions: tests through the public operations and what tests share see the public header only.
 # Usage: include_directions.sh PROJECT
 . "$(dirname "$0")/reporting.sh"
@@ -43,6 +43,30 @@ while read -r file; do
 done < <(find src -name '*.h' -o -name '*.cpp' -o -name '*.cpp.in' | sort)
 [ "$count" -gt 0 ] || fail "no includes found in src/"
 
+# How far up a room of the program stands: in the order of the table in host/cli/CMakeLists.txt.
+room_rank() {
+  local place=0 room
+  for room in io text edid_input edid_text composition platform batch explain commands; do
+    [ "${1%%/*}" != "$room" ] || { echo "$place" && return; }
+    place=$((place + 1))
+  done
+  if [ "$1" = main.cpp ]; then echo "$place"; else echo unknown; fi
+}
+
+program_count=0
+while read -r file; do
+  own=${file#host/cli/}
+  own_rank=$(room_rank "$own")
+  [ "$own_rank" != unknown ] || complain "$file is in no known room"
+  for included in $(includes "$file"); do
+    [ -f "host/cli/$included" ] || continue
+    program_count=$((program_count + 1))
+    edges+="cli/$own cli/$included"$'\n'
+    [ "$(room_rank "$included")" -le "$own_rank" ] || complain "$file includes $included, which stands above it"
+  done
+done < <(find host/cli -name '*.h' -o -name '*.cpp' | sort)
+[ "$program_count" -gt 0 ] || fail "no includes found in host/cli/"
+
 cycles=$(printf '%s' "$edges" | tsort 2>&1 >/dev/null) || complain "files that include each other:"$'\n'"$cycles"
 
 # Outside of src/: an include is internal when it names a file of src/ and none beside the including file or at the roots
@@ -66,4 +90,4 @@ done < <(find . -path ./src -prune -o -path ./build -prune -o -path ./.git -prun
 
 [ -z "$violations" ] || fail "include directions:
 $violations"
-echo "$count includes in src/, all downward"
+echo "$count includes in src/ and $program_count in host/cli/, all downward"

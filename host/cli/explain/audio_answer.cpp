@@ -1,11 +1,11 @@
 #include "explain/audio_answer.h"
 
 #include <algorithm>
-#include <cstdio>
 
 #include "explain/mode_names.h"
 #include "explain/reason_texts.h"
 #include "explain/steps.h"
+#include "text/hexadecimal.h"
 
 namespace edid_cli {
 namespace {
@@ -91,9 +91,7 @@ class audio_question_t {
       steps_.drop_option("--audio-sink-filter");
     }
     if ((settings.audio_mask & mask_bit(type_)) == 0) {
-      char mask[16];
-      std::snprintf(mask, sizeof mask, "0x%X", settings.audio_mask | mask_bit(type_));
-      steps_.give_option("--audio-mask", mask);
+      steps_.give_option("--audio-mask", hex_number(settings.audio_mask | mask_bit(type_)));
     }
   }
 

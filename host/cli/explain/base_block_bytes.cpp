@@ -1,5 +1,7 @@
-// The base block: EDID 1.3, section 3.
-#include "explain/byte_fields.h"
+#include "explain/base_block_bytes.h"
+
+#include "explain/descriptor_bytes.h"
+#include "text/hexadecimal.h"
 
 namespace edid_cli {
 namespace {
@@ -68,8 +70,7 @@ std::string standard_timing(const field_place_t &place) {
 constexpr field_row_t identity_rows[] = {
     {8, "Header", [](const field_place_t &) -> std::string { return "fixed: an EDID begins here"; }},
     {2, "Manufacturer", manufacturer},
-    {2, "Product code",
-     [](const field_place_t &place) { return field_text("0x%04X", place.here() | place.here(1) << 8); }},
+    {2, "Product code", [](const field_place_t &place) { return hex_number(place.here() | place.here(1) << 8, 4); }},
     {4, "Serial number", serial_number},
     {1, "Week of manufacture", week},
     {1, "Year of manufacture", [](const field_place_t &place) { return std::to_string(1990 + place.here()); }},

@@ -32,7 +32,7 @@ class byte_naming_t {
   explicit byte_naming_t(std::span<const u8> edid) : edid_(edid) {}
 
   std::size_t position() const { return position_; }
-  /// The byte so far behind the position.
+  /// The byte that far after the position.
   unsigned next(std::size_t index = 0) const { return place(position_).here(index); }
   field_place_t place(std::size_t base) const { return {edid_, base, position_}; }
 
@@ -53,18 +53,10 @@ class byte_naming_t {
   std::vector<byte_field_t> fields_;
 };
 
-inline constexpr std::size_t descriptor_size = 18;
-
-/// Each names what it is called after, from the position on.
-void name_base_block(byte_naming_t &naming);
-void name_descriptor(byte_naming_t &naming);
-void name_data_block(byte_naming_t &naming);
-/// The payload of an HDMI vendor-specific data block, up to @p end.
-void name_hdmi_block(byte_naming_t &naming, std::size_t end);
 /// The last byte of the block that begins at @p base.
 std::string checksum_meaning(const field_place_t &place);
 
-/// A number and a text behind it: "12 lines".
+/// A number and its unit: "12 lines".
 std::string number_text(unsigned number, const char *unit);
 /// A number as printf writes it.
 [[gnu::format(printf, 1, 2)]] std::string field_text(const char *format, ...);

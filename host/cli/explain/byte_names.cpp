@@ -2,7 +2,11 @@
 
 #include <algorithm>
 
+#include "explain/base_block_bytes.h"
 #include "explain/byte_fields.h"
+#include "explain/data_block_bytes.h"
+#include "explain/descriptor_bytes.h"
+#include "text/hexadecimal.h"
 
 namespace edid_cli {
 namespace {
@@ -22,8 +26,7 @@ constexpr field_row_t header_rows[] = {
     {1, "Revision", [](const field_place_t &place) { return std::to_string(place.here()); }},
     {1, "Detailed timings begin",
      [](const field_place_t &place) {
-       return field_text("at byte %u of this block, 0x%02X", place.here(),
-                         static_cast<unsigned>(place.base) + place.here());
+       return "at byte " + std::to_string(place.here()) + " of this block, " + hex_number(place.base + place.here(), 2);
      }},
     {1, "Flags",
      [](const field_place_t &place) {

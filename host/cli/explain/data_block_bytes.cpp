@@ -1,7 +1,8 @@
-// The data blocks of the extension: CEA-861, section 7.5.
+#include "explain/data_block_bytes.h"
+
 #include <algorithm>
 
-#include "explain/byte_fields.h"
+#include "explain/hdmi_bytes.h"
 #include "explain/mode_names.h"
 
 namespace edid_cli {

@@ -1,5 +1,6 @@
-// The 18-byte descriptors: EDID 1.3, section 3.10.
-#include "explain/byte_fields.h"
+#include "explain/descriptor_bytes.h"
+
+#include "text/hexadecimal.h"
 
 namespace edid_cli {
 namespace {
@@ -128,7 +129,7 @@ void name_display_descriptor(byte_naming_t &naming, std::size_t end) {
     kind = row.tag == tag ? row : kind;
   }
   naming.name(byte_block_t::descriptor, 3, "No pixel clock", "not a timing");
-  naming.name(byte_block_t::descriptor, 1, "Descriptor tag", field_text("0x%02X: ", tag) + kind.name);
+  naming.name(byte_block_t::descriptor, 1, "Descriptor tag", hex_number(tag, 2) + ": " + kind.name);
   naming.name(byte_block_t::descriptor, 1, "Reserved", "0");
   if (tag == range_limits_tag) {
     naming.name(byte_block_t::descriptor, range_rows, end);

@@ -4,9 +4,9 @@
 #include <string>
 #include <vector>
 
-#include "composition.h"
-#include "decoded_edid.h"
-#include "explain/platform_places.h"
+#include "composition/composition.h"
+#include "edid_text/decoded_edid.h"
+#include "platform/platform_places.h"
 
 namespace edid_cli {
 

@@ -1,132 +1,119 @@
-#include <cstdio>
+#include "explain/explanation_json.h"
+
+#include <algorithm>
+#include <iterator>
+#include <nlohmann/json.hpp>
 #include <span>
 
-#include "explain/json_writer.h"
-#include "explain/outputs.h"
+#include "explain/rows.h"
+#include "text/hexadecimal.h"
+#include "text/utf8_text.h"
 
 namespace edid_cli {
 namespace {
 
+using json_t = nlohmann::ordered_json;
+
 /// Of both documents. A program that reads them shall look at it first.
-constexpr std::int64_t document_version = 1;
+constexpr int document_version = 1;
 
-std::string hexadecimal(std::span<const u8> bytes) {
-  std::string text;
-  for (const u8 byte : bytes) {
-    char digits[3];
-    std::snprintf(digits, sizeof digits, "%02x", static_cast<unsigned>(byte));
-    text += digits;
-  }
-  return text;
+/// What comes from outside may have any bytes.
+json_t json_text(std::string_view text) {
+  return valid_utf8(text);
 }
 
-/// A place, which is null where there is none.
-void write_place(json_writer_t &json, const char *name, i32 place) {
-  json.key(name);
-  if (place < 0) {
-    json.null();
-  } else {
-    json.value(std::int64_t{place});
-  }
+json_t json_bytes(std::span<const u8> bytes) {
+  return hex_bytes(bytes, "", letters_t::small);
 }
 
-void write_sink(json_writer_t &json, const explained_t &explained) {
-  json.key("sink");
+template <typename values_t, typename maker_t>
+json_t json_list(const values_t &values, maker_t make) {
+  json_t list = json_t::array();
+  std::transform(std::begin(values), std::end(values), std::back_inserter(list), make);
+  return list;
+}
+
+json_t json_sink(const explained_t &explained) {
   if (explained.sink_bytes.empty()) {
-    json.null();
-    return;
+    return nullptr;
   }
-  json.open_object().member("source", explained.sink_name);
-  json.member("manufacturer", static_cast<const char *>(explained.sink.manufacturer));
-  json.member("name", static_cast<const char *>(explained.sink.monitor_name));
-  json.member("bytes", hexadecimal(explained.sink_bytes)).close();
+  return {{"source", json_text(explained.sink_name)},
+          {"manufacturer", json_text(explained.sink.manufacturer)},
+          {"name", json_text(explained.sink.monitor_name)},
+          {"bytes", json_bytes(explained.sink_bytes)}};
 }
 
-void write_settings(json_writer_t &json, const composition_options_t &options) {
+json_t json_settings(const composition_options_t &options) {
   const compose_cfg_t &settings = options.settings;
-  json.key("settings").open_object();
-  json.member("port", std::int64_t{options.ports.first});
-  json.member("audio_mask", std::int64_t{settings.audio_mask});
-  json.member("audio_sink_filter", settings.audio_sink_filter == 1);
-  json.member("3d", std::int64_t{settings.hdmi_3d_mode});
-  json.key("latency").open_list();
-  for (const u32 latency : settings.edid_latency) {
-    json.value(std::int64_t{latency});
-  }
-  json.close().close();
+  return {{"port", options.ports.first},
+          {"audio_mask", settings.audio_mask},
+          {"audio_sink_filter", settings.audio_sink_filter == 1},
+          {"3d", settings.hdmi_3d_mode},
+          {"latency", json_t(settings.edid_latency)}};
 }
 
-void write_sources(json_writer_t &json, const row_t &row) {
-  json.key("sources").open_list();
-  for (const source_t &source : row.sources) {
-    json.open_object().member("kind", source_kind_id(source.kind)).member("text", source.text);
-    if (!source.key.empty()) {
-      json.member("key", source.key);
-    }
-    if (source.line != 0) {
-      json.member("line", std::int64_t{source.line});
-    }
-    json.close();
+json_t json_source(const source_t &source) {
+  json_t json{{"kind", source_kind_id(source.kind)}, {"text", json_text(source.text)}};
+  if (!source.key.empty()) {
+    json["key"] = json_text(source.key);
   }
-  json.close();
+  if (source.line != 0) {
+    json["line"] = source.line;
+  }
+  return json;
 }
 
-void write_row(json_writer_t &json, const row_t &row) {
+json_t json_row(const row_t &row) {
   const compose_decision_t &decision = row.decision;
-  json.open_object().member("section", section_id(row.section));
-  json.member("subject", compose_subject_string(decision.subject)).member("subject_id", std::int64_t{decision.subject});
-  json.member("code", std::int64_t{decision.code}).member("name", row.name);
-  json.member("verdict", compose_verdict_string(decision.verdict)).member("verdict_id", std::int64_t{decision.verdict});
-  json.member("reason", compose_reason_string(decision.reason)).member("reason_id", std::int64_t{decision.reason});
-  json.key("values").open_list();
-  for (const i32 value : decision.value) {
-    json.value(std::int64_t{value});
+  return {{"section", section_id(row.section)},
+          {"subject", compose_subject_string(decision.subject)},
+          {"subject_id", decision.subject},
+          {"code", decision.code},
+          {"name", json_text(row.name)},
+          {"verdict", compose_verdict_string(decision.verdict)},
+          {"verdict_id", decision.verdict},
+          {"reason", compose_reason_string(decision.reason)},
+          {"reason_id", decision.reason},
+          {"values", json_t(decision.value)},
+          {"sentence", json_text(row.sentence)},
+          {"position", decision.position < 0 ? json_t(nullptr) : json_t(decision.position)},
+          {"sources", json_list(row.sources, json_source)}};
+}
+
+json_t json_step(const step_t &step) {
+  json_t json{{"text", json_text(step.text)}, {"key", json_text(step.key)}};
+  if (step.line != 0) {
+    json["line"] = step.line;
   }
-  json.close().member("sentence", row.sentence);
-  write_place(json, "position", decision.position);
-  write_sources(json, row);
-  json.close();
+  return json;
+}
+
+json_t json_answer(const answer_t &answer) {
+  return {{"name", json_text(answer.name)},
+          {"offered", answer.is_offered},
+          {"reasons", json_list(answer.reasons, json_text)},
+          {"steps", json_list(answer.steps, json_step)}};
+}
+
+std::string document(const json_t &json) {
+  constexpr int indentation = 2;
+  return json.dump(indentation) + "\n";
 }
 
 }  // namespace
 
 std::string explanation_json(const explained_t &explained) {
-  json_writer_t json;
-  json.open_object().member("version", document_version);
-  write_sink(json, explained);
-  json.member("platform", explained.places.name());
-  write_settings(json, explained.options);
-  json.member("edid", hexadecimal(explained.composition.new_edid));
-  json.key("decisions").open_list();
-  for (const row_t &row : rows_of(explained)) {
-    write_row(json, row);
-  }
-  json.close().close();
-  return json.text();
+  return document({{"version", document_version},
+                   {"sink", json_sink(explained)},
+                   {"platform", json_text(explained.places.name())},
+                   {"settings", json_settings(explained.options)},
+                   {"edid", json_bytes(explained.composition.new_edid)},
+                   {"decisions", json_list(rows_of(explained), json_row)}});
 }
 
 std::string answer_json(const std::string &wanted, const std::vector<answer_t> &answers) {
-  json_writer_t json;
-  json.open_object().member("version", document_version).member("want", wanted);
-  json.key("answers").open_list();
-  for (const answer_t &answer : answers) {
-    json.open_object().member("name", answer.name).member("offered", answer.is_offered);
-    json.key("reasons").open_list();
-    for (const std::string &reason : answer.reasons) {
-      json.value(reason);
-    }
-    json.close().key("steps").open_list();
-    for (const step_t &step : answer.steps) {
-      json.open_object().member("text", step.text).member("key", step.key);
-      if (step.line != 0) {
-        json.member("line", std::int64_t{step.line});
-      }
-      json.close();
-    }
-    json.close().close();
-  }
-  json.close().close();
-  return json.text();
+  return document(
+      {{"version", document_version}, {"want", json_text(wanted)}, {"answers", json_list(answers, json_answer)}});
 }
 
 }  // namespace edid_cli

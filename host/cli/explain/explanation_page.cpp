@@ -1,12 +1,16 @@
+#include "explain/explanation_page.h"
+
 #include <array>
 #include <string_view>
 
-#include "explain/outputs.h"
-#include "explain/page_parts.h"
+#include "explain/byte_names.h"
+#include "explain/page_bytes.h"
+#include "explain/page_cards.h"
+#include "explain/page_decisions.h"
 #include "explain/page_template.h"
-#include "explain/utf8_text.h"
-#include "option_values.h"
-#include "standard_output.h"
+#include "io/program_name.h"
+#include "io/standard_output.h"
+#include "text/utf8_text.h"
 
 namespace edid_cli {
 namespace {

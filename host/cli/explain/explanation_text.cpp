@@ -1,6 +1,8 @@
-#include "explain/outputs.h"
-#include "printable_text.h"
-#include "text_table.h"
+#include "explain/explanation_text.h"
+
+#include "explain/rows.h"
+#include "text/printable_text.h"
+#include "text/text_table.h"
 
 namespace edid_cli {
 

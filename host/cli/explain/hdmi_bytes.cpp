@@ -1,7 +1,8 @@
-// The HDMI vendor-specific data block: HDMI 1.4a, section 8.3.2.
+#include "explain/hdmi_bytes.h"
+
 #include <algorithm>
 
-#include "explain/byte_fields.h"
+#include "edid_text/physical_address_text.h"
 #include "explain/mode_names.h"
 
 namespace edid_cli {
@@ -27,7 +28,7 @@ constexpr field_bit_t presence_bits[] = {{latencies_present, "latencies follow"}
                                          {0x01, "graphics"}};
 
 std::string address(const field_place_t &place) {
-  return field_text("%u.%u.%u.%u", place.here() >> 4, place.here() & 15U, place.here(1) >> 4, place.here(1) & 15U);
+  return physical_address_text(place.here() << 8 | place.here(1));
 }
 
 std::string tmds_clock(const field_place_t &place) {

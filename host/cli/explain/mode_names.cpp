@@ -1,7 +1,9 @@
 #include "explain/mode_names.h"
 
 #include <algorithm>
-#include <cctype>
+#include <iterator>
+
+#include "text/lower_case.h"
 
 namespace edid_cli {
 namespace {
@@ -101,9 +103,7 @@ std::vector<u32> hdmi_vics_of_mode(std::string_view name) {
 }
 
 u32 audio_type_of(std::string_view name) {
-  std::string lower(name);
-  std::transform(lower.begin(), lower.end(), lower.begin(),
-                 [](unsigned char character) { return static_cast<char>(std::tolower(character)); });
+  const std::string lower = lower_case(name);
   const auto *const found = std::find_if(std::begin(audio_names), std::end(audio_names),
                                          [&lower](const audio_name_t &entry) { return entry.name == lower; });
   return found != std::end(audio_names) ? found->type : 0;

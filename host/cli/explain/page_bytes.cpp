@@ -1,8 +1,8 @@
-#include <cstdio>
+#include "explain/page_bytes.h"
 
 #include "explain/byte_fields.h"
-#include "explain/page_parts.h"
-#include "explain/utf8_text.h"
+#include "text/hexadecimal.h"
+#include "text/utf8_text.h"
 
 namespace edid_cli {
 namespace {
@@ -18,16 +18,8 @@ std::string row_id(const byte_field_t &field) {
 std::string byte_html(u8 byte, const byte_field_t &field, std::size_t offset) {
   const std::string part = field.size > 1 ? field_text(" (%zu of %zu)", offset - field.offset + 1, field.size) : "";
   return "<a href=\"#" + row_id(field) + "\" class=\"" + byte_block_id(field.block) + "\" title=\"" +
-         field_text("0x%02zX ", offset) + html_text(field.name + part + ": " + field.meaning) + "\">" +
-         field_text("%02X", static_cast<unsigned>(byte)) + "</a>";
-}
-
-std::string hexadecimal(std::span<const u8> bytes) {
-  std::string text;
-  for (const u8 byte : bytes) {
-    text += field_text("%s%02X", text.empty() ? "" : " ", static_cast<unsigned>(byte));
-  }
-  return text;
+         hex_number(offset, 2) + " " + html_text(field.name + part + ": " + field.meaning) + "\">" +
+         hex_digits(byte, 2) + "</a>";
 }
 
 }  // namespace
@@ -55,8 +47,8 @@ std::string bytes_html(std::span<const u8> edid, const std::vector<byte_field_t>
         continue;
       }
       if (offset % bytes_in_half_line == 0) {
-        html += field_text("\n<span%s>%02zX</span>", offset % (2 * bytes_in_half_line) != 0 ? " class=\"half\"" : "",
-                           offset);
+        html += std::string("\n<span") + (offset % (2 * bytes_in_half_line) != 0 ? " class=\"half\"" : "") + ">" +
+                hex_digits(offset, 2) + "</span>";
       }
       html += byte_html(edid[offset], field, offset);
     }
@@ -67,8 +59,8 @@ std::string bytes_html(std::span<const u8> edid, const std::vector<byte_field_t>
 std::string fields_html(std::span<const u8> edid, const std::vector<byte_field_t> &fields) {
   std::string html;
   for (const byte_field_t &field : fields) {
-    html += "<tr id=\"" + row_id(field) + "\"><td class=\"mono\">" + field_text("0x%02zX", field.offset) +
-            "</td><td class=\"mono\">" + hexadecimal(edid.subspan(field.offset, field.size)) +
+    html += "<tr id=\"" + row_id(field) + "\"><td class=\"mono\">" + hex_number(field.offset, 2) +
+            "</td><td class=\"mono\">" + hex_bytes(edid.subspan(field.offset, field.size), " ", letters_t::capital) +
             "</td><td class=\"part\">" + byte_block_title(field.block) + "</td><th scope=\"row\" class=\"field\">" +
             html_text(field.name) + "</th><td class=\"meaning\">" + html_text(field.meaning) + "</td></tr>\n";
   }

@@ -1,9 +1,10 @@
+#include "explain/page_cards.h"
+
 #include <algorithm>
 
-#include "alignment.h"
-#include "edid_fields.h"
-#include "explain/page_parts.h"
-#include "explain/utf8_text.h"
+#include "edid_text/alignment.h"
+#include "edid_text/edid_fields.h"
+#include "text/utf8_text.h"
 
 namespace edid_cli {
 namespace {

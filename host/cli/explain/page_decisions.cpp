@@ -1,7 +1,8 @@
+#include "explain/page_decisions.h"
+
 #include <algorithm>
 
-#include "explain/page_parts.h"
-#include "explain/utf8_text.h"
+#include "text/utf8_text.h"
 
 namespace edid_cli {
 namespace {

@@ -1,7 +1,7 @@
+#include "explain/reason_table.h"
+
 #include <algorithm>
 #include <iterator>
-
-#include "explain/reason_texts.h"
 
 namespace edid_cli {
 namespace {

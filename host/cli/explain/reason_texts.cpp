@@ -2,23 +2,13 @@
 
 #include <cstdio>
 
+#include "edid_text/physical_address_text.h"
 #include "explain/mode_names.h"
+#include "explain/reason_table.h"
+#include "text/hexadecimal.h"
 
 namespace edid_cli {
 namespace {
-
-std::string hexadecimal(i32 value) {
-  char text[16];
-  std::snprintf(text, sizeof text, "0x%X", static_cast<u32>(value));
-  return text;
-}
-
-std::string address(i32 value) {
-  const auto bits = static_cast<u32>(value);
-  char text[16];
-  std::snprintf(text, sizeof text, "%u.%u.%u.%u", bits >> 12 & 15U, bits >> 8 & 15U, bits >> 4 & 15U, bits & 15U);
-  return text;
-}
 
 std::string sample_rates(i32 value) {
   char text[128] = "";
@@ -39,9 +29,9 @@ std::string formatted(i32 value, char form) {
     case 'n':  // A place, counted from 1.
       return std::to_string(value + 1);
     case 'h':
-      return hexadecimal(value);
+      return hex_number(static_cast<u32>(value));
     case 'a':
-      return address(value);
+      return physical_address_text(static_cast<u32>(value));
     case 'r':
       return sample_rates(value);
     case 'k':

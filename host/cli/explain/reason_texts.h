@@ -1,27 +1,11 @@
-// Reasons as sentences with the numbers behind them, and the keys and settings that they come from.
+// The sentences that say why.
 #pragma once
 
-#include <span>
 #include <string>
 
 #include "explain/explained.h"
 
 namespace edid_cli {
-
-/// What of the sink's a reason refers to, by the number in its first value.
-enum class sink_part_t { none, detailed_timing, standard_timing, short_video, address, formats };
-
-struct reason_text_t {
-  u32 reason;
-  /// Words, with places in braces: see reason_sentence().
-  const char *sentence;
-  const char *keys[2] = {nullptr, nullptr};  ///< Of the platform; null: none.
-  const char *setting = nullptr;             ///< An option of the command line; null: none.
-  sink_part_t sink_part = sink_part_t::none;
-};
-
-/// The row of a reason; one without keys for a reason that is not known.
-const reason_text_t &reason_text(u32 reason);
 
 /// The sentence of a decision.
 std::string reason_sentence(const compose_decision_t &decision, const explained_t &explained);

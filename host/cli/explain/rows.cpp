@@ -1,23 +1,21 @@
 #include "explain/rows.h"
 
 #include <algorithm>
-#include <cstdio>
 #include <cstdlib>
 #include <iterator>
 #include <limits>
 #include <optional>
 #include <tuple>
 
+#include "edid_text/physical_address_text.h"
 #include "explain/mode_names.h"
 #include "explain/reason_texts.h"
-#include "explain/sources.h"
 
 namespace edid_cli {
 namespace {
 
 constexpr const char *section_titles[] = {"Video modes", "4Kx2K modes", "Audio formats", "Limits and derived values"};
 constexpr const char *section_ids[] = {"video", "4k", "audio", "derived"};
-constexpr const char *source_kind_ids[] = {"sink", "platform", "setting", "library"};
 constexpr const char *latency_names[] = {"video latency", "audio latency", "interlaced video latency",
                                          "interlaced audio latency"};
 
@@ -68,12 +66,6 @@ std::string sink_timing_name(const compose_decision_t &decision) {
   return raster_name(value[0], value[1], value[2], value[3] != 0);
 }
 
-std::string address_text(u32 code) {
-  char text[16];
-  std::snprintf(text, sizeof text, "%u.%u.%u.%u", code >> 12 & 15U, code >> 8 & 15U, code >> 4 & 15U, code & 15U);
-  return text;
-}
-
 std::string derived_name(const compose_decision_t &decision) {
   const std::string code = std::to_string(decision.code);
   switch (decision.subject) {
@@ -85,7 +77,7 @@ std::string derived_name(const compose_decision_t &decision) {
     case COMPOSE_SUBJECT_CURRENT_MODE:
       return decision.code == 0 ? "current mode" : "current mode " + short_mode_name(decision.code);
     case COMPOSE_SUBJECT_PHYSICAL_ADDRESS:
-      return "physical address " + address_text(decision.code);
+      return "physical address " + physical_address_text(decision.code);
     case COMPOSE_SUBJECT_DEEP_COLOR:
       return "deep colour, " + code + " bits";
     case COMPOSE_SUBJECT_TMDS_CLOCK:
@@ -155,10 +147,6 @@ const char *section_title(section_t section) {
 
 const char *section_id(section_t section) {
   return section_ids[static_cast<std::size_t>(section)];
-}
-
-const char *source_kind_id(source_kind_t kind) {
-  return source_kind_ids[static_cast<std::size_t>(kind)];
 }
 
 std::string source_text(const row_t &row) {

@@ -5,20 +5,11 @@
 #include <vector>
 
 #include "explain/explained.h"
+#include "explain/sources.h"
 
 namespace edid_cli {
 
 enum class section_t { video, mode_4k, audio, derived };
-
-enum class source_kind_t { sink, platform, setting, library };
-
-/// Where a decision comes from.
-struct source_t {
-  source_kind_t kind;
-  std::string text;   ///< "box.toml:40 60_hz_priority_list[2]".
-  std::string key{};  ///< Of the platform: the key or the entry. Of the settings: the option.
-  unsigned line = 0;  ///< Of the platform; 0: the key is not there.
-};
 
 struct row_t {
   section_t section;
@@ -38,7 +29,6 @@ const char *verdict_text(const row_t &row);
 const char *section_title(section_t section);
 /// "video", for programs.
 const char *section_id(section_t section);
-const char *source_kind_id(source_kind_t kind);
 /// All of a row's sources.
 std::string source_text(const row_t &row);
 

@@ -1,14 +1,16 @@
 #include "explain/sources.h"
 
-#include <cstdio>
 #include <string_view>
 
+#include "edid_text/physical_address_text.h"
 #include "explain/mode_names.h"
-#include "explain/reason_texts.h"
-#include "physical_address_text.h"
+#include "explain/reason_table.h"
+#include "text/hexadecimal.h"
 
 namespace edid_cli {
 namespace {
+
+constexpr const char *source_kind_ids[] = {"sink", "platform", "setting", "library"};
 
 struct sink_origin_t {
   u32 origin;
@@ -136,9 +138,7 @@ class gathering_t {
   std::string value_of(std::string_view option) const {
     const compose_cfg_t &settings = explained_.options.settings;
     if (option == "--audio-mask") {
-      char text[16];
-      std::snprintf(text, sizeof text, " 0x%X", settings.audio_mask);
-      return text;
+      return " " + hex_number(settings.audio_mask);
     }
     if (option == "--3d") {
       return settings.hdmi_3d_mode == always_3d_mode ? " on" : settings.hdmi_3d_mode == no_3d_mode ? " off" : " sink";
@@ -164,6 +164,10 @@ class gathering_t {
 };
 
 }  // namespace
+
+const char *source_kind_id(source_kind_t kind) {
+  return source_kind_ids[static_cast<std::size_t>(kind)];
+}
 
 std::vector<source_t> sources_of(const compose_decision_t &decision, const explained_t &explained) {
   return gathering_t(decision, explained).run();

@@ -1,10 +1,10 @@
 #include "explain/steps.h"
 
 #include <algorithm>
-#include <cstdio>
 
 #include "explain/mode_names.h"
-#include "platform_keys.h"
+#include "platform/platform_keys.h"
+#include "text/hexadecimal.h"
 
 namespace edid_cli {
 namespace {
@@ -98,10 +98,8 @@ void steps_t::add_audio_entry(u32 type) {
   const std::vector<list_entry_t> &entries = explained_.places.entries(platform_list::audio);
   const std::string key = free_audio_key(entries);
   const position_t position = entries.empty() ? platform_places_t::position_of(audio_table) : entries.back().position;
-  char value[16];
-  std::snprintf(value, sizeof value, "0x%06X", usual_audio_entry(type));
-  add("add " + key + " = " + value + " (" + audio_type_name(type) + (type == 1 ? ", 2" : ", 6") +
-          " channels, 32 to 48 kHz) behind " + explained_.places.place_of(position),
+  add("add " + key + " = " + hex_number(usual_audio_entry(type), 6) + " (" + audio_type_name(type) +
+          (type == 1 ? ", 2" : ", 6") + " channels, 32 to 48 kHz) behind " + explained_.places.place_of(position),
       key, position.line);
 }
 

@@ -1,9 +1,10 @@
+#include "explain/wanted.h"
+
 #include <string>
 
-#include "bad_input.h"
-#include "explain/answer.h"
 #include "explain/mode_names.h"
-#include "whole_number.h"
+#include "io/bad_input.h"
+#include "text/whole_number.h"
 
 namespace edid_cli {
 namespace {

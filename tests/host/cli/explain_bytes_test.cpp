@@ -4,11 +4,11 @@
 #include <array>
 #include <random>
 
-#include "composition.h"
+#include "composition/composition.h"
+#include "composition/library_line.h"
 #include "config_store.h"
-#include "edid_file.h"
+#include "edid_input/edid_file.h"
 #include "explain/byte_names.h"
-#include "library_line.h"
 
 namespace edid_cli {
 namespace {

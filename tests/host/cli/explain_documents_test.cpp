@@ -1,11 +1,13 @@
 // Texts of any bytes in JSON and in HTML.
 #include <gmock/gmock.h>
 
-#include "explain/json_writer.h"
-#include "explain/utf8_text.h"
+#include "explain/explanation_json.h"
+#include "text/utf8_text.h"
 
 namespace edid_cli {
 namespace {
+
+using testing::HasSubstr;
 
 constexpr const char *replaced = "\xEF\xBF\xBD";
 
@@ -49,31 +51,50 @@ TEST(HtmlText, HasNoControlCharacters) {
   EXPECT_EQ(html_text("\x7F"), replaced);
 }
 
-TEST(JsonText, EscapesQuotesBackslashesAndControlCharacters) {
-  EXPECT_EQ(json_text("a\"b\\c"), R"("a\"b\\c")");
-  EXPECT_EQ(json_text(std::string("\0\n\x1F\x7F", 4)), R"("\u0000\u000A\u001F\u007F")");
-  EXPECT_EQ(json_text("\xFF"), std::string("\"") + replaced + "\"");
-}
-
-TEST(JsonWriter, WritesNestedValuesWithCommasBetweenThem) {
-  json_writer_t json;
-  json.open_object().member("number", std::int64_t{-3}).member("text", "a").member("truth", true);
-  json.key("nothing").null();
-  json.key("list").open_list().value(std::int64_t{1}).value("b").open_object().close().close();
-  json.key("empty").open_list().close().close();
-  EXPECT_EQ(json.text(), R"({
-  "number": -3,
-  "text": "a",
-  "truth": true,
-  "nothing": null,
-  "list": [
-    1,
-    "b",
-    {}
-  ],
-  "empty": []
+TEST(AnswerJson, IsADocumentOfWhatIsWantedAndEachAnswer) {
+  const answer_t offered{"1920x1080p60", true, {"It is there."}, {}};
+  const answer_t missing{"AC3", false, {}, {{"add entry_b", "audio.entry_b", 7}, {"give --audio-mask 0x2", "x"}}};
+  EXPECT_EQ(answer_json("16", {offered, missing}), R"({
+  "version": 1,
+  "want": "16",
+  "answers": [
+    {
+      "name": "1920x1080p60",
+      "offered": true,
+      "reasons": [
+        "It is there."
+      ],
+      "steps": []
+    },
+    {
+      "name": "AC3",
+      "offered": false,
+      "reasons": [],
+      "steps": [
+        {
+          "text": "add entry_b",
+          "key": "audio.entry_b",
+          "line": 7
+        },
+        {
+          "text": "give --audio-mask 0x2",
+          "key": "x"
+        }
+      ]
+    }
+  ]
 }
 )");
+}
+
+TEST(AnswerJson, TakesTextsOfAnyBytes) {
+  const answer_t answer{std::string("a\"b\\c\0\n\x1F", 8), false, {"\xF0\x9F\x98"}, {{"<\xE9>", "\xC3\xA9"}}};
+  const std::string json = answer_json("\xFF", {answer});
+  EXPECT_THAT(json, HasSubstr(R"("name": "a\"b\\c\u0000\n\u001f")"));
+  EXPECT_THAT(json, HasSubstr(std::string("\"want\": \"") + replaced + "\""));
+  EXPECT_THAT(json, HasSubstr(std::string("\"") + replaced + replaced + replaced + "\""));
+  EXPECT_THAT(json, HasSubstr(std::string("\"<") + replaced + ">\""));
+  EXPECT_THAT(json, HasSubstr("\"key\": \"\xC3\xA9\""));
 }
 
 }  // namespace

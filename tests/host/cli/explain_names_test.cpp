@@ -3,9 +3,9 @@
 
 #include <set>
 
-#include "bad_input.h"
 #include "explain/answer.h"
 #include "explain/mode_names.h"
+#include "io/bad_input.h"
 
 namespace edid_cli {
 namespace {

@@ -4,6 +4,7 @@
 #include <gmock/gmock.h>
 
 #include "config_store.h"
+#include "explain/reason_table.h"
 #include "explain/rows.h"
 
 namespace edid_cli {

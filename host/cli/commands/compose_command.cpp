@@ -1,0 +1,70 @@
+#include "commands/compose_command.h"
+
+#include <cstdio>
+#include <memory>
+#include <vector>
+
+#include "batch/batch.h"
+#include "batch/batch_tasks.h"
+#include "commands/exit_status.h"
+#include "commands/option_values.h"
+#include "commands/shared_options.h"
+#include "composition/composition.h"
+#include "edid_input/edid_file.h"
+#include "io/atomic_file.h"
+#include "io/bad_input.h"
+#include "io/input.h"
+#include "io/program_name.h"
+#include "io/standard_output.h"
+#include "platform/platform_file.h"
+
+namespace edid_cli {
+namespace {
+
+int compose_single(const compose_options_t &options) {
+  const std::vector<u8> sink = read_sink(options.composition.sink, options.composition.drm_directory);
+  // Nothing but the EDID may arrive where the EDID is awaited.
+  std::FILE *const lines = options.output == standard_stream ? stderr : stdout;
+  const composition_t composition =
+      compose(options.composition, options.composition.ports.first, sink, written_to(lines));
+  if (!composition.is_composed) {
+    flush_standard_output();
+    std::fprintf(stderr, "%s: the library refused to compose an EDID\n", program_name);
+    return refused_status;
+  }
+  write_output(options.output, formatted(composition.new_edid, options.format));
+  return done_status;
+}
+
+int run(const compose_options_t &options) {
+  check_composition_options(options.composition);
+  load_platform(options.composition.platform_file);
+  if (asks_for_several(options.composition)) {
+    return compose_several(options) ? done_status : refused_status;
+  }
+  if (options.log) {
+    throw bad_input_t("--log goes with several EDIDs: a folder of sinks, or a range of ports");
+  }
+  return compose_single(options);
+}
+
+}  // namespace
+
+command_t compose_command() {
+  const auto target = std::make_shared<compose_options_t>();
+  std::vector<option_t> options = composition_options(target->composition);
+  options.insert(
+      options.end(),
+      {required(option("-o,--output", "FILE", target->output, parse_file_name,
+                       "Where the EDID goes; - for standard output. Of several: a folder, or a file name with {sink} "
+                       "and {port} in it")),
+       option("--format", "raw|hex", target->format, parse_edid_format,
+              "Write bytes, or hexadecimal text (default raw)"),
+       option("--jobs", "N", target->jobs, parse_jobs,
+              "Compose so many of several at once (default: as many as there are processors)"),
+       flag("--log", target->log, "Of several: write what the library says into a .log file beside each")});
+  return {"compose", "Compose an EDID, or one for each of several sinks or ports", std::move(options),
+          [target] { return run(*target); }};
+}
+
+}  // namespace edid_cli

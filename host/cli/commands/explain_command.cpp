@@ -1,0 +1,132 @@
+#include "commands/explain_command.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <filesystem>
+#include <iterator>
+#include <memory>
+#include <optional>
+
+#include "batch/batch_tasks.h"
+#include "commands/exit_status.h"
+#include "commands/option_values.h"
+#include "commands/shared_options.h"
+#include "edid_input/edid_file.h"
+#include "explain/answer.h"
+#include "explain/explanation_json.h"
+#include "explain/explanation_page.h"
+#include "explain/explanation_text.h"
+#include "io/atomic_file.h"
+#include "io/bad_input.h"
+#include "io/input.h"
+#include "io/program_name.h"
+#include "io/standard_output.h"
+#include "platform/platform_file.h"
+
+namespace edid_cli {
+namespace {
+
+struct explain_options_t {
+  composition_options_t composition;
+  std::optional<std::string> want;  ///< One mode or format that is asked about; none: all decisions.
+  bool json = false;
+  std::string html_file;  ///< Empty: no page.
+};
+
+constexpr int offered_status = 0;
+constexpr int not_offered_status = 1;
+
+/// The sink's record; an empty one where there is no sink.
+class sink_record_t {
+ public:
+  explicit sink_record_t(const std::vector<u8> &bytes) {
+    // The composition decodes it as well, and what the library says of it is told there.
+    const discarded_output_t unseen;
+    if (!bytes.empty()) {
+      decoded_ = std::make_unique<decoded_edid_t>(bytes);
+    }
+  }
+
+  const edid_t &get() const { return decoded_ ? decoded_->record() : none_; }
+
+ private:
+  std::unique_ptr<decoded_edid_t> decoded_;
+  edid_t none_{};
+};
+
+std::string platform_name(const composition_options_t &options) {
+  if (!options.platform_file) {
+    return "default platform";
+  }
+  return *options.platform_file == standard_stream ? input_name(*options.platform_file)
+                                                   : std::filesystem::path(*options.platform_file).filename().string();
+}
+
+int print_answers(const explain_options_t &options, const std::vector<wanted_t> &wanted, const explained_t &explained) {
+  std::vector<answer_t> answers;
+  std::transform(wanted.begin(), wanted.end(), std::back_inserter(answers),
+                 [&explained](const wanted_t &one) { return answer(one, explained); });
+  std::fputs((options.json ? answer_json(*options.want, answers) : answer_text(answers)).c_str(), stdout);
+  return std::any_of(answers.begin(), answers.end(), [](const answer_t &one) { return one.is_offered; })
+             ? offered_status
+             : not_offered_status;
+}
+
+void check(const explain_options_t &options) {
+  if (asks_for_several(options.composition)) {
+    throw bad_input_t("explain looks at one composition: one sink and one port");
+  }
+  if (options.want && !options.html_file.empty()) {
+    throw bad_input_t("--want and --html don't go together");
+  }
+  if (options.json && options.html_file == standard_stream) {
+    throw bad_input_t("--json and --html cannot both go to standard output");
+  }
+}
+
+int run(const explain_options_t &options) {
+  check_composition_options(options.composition);
+  check(options);
+  const std::vector<wanted_t> wanted = options.want ? parse_wanted(*options.want) : std::vector<wanted_t>{};
+  load_platform(options.composition.platform_file);
+  const std::vector<u8> sink = read_sink(options.composition.sink, options.composition.drm_directory);
+  const sink_record_t record(sink);
+  const platform_places_t places(platform_name(options.composition));
+  // What the library says goes to standard error: standard output is for the explanation.
+  const composition_t composition =
+      compose(options.composition, options.composition.ports.first, sink, written_to(stderr), decisions_t::kept);
+  if (!composition.is_composed) {
+    std::fprintf(stderr, "%s: the library refused to compose an EDID\n", program_name);
+    return options.want ? bad_input_status : refused_status;
+  }
+  const std::string sink_name = options.composition.sink ? input_name(*options.composition.sink) : "";
+  const explained_t explained{composition, sink, record.get(), sink_name, places, options.composition};
+  if (options.want) {
+    return print_answers(options, wanted, explained);
+  }
+  if (!options.html_file.empty()) {
+    write_output(options.html_file, explanation_page(explained));
+  }
+  if (options.json || options.html_file.empty()) {
+    std::fputs((options.json ? explanation_json(explained) : explanation_text(explained)).c_str(), stdout);
+  }
+  return done_status;
+}
+
+}  // namespace
+
+command_t explain_command() {
+  const auto target = std::make_shared<explain_options_t>();
+  std::vector<option_t> options = composition_options(target->composition);
+  options.insert(options.end(),
+                 {option(
+                      "--want", "MODE", target->want, [](const std::string &text) { return text; },
+                      "Tell what stands in the way of one mode or format: 16, 1920x1080p60, 4k:1, ac3, audio:2"),
+                  flag("--json", target->json, "Print a JSON document"),
+                  option("--html", "FILE", target->html_file, parse_file_name,
+                         "Write a page to read in a browser; - for standard output")});
+  return {"explain", "Tell why a composed EDID offers what it offers", std::move(options),
+          [target] { return run(*target); }};
+}
+
+}  // namespace edid_cli

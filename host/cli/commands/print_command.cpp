@@ -1,0 +1,61 @@
+#include "commands/print_command.h"
+
+#include <cstdio>
+#include <filesystem>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "commands/exit_status.h"
+#include "commands/shared_options.h"
+#include "edid_input/edid_file.h"
+#include "edid_text/decoded_edid.h"
+#include "io/input.h"
+#include "io/program_name.h"
+#include "io/standard_output.h"
+
+namespace edid_cli {
+namespace {
+
+struct print_options_t {
+  std::string source;
+  std::string drm_directory;
+  bool brief = false;
+};
+
+/// Printing has no result, so the same decoding is tried first, unseen.
+bool decodes(const std::vector<u8> &edid) {
+  const discarded_output_t unseen;
+  return decoded_edid_t(edid).is_complete();
+}
+
+/// The name of a file without its folders.
+std::string title_of(const std::string &file) {
+  return file == standard_stream ? input_name(file) : std::filesystem::path(file).filename().string();
+}
+
+int run(const print_options_t &options) {
+  const std::vector<u8> edid = read_edid(options.source, options.drm_directory);
+  const bool decoded = decodes(edid);
+  print_edid(edid.data(), static_cast<u32>(edid.size()), options.brief ? 1 : 0, title_of(options.source).c_str());
+  if (!decoded) {
+    flush_standard_output();
+    std::fprintf(stderr, "%s: %s: the library refused to decode this EDID\n", program_name,
+                 input_name(options.source).c_str());
+    return refused_status;
+  }
+  return done_status;
+}
+
+}  // namespace
+
+command_t print_command() {
+  const auto target = std::make_shared<print_options_t>();
+  return {"print",
+          "Print an EDID as a readable report",
+          {flag("--brief", target->brief, "Identity, video, audio and address only"),
+           drm_directory_option(target->drm_directory), edid_operand("FILE", target->source)},
+          [target] { return run(*target); }};
+}
+
+}  // namespace edid_cli

@@ -1,0 +1,68 @@
+#include "edid_input/edid_file.h"
+
+#include <algorithm>
+#include <filesystem>
+#include <string_view>
+
+#include "edid_input/drm_connectors.h"
+#include "edid_input/hex_text.h"
+#include "io/bad_input.h"
+#include "io/input.h"
+
+namespace edid_cli {
+namespace {
+
+bool is_text_character(char character) {
+  const auto byte = static_cast<unsigned char>(character);
+  return byte >= 0x20 ? byte != 0x7F : (byte >= '\t' && byte <= '\r');
+}
+
+/// No text holds the zero bytes of an EDID's header, and hardly an EDID without them holds text only.
+bool is_raw(std::string_view content) {
+  return !std::all_of(content.begin(), content.end(), is_text_character);
+}
+
+bool exists(const std::string &file) {
+  std::error_code error;
+  return std::filesystem::symlink_status(file, error).type() != std::filesystem::file_type::not_found;
+}
+
+std::vector<u8> parse_edid(const std::string &content, const std::string &name) {
+  std::vector<u8> bytes =
+      is_raw(content) ? std::vector<u8>(content.begin(), content.end()) : parse_hex_text(content, name);
+  if (bytes.empty() || bytes.size() % edid_block_size != 0 || bytes.size() > max_edid_size) {
+    throw bad_input_t(name + ": " + std::to_string(bytes.size()) +
+                      " bytes are not an EDID, which has 1 to 256 blocks of 128 bytes");
+  }
+  return bytes;
+}
+
+}  // namespace
+
+std::vector<u8> read_edid_file(const std::string &file) {
+  const std::string content = read_input(file);
+  const std::string name = input_name(file);
+  if (content.empty()) {
+    throw bad_input_t(name + ": is empty");
+  }
+  return parse_edid(content, name);
+}
+
+std::vector<u8> read_edid(const std::string &source, const std::string &drm_directory) {
+  if (source != standard_stream && !exists(source)) {
+    if (const auto connector = find_connector(drm_directory, source)) {
+      const std::string content = read_input(connector->edid_file);
+      if (content.empty()) {
+        throw bad_input_t(connector->name + ": no display is connected");
+      }
+      return parse_edid(content, connector->edid_file);
+    }
+  }
+  return read_edid_file(source);
+}
+
+std::vector<u8> read_sink(const std::optional<std::string> &source, const std::string &drm_directory) {
+  return source ? read_edid(*source, drm_directory) : std::vector<u8>{};
+}
+
+}  // namespace edid_cli

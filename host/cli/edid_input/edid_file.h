@@ -1,0 +1,25 @@
+// Reading an EDID, raw or as hexadecimal text, from a file or from a connector of this machine.
+#pragma once
+
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "edid_composer.h"
+
+namespace edid_cli {
+
+inline constexpr u32 edid_block_size = 128;
+/// The base block counts the blocks that follow it in one byte.
+inline constexpr std::size_t max_edid_size = 256 * edid_block_size;
+
+/// The bytes of an EDID: one or more whole blocks. Their content is not looked at. Throws bad_input_t.
+std::vector<u8> read_edid_file(const std::string &file);
+
+/// The same from a file, from standard input, or, where there is no file of that name, from the connector of that name.
+std::vector<u8> read_edid(const std::string &source, const std::string &drm_directory);
+
+/// The same; no bytes where there is no source.
+std::vector<u8> read_sink(const std::optional<std::string> &source, const std::string &drm_directory);
+
+}  // namespace edid_cli

@@ -1,0 +1,44 @@
+#include "io/standard_output.h"
+
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+#include <string>
+
+#include "io/bad_input.h"
+
+namespace edid_cli {
+namespace {
+
+[[noreturn]] void refuse() {
+  throw bad_input_t(std::string("standard output: cannot write: ") + std::strerror(errno));
+}
+
+}  // namespace
+
+standard_output_redirect_t::standard_output_redirect_t(int target)
+    : original_(fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, 3)) {
+  flush_standard_output();
+  if (!original_.is_open() || dup2(target, STDOUT_FILENO) < 0) {
+    refuse();
+  }
+}
+
+standard_output_redirect_t::~standard_output_redirect_t() {
+  std::fflush(stdout);
+  dup2(original_.get(), STDOUT_FILENO);
+}
+
+discarded_output_t::discarded_output_t()
+    : nowhere_(open("/dev/null", O_WRONLY | O_CLOEXEC)), redirect_(nowhere_.get()) {}
+
+void flush_standard_output() {
+  if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {
+    refuse();
+  }
+}
+
+}  // namespace edid_cli
