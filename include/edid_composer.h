@@ -774,7 +774,7 @@ typedef struct compose_result_t {
   u32 sink_status;             /**< What became of the sink's base block; @ref compose_sink_status. 0 when the call was
                                     refused before the sink was looked at. */
   u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. */
-  u32 sink_malformed_at;       /**< With @ref COMPOSE_EXTENSION_MALFORMED: the byte of block 1, from 0, at which the
+  u32 sink_malformed_at;       /**< The byte, when @ref sink_extension_status is COMPOSE_EXTENSION_MALFORMED, of block 1, from 0, at which the
                                     data block begins that overruns; else 0. */
   u32 sink_blocks_unread;      /**< Extension blocks after block 1 that are announced and given, but not read. */
 } compose_result_t;

@@ -1,17 +1,12 @@
 #include "diagnostics.h"
 
-#include <atomic>
 #include <cstdarg>
 
 #include "output.h"
 
 namespace edid_composer {
-namespace {
 
-// Atomic so that a host may switch tracing while another thread composes. No order is needed with anything else.
 constinit std::atomic<u8> g_debug_enabled{0};
-
-}  // namespace
 
 void log_error(const site_t &site, int line, const char *format, ...) {
   std::va_list arguments;
@@ -48,5 +43,5 @@ void debug_enable(bool enable) {
 }
 
 bool debug_enabled(void) {
-  return edid_composer::g_debug_enabled.load(std::memory_order_relaxed) != 0;
+  return edid_composer::is_tracing();
 }

@@ -8,9 +8,20 @@
 //   LOG_ERROR("Failed decoding #%d standard timing.", number);
 #pragma once
 
+#include <atomic>
+
 #include "edid_composer.h"
 
 namespace edid_composer {
+
+/// The debug switch. Atomic so that a host may turn it while another thread composes; no order is needed with anything
+/// else.
+extern std::atomic<u8> g_debug_enabled;
+
+/// debug_enabled(), without a call.
+inline bool is_tracing() {
+  return g_debug_enabled.load(std::memory_order_relaxed) != 0;
+}
 
 /// Who reports: module and operation as the reader of the log knows them.
 struct site_t {
@@ -52,4 +63,4 @@ inline const char *true_or_false(bool value) {
 #define LOG_ERROR(...) ::edid_composer::log_error(site, __LINE__, __VA_ARGS__)
 #define LOG_WARNING(...) ::edid_composer::log_warning(site, __LINE__, __VA_ARGS__)
 #define LOG_BUG(...) ::edid_composer::log_bug(site, __LINE__, __VA_ARGS__)
-#define LOG_TRACE(...) (debug_enabled() ? ::edid_composer::log_trace(site, __LINE__, __VA_ARGS__) : void())
+#define LOG_TRACE(...) (::edid_composer::is_tracing() ? ::edid_composer::log_trace(site, __LINE__, __VA_ARGS__) : void())

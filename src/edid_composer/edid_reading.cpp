@@ -37,7 +37,7 @@ sink_reading_t read_sink(const u8 *sink_bytes, u32 size, edid_t *sink) {
 }
 
 void trace_new_edid(const u8 *new_edid) {
-  if (!debug_enabled()) return;
+  if (!is_tracing()) return;
   log_trace(site, __LINE__, "New EDID...");
   _dump_raw_edid_block(new_edid, 2);
   edid_t edid{};
@@ -52,7 +52,7 @@ void trace_new_edid(const u8 *new_edid) {
 
 void _dump_raw_edid_block(const u8 *bytes, i32 blocks) {
   constexpr u32 bytes_per_line = 16;
-  if (!debug_enabled()) return;
+  if (!is_tracing()) return;
   for (i32 block = 0; block < blocks; ++block) {
     if (block > 0) print("\n");
     for (u32 i = 0; i < block_size; ++i) {

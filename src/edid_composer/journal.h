@@ -10,7 +10,7 @@ namespace edid_composer {
 struct journal_entry_t {
   compose_subject subject;
   compose_origin origin{};  ///< Who names it; 0 for a verdict.
-  i32 index = -1;           ///< Its place in the list that names it, or among the candidates chosen so far.
+  i32 index = -1;           ///< Its place in the list that names it, or among the candidates chosen before.
   u32 code = 0;             ///< As in compose_decision_t; 0: it has none.
   compose_reason reason{};  ///< Why it is chosen or left out; 0 when it is only named.
   reason_values_t values{};

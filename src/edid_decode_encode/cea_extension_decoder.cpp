@@ -48,9 +48,14 @@ void decode_timings(const byte_view_t &extension, edid_t *edid) {
   }
 }
 
+/// The lists that data blocks add to, and the ends that their blocks have in common.
+struct block_lists_t {
+  appender_t<short_video_desc_t> modes;
+  appender_t<short_audio_desc_t> formats;
+};
+
 /// The last short audio descriptor of a payload that isn't a multiple of three bytes ends after its block.
-bool decode_audio_block(const byte_view_t &payload, u32 length, edid_t *edid) {
-  appender_t<short_audio_desc_t> formats(&edid->audio_list, site);
+bool decode_audio_block(const byte_view_t &payload, u32 length, appender_t<short_audio_desc_t> *formats) {
   for (u32 i = 0; i < length; i += short_audio_size) {
     short_audio_desc_t audio{};
     if (decode_edid_short_audio(payload[i], payload[i + 1], payload[i + 2], &audio) != 1) {
@@ -59,17 +64,16 @@ bool decode_audio_block(const byte_view_t &payload, u32 length, edid_t *edid) {
                   payload[i + 1], payload[i + 2]);
       continue;
     }
-    if (!formats.append(audio)) return false;
+    if (!formats->append(audio)) return false;
   }
   return true;
 }
 
-bool decode_video_block(const byte_view_t &payload, u32 length, edid_t *edid) {
-  appender_t<short_video_desc_t> modes(&edid->video_list, site, video_texts);
+bool decode_video_block(const byte_view_t &payload, u32 length, appender_t<short_video_desc_t> *modes) {
   for (u32 i = 0; i < length; ++i) {
     const u8 native = (payload[i] & short_video::native) != 0;
     const u32 vic = payload[i] & short_video::vic_mask;
-    if (!modes.append({.native = native, .vic = vic, .stereo = 0})) return false;
+    if (!modes->append({.native = native, .vic = vic, .stereo = 0})) return false;
   }
   return true;
 }
@@ -92,7 +96,7 @@ void decode_extended_block(const byte_view_t &payload, u32 length, edid_t *edid)
 }
 
 /// Decodes the block whose header byte is the first of @p block. False when an entry could not be kept.
-bool decode_data_block(const byte_view_t &block, u32 tag, u32 length, edid_t *edid) {
+bool decode_data_block(const byte_view_t &block, u32 tag, u32 length, block_lists_t *lists, edid_t *edid) {
   const byte_view_t payload = block.from(1);
   switch (tag) {
     case data_block::reserved_0:
@@ -100,13 +104,13 @@ bool decode_data_block(const byte_view_t &block, u32 tag, u32 length, edid_t *ed
       break;
     case data_block::audio:
       LOG_TRACE("Audio Data Block. Len=%d", length);
-      return decode_audio_block(payload, length, edid);
+      return decode_audio_block(payload, length, &lists->formats);
     case data_block::video:
       LOG_TRACE("Video Data Block. Len=%d", length);
-      return decode_video_block(payload, length, edid);
+      return decode_video_block(payload, length, &lists->modes);
     case data_block::vendor_specific:
       LOG_TRACE("Vendor Specific Data Block. Len=%d", length);
-      _decode_edid_vendor_block(block, edid);
+      _decode_edid_vendor_block(block, lists->modes, edid);
       break;
     case data_block::speaker_allocation:
       LOG_TRACE("Speaker Allocation Data Block. Len=%d", length);
@@ -126,9 +130,11 @@ bool decode_data_block(const byte_view_t &block, u32 tag, u32 length, edid_t *ed
 }
 
 extension_outcome_t decode_data_blocks(const byte_view_t &extension, edid_t *edid) {
+  block_lists_t lists{.modes = appender_t<short_video_desc_t>(&edid->video_list, site, video_texts),
+                      .formats = appender_t<short_audio_desc_t>(&edid->audio_list, site)};
   data_blocks_t blocks(extension);
   while (blocks.next()) {
-    if (!decode_data_block(extension.from(blocks->offset), blocks->tag, blocks->length, edid)) {
+    if (!decode_data_block(extension.from(blocks->offset), blocks->tag, blocks->length, &lists, edid)) {
       return {COMPOSE_EXTENSION_OUT_OF_MEMORY, 0};
     }
   }

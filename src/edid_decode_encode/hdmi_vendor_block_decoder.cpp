@@ -52,9 +52,9 @@ u32 stereo_of_all(u32 structure_all) {
 /// The modes that a block can give 3D structures: the first 16, looked up once.
 class first_modes_t {
  public:
-  explicit first_modes_t(const ll_list_t &list) : list_(list), size_(ll_size(&list)) {
+  explicit first_modes_t(const appender_t<short_video_desc_t> &modes) : list_(modes.list()), size_(modes.size()) {
     u32 index = 0;
-    for (auto &mode : elements<short_video_desc_t>(size_ > 0 ? list.head : nullptr)) {
+    for (auto &mode : elements<short_video_desc_t>(size_ > 0 ? list_.head : nullptr)) {
       if (index == layout::most_3d_modes) break;
       modes_[index++] = &mode;
     }
@@ -109,7 +109,8 @@ u32 mark_one(u8 byte, const first_modes_t &modes) {
 }
 
 /// Decodes the @p length bytes of 3D information from @p offset on.
-void decode_3d(const byte_view_t &block, u32 offset, u32 length, u32 multi_present, const edid_t &edid) {
+void decode_3d(const byte_view_t &block, u32 offset, u32 length, u32 multi_present,
+               const appender_t<short_video_desc_t> &appender) {
   u32 structure_all = 0;
   u32 mask = 0;
   u32 entries = offset;
@@ -122,14 +123,14 @@ void decode_3d(const byte_view_t &block, u32 offset, u32 length, u32 multi_prese
     mask = block.big_endian_16(entries);
     entries += 2;
   }
-  const first_modes_t modes(edid.video_list);
+  const first_modes_t modes(appender);
   modes.mark(stereo_of_all(structure_all), mask);
   while (entries < offset + length)
     entries += mark_one(block[entries], modes);
 }
 
 /// Decodes the HDMI video fields, 4Kx2K and 3D, that begin at @p offset. The block's length doesn't bound them.
-void decode_video(const byte_view_t &block, u32 offset, edid_t *edid) {
+void decode_video(const byte_view_t &block, u32 offset, const appender_t<short_video_desc_t> &modes, edid_t *edid) {
   const u32 flags = block[offset];
   const u32 lengths = block[offset + 1];
   const u32 multi_present = flags >> layout::multi_present_shift & layout::multi_present_mask;
@@ -147,20 +148,13 @@ void decode_video(const byte_view_t &block, u32 offset, edid_t *edid) {
   offset += 2;
   for (u32 i = 0; i < edid->hdmi_vic_len; ++i)
     edid->hdmi_vic[i] = block[offset++] & layout::vic_mask;
-  if (length_3d != 0 && edid->hdmi_3d_present != 0) decode_3d(block, offset, length_3d, multi_present, *edid);
+  if (length_3d != 0 && edid->hdmi_3d_present != 0) decode_3d(block, offset, length_3d, multi_present, modes);
 }
 
 }  // namespace
 
-bool _decode_edid_vendor_block(const byte_view_t &vendor_block, edid_t *edid) {
-  if (vendor_block.data() == nullptr) {
-    LOG_ERROR("Function called with vendor_block set to NULL.");
-    return false;
-  }
-  if (edid == nullptr) {
-    LOG_ERROR("Function called with edid set to NULL.");
-    return false;
-  }
+bool _decode_edid_vendor_block(const byte_view_t &vendor_block, const appender_t<short_video_desc_t> &modes,
+                               edid_t *edid) {
   const u32 tag = u32{vendor_block[0]} >> data_block::tag_shift;
   const u32 length = vendor_block[0] & data_block::length_mask;
   if (tag != data_block::vendor_specific) {
@@ -192,7 +186,7 @@ bool _decode_edid_vendor_block(const byte_view_t &vendor_block, edid_t *edid) {
     decode_flags(layout::content_flags, vendor_block[layout::video_flags], edid);
     video = decode_latencies(vendor_block, edid);
   }
-  if (length >= video && edid->hdmi_video_present != 0) decode_video(vendor_block, video, edid);
+  if (length >= video && edid->hdmi_video_present != 0) decode_video(vendor_block, video, modes, edid);
   return true;
 }
 

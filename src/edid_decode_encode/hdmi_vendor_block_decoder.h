@@ -2,10 +2,14 @@
 #pragma once
 
 #include "bytes.h"
+#include "linked_list/typed_list.h"
 
 namespace edid_composer {
 
-/// Decodes the block whose header byte is the first of @p vendor_block. The view may reach past the block.
-bool _decode_edid_vendor_block(const byte_view_t &vendor_block, edid_t *edid);
+/// Decodes the block whose header byte is the first of @p vendor_block; the view may reach past the block. @p modes
+/// appends to the record's short video descriptors, which receive the block's 3D structures. False, with a report, when
+/// the block is malformed.
+bool _decode_edid_vendor_block(const byte_view_t &vendor_block, const appender_t<short_video_desc_t> &modes,
+                               edid_t *edid);
 
 }  // namespace edid_composer

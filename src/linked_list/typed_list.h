@@ -113,6 +113,23 @@ elements<record_t> counted_elements(const ll_list_t &list) {
   return elements<record_t>(ll_size(&list) > 0 ? list.head : nullptr);
 }
 
+/// Deletes the elements of a sound list, from the one at @p first on, for which @p is_removed returns true. It is
+/// called with the place of each element and the element.
+template <typename record_t, typename predicate_t>
+void delete_elements(ll_list_t *list, i32 first, predicate_t is_removed) {
+  ll_entry_t **link = &list->head;
+  for (i32 place = 0; *link != nullptr; ++place) {
+    ll_entry_t *const entry = *link;
+    if (place < first || !is_removed(place, *static_cast<const record_t *>(entry->data))) {
+      link = &entry->next;
+      continue;
+    }
+    *link = entry->next;
+    ll_delete_entry(entry);
+    --list->size;
+  }
+}
+
 /// How an operation words the two failures of an addition.
 struct new_entry_texts_t {
   const char *creation_failed;
@@ -130,6 +147,10 @@ class untyped_appender_t {
   untyped_appender_t(ll_list_t *list, const site_t &site, const new_entry_texts_t &texts, int line)
       : list_(list), site_(site), texts_(texts), line_(line) {}
 
+  const ll_list_t &list() const { return *list_; }
+  /// As ll_size, which verifies a list that nothing was appended to.
+  i32 size() const { return last_ != nullptr ? static_cast<i32>(list_->size) : ll_size(list_); }
+
  protected:
   [[nodiscard]] bool append(const void *record, u32 size, u32 tag);
 
@@ -144,7 +165,7 @@ class untyped_appender_t {
 };
 
 template <typename record_t>
-class appender_t : private untyped_appender_t {
+class appender_t : public untyped_appender_t {
  public:
   explicit appender_t(ll_list_t *list, const site_t &site, const new_entry_texts_t &texts = new_entry_texts,
                       int line = __builtin_LINE())

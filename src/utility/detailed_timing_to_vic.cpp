@@ -70,6 +70,6 @@ u8 convert_dtd_to_vic(const edid_t *edid, const detailed_timing_t *timing, u32 *
       return 1;
     }
   }
-  if (debug_enabled()) trace_unmatched(*timing);
+  if (is_tracing()) trace_unmatched(*timing);
   return 0;
 }

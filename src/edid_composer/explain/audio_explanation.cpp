@@ -65,22 +65,18 @@ void add_ignored_formats(const inputs_t &inputs, decisions_t *decisions) {
   }
 }
 
-/// The chosen format that @p place others were chosen before; null when there are not as many.
-compose_decision_t *chosen_format(i32 place, const decisions_t &decisions) {
-  for (compose_decision_t &decision : decisions.all()) {
-    if (decision.subject != COMPOSE_SUBJECT_AUDIO_FORMAT || !is_chosen(decision)) continue;
-    if (place == 0) return &decision;
-    --place;
-  }
-  return nullptr;
-}
-
-/// The formats that the audio mask has taken out again, from the last to the first.
+/// The formats that the audio mask has taken out again; both they and the chosen ones stand in the order of their
+/// places.
 void leave_out_masked_formats(const journal_t &journal, const decisions_t &decisions) {
+  auto decision = decisions.all().begin();
+  i32 place = 0;
   for (const journal_entry_t &entry : journal.entries()) {
     if (entry.subject != COMPOSE_SUBJECT_AUDIO_FORMAT || entry.origin != 0) continue;
-    compose_decision_t *const decision = chosen_format(entry.index, decisions);
-    if (decision != nullptr) decide(decision, COMPOSE_VERDICT_LEFT_OUT, entry.reason, entry.values);
+    for (; decision != decisions.all().end(); ++decision) {
+      const bool chosen = decision->subject == COMPOSE_SUBJECT_AUDIO_FORMAT && is_chosen(*decision);
+      if (chosen && place++ == entry.index) break;
+    }
+    if (decision != decisions.all().end()) decide(&*decision, COMPOSE_VERDICT_LEFT_OUT, entry.reason, entry.values);
   }
 }
 

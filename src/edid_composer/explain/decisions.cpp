@@ -1,5 +1,7 @@
 #include "edid_composer/explain/decisions.h"
 
+#include <iterator>
+
 #include "linked_list/typed_list.h"
 
 namespace edid_composer {
@@ -65,7 +67,16 @@ compose_decision_t *decisions_t::add(compose_subject subject, u32 code) {
   return &unheard_;
 }
 
+compose_decision_t **decisions_t::place_of_mode(compose_subject subject, u32 code) {
+  return subject == COMPOSE_SUBJECT_VIDEO_MODE && code < std::size(modes_) ? &modes_[code] : nullptr;
+}
+
 compose_decision_t *decisions_t::candidate(compose_subject subject, u32 code) {
+  compose_decision_t **const place = place_of_mode(subject, code);
+  if (place != nullptr) {
+    if (*place == nullptr) *place = add(subject, code);
+    return *place;
+  }
   for (compose_decision_t &decision : decisions_) {
     if (decision.subject == subject && decision.code == code) return &decision;
   }

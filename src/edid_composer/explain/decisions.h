@@ -35,7 +35,11 @@ class decisions_t {
   void pass_on(compose_observer_t observer, void *context) const;
 
  private:
+  /// Where the decision on a mode stands: a short video descriptor can hold VICs up to 127.
+  compose_decision_t **place_of_mode(compose_subject subject, u32 code);
+
   record_blocks_t<compose_decision_t> decisions_;
+  compose_decision_t *modes_[128] = {};
   compose_decision_t unheard_{};
   bool complete_ = true;
 };

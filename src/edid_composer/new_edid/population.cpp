@@ -157,11 +157,11 @@ population_t _populate_new_edid(const inputs_t &inputs, const hdmi_vics_t &modes
   set_content_types(platform, sink, new_edid);
   set_speakers(platform, new_edid);
 
-  population.modes_before_padding = ll_size(&new_edid->video_list);
+  population.modes_before_padding = static_cast<i32>(new_edid->video_list.size);
   if (!pad_video_modes(&new_edid->video_list)) return population;
   trace_video_modes(&new_edid->video_list);
   if (!add_detailed_timings(new_edid->video_list, &new_edid->dtd_list)) return population;
-  LOG_TRACE("\tEncoding the VIC list up to 31 modes. Total:%d", ll_size(&new_edid->video_list));
+  LOG_TRACE("\tEncoding the VIC list up to 31 modes. Total:%d", new_edid->video_list.size);
   new_edid->hdmi_video_present = new_edid->hdmi_3d_present != 0 || new_edid->hdmi_vic_len != 0;
   new_edid->xvycc601 = tri_state(platform.xvYCC601, sink.xvycc601);
   new_edid->xvycc709 = tri_state(platform.xvYCC709, sink.xvycc709);

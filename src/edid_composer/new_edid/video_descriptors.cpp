@@ -13,7 +13,7 @@ REPORTS_AS(_populate_new_edid);
 
 bool pad_video_modes(ll_list_t *modes) {
   appender_t<short_video_desc_t> padding(modes, site);
-  for (i32 size = ll_size(modes); size < fewest_modes; ++size) {
+  for (auto size = static_cast<i32>(modes->size); size < fewest_modes; ++size) {
     LOG_ERROR(
         "The number of video formats to be encoded is less than 4! Padding until 4 is reached. Check the platform "
         "configuration file is correct. Number in the video list:%d",
@@ -40,7 +40,7 @@ bool add_detailed_timings(const ll_list_t &modes, ll_list_t *timings) {
 }
 
 void trace_video_modes(const ll_list_t *video_list) {
-  if (!debug_enabled()) return;
+  if (!is_tracing()) return;
   log_trace(site, __LINE__, "\tNew EDID List of VICs:");
   for (const auto &video : walk<const short_video_desc_t>(LIST(video_list))) {
     print("\t\tVIC:%d %s %s %s %s %s\n", video.vic, short_video_timing_string(video.vic),
@@ -48,7 +48,7 @@ void trace_video_modes(const ll_list_t *video_list) {
           (video.stereo & STEREO_SIDE_BY_SIDE_HALF) != 0 ? "SBSH" : "",
           (video.stereo & STEREO_TOP_AND_BOTTOM) != 0 ? "TBH" : "", video.native != 0 ? "Native" : "      ");
   }
-  log_trace(site, __LINE__, "\tEncoding the video timings: Num:%d", ll_size(video_list));
+  log_trace(site, __LINE__, "\tEncoding the video timings: Num:%d", video_list->size);
   log_trace(site, __LINE__, "\tCreating the first 2 DTDs.");
 }
 

@@ -67,7 +67,7 @@ bool configuration_list_t::read_entry() {
 
 void print_platform_node(u32 node, const char *label) {
   REPORTS_AS(print_platform_node);
-  if (!debug_enabled()) return;
+  if (!edid_composer::is_tracing()) return;
   char name[sizeof edid_composer::configuration_entry_t::node_name] = "";
   if (config_node_get_name(node, name, sizeof name) == 0) {
     LOG_TRACE("%s:Name of node is:%s", label, name);

@@ -10,7 +10,7 @@ namespace {
 REPORTS_AS(_filter_audio_formats);
 
 void trace_audio(const char *label, const short_audio_desc_t &audio) {
-  if (!debug_enabled()) return;
+  if (!is_tracing()) return;
   log_trace(site, __LINE__, "%s", label);
   print_audio_structure(&audio);
 }
@@ -114,6 +114,21 @@ bool add_sink_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *jou
   return true;
 }
 
+/// The formats after the first, from the last on.
+void trace_backwards(const ll_list_t &formats) {
+  REPORTS_AS(_filter_audio_list_with_mask);
+  record_blocks_t<const short_audio_desc_t *> after_first;
+  bool is_first = true;
+  for (const auto &audio : elements<const short_audio_desc_t>(formats.head)) {
+    if (!is_first) static_cast<void>(after_first.add(&audio, site));
+    is_first = false;
+  }
+  after_first.visit_backwards([](const short_audio_desc_t *audio) {
+    log_trace(site, __LINE__, "\t\tFormat:");
+    print_audio_structure(audio);
+  });
+}
+
 bool ensure_basic_audio(ll_list_t *formats, journal_t *journal) {
   for (const auto &audio : walk<const short_audio_desc_t>(LIST(formats))) {
     LOG_TRACE("\tEntry:%d Channels:%d", audio.type, audio.channels);
@@ -136,7 +151,7 @@ bool ensure_basic_audio(ll_list_t *formats, journal_t *journal) {
                  .code = basic.type,
                  .reason = COMPOSE_REASON_BASIC_AUDIO,
                  .values = reason_values(basic.channels)});
-  if (debug_enabled()) {
+  if (is_tracing()) {
     print("\t");
     print_audio_structure(&basic);
   }
@@ -165,22 +180,17 @@ void _filter_audio_list_with_mask(ll_list_t *formats, u32 mask, journal_t *journ
   REPORTS_AS(_filter_audio_list_with_mask);
   LOG_TRACE("\tMask:0x%08X", mask);
   LOG_TRACE("%s() - Printing reverse formats\n", site.operation);
-  // From the back, so that the places before a deleted entry stay what they are.
-  // kept: the first entry is never examined.
-  for (i32 place = ll_size(formats) - 1; place > 0; --place) {
-    const auto &audio = *entry_at<short_audio_desc_t>(formats, place);
-    if (debug_enabled()) {
-      log_trace(site, __LINE__, "\t\tFormat:");
-      print_audio_structure(&audio);
-    }
+  if (is_tracing()) trace_backwards(*formats);
+  // kept: the first format is never examined.
+  delete_elements<short_audio_desc_t>(formats, 1, [&](i32 place, const short_audio_desc_t &audio) {
     const u32 bit = _audio_type_to_audio_mask(audio.type);
-    if ((bit & mask) != 0) continue;
-    ll_delete_entry_at(formats, static_cast<u32>(place));
+    if ((bit & mask) != 0) return false;
     journal->note({.subject = COMPOSE_SUBJECT_AUDIO_FORMAT,
                    .index = place,
                    .reason = bit == 0 ? COMPOSE_REASON_TYPE_WITHOUT_BIT : COMPOSE_REASON_AUDIO_MASK,
                    .values = bit == 0 ? reason_values(mask) : reason_values(mask, bit)});
-  }
+    return true;
+  });
 }
 
 }  // namespace edid_composer

@@ -8,17 +8,17 @@ namespace {
 
 REPORTS_AS(_filter_video_modes);
 
-bool delete_first(u32 vic, ll_list_t *modes) {
-  u32 position = 0;
-  for (const auto &video : walk<const short_video_desc_t>(LIST(modes))) {
-    if (video.vic == vic) return ll_delete_entry_at(modes, position);
-    ++position;
-  }
-  return true;
+void delete_first(u32 vic, ll_list_t *modes) {
+  bool deleted = false;
+  delete_elements<short_video_desc_t>(modes, 0, [&](i32, const short_video_desc_t &mode) {
+    if (deleted || mode.vic != vic) return false;
+    deleted = true;
+    return true;
+  });
 }
 
 bool put_first(u32 vic, ll_list_t *modes) {
-  if (!delete_first(vic, modes)) return false;
+  delete_first(vic, modes);
   LOG_TRACE("\tAdding hdmi output mode as the priority mode:%s", short_video_timing_string(vic));
   return prepend(modes, short_video_desc_t{.native = 0, .vic = vic, .stereo = 0}, site);
 }

@@ -53,7 +53,7 @@ bool add_platform_modes(i32 rate, const platform_values_t &platform, candidates_
 // 2. What of it the platform offers.
 
 bool prioritize(const ll_list_t *list, const candidates_t &candidates, ll_list_t *modes, journal_t *journal) {
-  if (debug_enabled()) {
+  if (is_tracing()) {
     log_trace(site, __LINE__, "\tPrioritization List:");
     for (const auto &video : walk<const short_video_desc_t>(LIST(list)))
       print_mode(video);
@@ -77,7 +77,7 @@ bool prioritize(const ll_list_t *list, const candidates_t &candidates, ll_list_t
 video_selection_t _filter_video_modes(const inputs_t &inputs, ll_list_t *modes, journal_t *journal) {
   const platform_values_t &platform = inputs.platform;
   video_selection_t selection;
-  candidates_t candidates(debug_enabled() || platform.geometry_limit != 0);
+  candidates_t candidates(is_tracing() || platform.geometry_limit != 0);
   if (!add_sink_modes(&inputs.sink, &candidates, journal)) return selection;
   selection.native_rate = _determine_tv_native_refresh_rate(inputs);
   const i32 rate = selection.native_rate.hz;
@@ -87,7 +87,7 @@ video_selection_t _filter_video_modes(const inputs_t &inputs, ll_list_t *modes, 
   if (!prioritize(list, candidates, modes, journal)) return selection;
   selection.current_mode = put_current_mode_first(inputs, modes);
   selection.complete = selection.current_mode.complete;
-  if (selection.complete && debug_enabled()) {
+  if (selection.complete && is_tracing()) {
     log_trace(site, __LINE__, "\tNew EDID List of VICs:");
     for (const auto &video : walk<const short_video_desc_t>(LIST(modes)))
       print_mode(video);
@@ -108,7 +108,7 @@ bool _combine_lists(candidates_t *candidates, const ll_list_t *extra_list, bool 
     LOG_TRACE("\tAdding video format:%d %s stereo:0x%03X", extra.vic, short_video_timing_string(extra.vic),
               extra.stereo);
   }
-  if (debug_enabled()) {
+  if (is_tracing()) {
     log_trace(site, __LINE__, "\tList after combining:");
     candidates->for_each([](const candidate_t &candidate) { print_mode(candidate.vic, candidate.stereo, ""); });
   }
