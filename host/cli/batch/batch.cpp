@@ -22,12 +22,12 @@
 namespace edid_cli {
 namespace {
 
-/// What the library writes during one composition.
-class heard_t {
+/// Keeps what the library writes during one composition.
+class kept_lines_t {
  public:
-  explicit heard_t(bool keeps_all) : keeps_all_(keeps_all) {}
+  explicit kept_lines_t(bool keeps_all) : keeps_all_(keeps_all) {}
 
-  void hear(const compose_log_line_t &line) {
+  void take(const compose_log_line_t &line) {
     if (keeps_all_) {
       text += printed(line);
     }
@@ -73,23 +73,23 @@ class batch_worker_t {
       throw bad_input_t("another EDID has its file name");
     }
     const bool is_traced = options_.composition.debug;
-    heard_t heard(is_traced || options_.log);
+    kept_lines_t lines(is_traced || options_.log);
     const composition_t composition =
         compose(options_.composition, task.port, task.sink_file.empty() ? shared_sink_ : read_edid_file(task.sink_file),
-                [&heard](const compose_log_line_t &line) { heard.hear(line); });
+                [&lines](const compose_log_line_t &line) { lines.take(line); });
     if (composition.is_composed) {
       write_file_atomically(task.output_file, formatted(composition.new_edid, options_.format), durability_t::later);
     }
     if (options_.log) {
-      write_file_atomically(task.log_file, heard.text, durability_t::later);
+      write_file_atomically(task.log_file, lines.text, durability_t::later);
     }
     batch_result_t result;
     if (!composition.is_composed) {
       result.failure = "the library refused to compose an EDID" +
-                       (heard.first_error.empty() ? std::string() : ": " + heard.first_error);
+                       (lines.first_error.empty() ? std::string() : ": " + lines.first_error);
     }
-    result.output = is_traced ? std::move(heard.text) : std::string();
-    result.diagnostics = std::move(heard.diagnostics);
+    result.output = is_traced ? std::move(lines.text) : std::string();
+    result.diagnostics = std::move(lines.diagnostics);
     return result;
   }
 

@@ -5,7 +5,7 @@
 
 namespace edid_cli {
 
-/// Composes all that asks_for_several() tells of with the platform that is loaded, and prints a summary. Returns
+/// Composes all that plan_tasks() lists with the platform that is loaded, and prints a summary. Returns
 /// whether all succeeded. Throws bad_input_t.
 bool compose_several(const compose_options_t &options);
 

@@ -7,7 +7,7 @@
 namespace edid_cli {
 namespace {
 
-/// So many different diagnostics are told one by one.
+/// So many different diagnostics are listed one by one.
 constexpr std::size_t most_diagnostics = 20;
 
 /// Bug lines end with an address in memory, of which each thread has its own.

@@ -1,4 +1,4 @@
-// What came of several compositions, told at their end.
+// What came of several compositions, printed at their end.
 #pragma once
 
 #include <map>

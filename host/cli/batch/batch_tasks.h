@@ -17,7 +17,7 @@ struct task_t {
   std::string log_file;
 };
 
-/// Tells whether a command line asks for several compositions: a folder of sinks, a range of ports, or both.
+/// Returns whether a command line asks for several compositions: a folder of sinks, a range of ports, or both.
 bool asks_for_several(const composition_options_t &options);
 
 /// All of them, sink by sink in order of their names, then port by port; the folder that they go to exists then.

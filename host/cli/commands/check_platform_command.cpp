@@ -37,7 +37,7 @@ int run(const std::string &file) {
   load_platform(file);
   platform_check_t check;
   {
-    // What is found is told in other words.
+    // The findings say it in other words.
     const discarded_output_t unseen;
     check = check_platform();
   }

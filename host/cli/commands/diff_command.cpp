@@ -54,7 +54,7 @@ class side_t {
   decoded_edid_t edid_;
 };
 
-/// Appends a field's rows; tells whether any differs.
+/// Appends a field's rows; returns whether any differs.
 bool add_field(text_table_t &table, const edid_field_t &field, const side_t &left, const side_t &right,
                bool only_changes) {
   bool differs = false;

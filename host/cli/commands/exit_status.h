@@ -1,4 +1,4 @@
-// What the program tells its caller.
+// The statuses that the program exits with.
 #pragma once
 
 namespace edid_cli {

@@ -40,7 +40,7 @@ constexpr int not_offered_status = 1;
 class sink_record_t {
  public:
   explicit sink_record_t(const std::vector<u8> &bytes) {
-    // The composition decodes it as well, and what the library says of it is told there.
+    // The composition decodes it as well, and prints what the library says of it.
     const discarded_output_t unseen;
     if (!bytes.empty()) {
       decoded_ = std::make_unique<decoded_edid_t>(bytes);

@@ -1,4 +1,4 @@
-// Reading a command line. The only file beside it that knows the library which does it is its source.
+// Reading a command line. Only the source of this header knows CLI11, which takes long to compile.
 #pragma once
 
 #include <string>

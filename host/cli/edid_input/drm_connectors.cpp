@@ -16,7 +16,7 @@ std::string without_card(const std::string &name) {
   return name.starts_with("card") && dash != std::string::npos ? name.substr(dash + 1) : "";
 }
 
-/// The connectors that can be read; @p error tells why the folder cannot.
+/// The connectors that can be read; @p error is why the folder cannot.
 std::vector<connector_t> connectors_in(const std::string &drm_directory, std::error_code &error) {
   std::vector<connector_t> connectors;
   for (fs::directory_iterator entry(drm_directory, error), end; !error && entry != end; entry.increment(error)) {

@@ -41,7 +41,7 @@ std::vector<u8> read_hex_block(std::span<const text_line_t> lines, const std::st
       continue;
     }
     if (!is_hexadecimal(words.front())) {
-      // The next thing that the tool tells, unless the EDID is not whole yet.
+      // The next thing that the tool writes, unless the EDID is not whole yet.
       if (bytes.size() % edid_block_size != 0) {
         refuse_at(name, *line, words.front(), "is not hexadecimal");
       }

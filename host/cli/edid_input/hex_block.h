@@ -10,10 +10,10 @@
 
 namespace edid_cli {
 
-/// Tells whether a heading announces an EDID anywhere in a text.
+/// Returns whether a heading announces an EDID anywhere in a text.
 bool has_hex_block(std::span<const text_line_t> lines);
 
-/// The bytes under the heading, up to the first line behind a whole block that does not begin with hexadecimal digits.
+/// The bytes under the heading, up to the first line after a whole block that does not begin with hexadecimal digits.
 /// Throws bad_input_t, also when there is more than one heading.
 std::vector<u8> read_hex_block(std::span<const text_line_t> lines, const std::string &name);
 

@@ -10,7 +10,7 @@
 
 namespace edid_cli {
 
-/// Tells by the first line whether a text is such a dump.
+/// Returns by the first line whether a text is such a dump.
 bool is_hex_dump(std::span<const text_line_t> lines);
 
 /// The bytes of a dump: what stands between offsets and text columns, and lines repeated where "*" stands for them.

@@ -10,7 +10,7 @@
 
 namespace edid_cli {
 
-/// Tells whether a word is hexadecimal digits and nothing else.
+/// Returns whether a word is hexadecimal digits and nothing else.
 bool is_hexadecimal(std::string_view word);
 
 /// Appends what a word of a line stands for: pairs of digits, "0x" may stand before them. Throws bad_input_t, which

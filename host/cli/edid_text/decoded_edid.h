@@ -15,7 +15,7 @@ class decoded_edid_t {
   decoded_edid_t(const decoded_edid_t &) = delete;
   decoded_edid_t &operator=(const decoded_edid_t &) = delete;
 
-  /// Tells whether all of it decoded; the record holds what did.
+  /// Returns whether all of it decoded; the record holds what did.
   bool is_complete() const { return is_complete_; }
   const edid_t &record() const { return record_; }
 

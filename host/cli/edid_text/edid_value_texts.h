@@ -1,4 +1,4 @@
-// Values of a decoded EDID that take more than a number to tell. Of a list: one text for each entry.
+// Values of a decoded EDID that are more than a number, as texts. Of a list: one text for each entry.
 #pragma once
 
 #include <string>

@@ -12,7 +12,7 @@ namespace {
 
 constexpr u32 sink_origins = COMPOSE_ORIGIN_DETAILED_TIMING | COMPOSE_ORIGIN_STANDARD_TIMING |
                              COMPOSE_ORIGIN_SHORT_VIDEO | COMPOSE_ORIGIN_SINK_4K;
-/// As many short video descriptors as a data block's length field can tell (CEA-861, section 7.5).
+/// As many short video descriptors as a data block's length field can hold (CEA-861, section 7.5).
 constexpr i32 most_video_modes = 31;
 constexpr std::size_t most_4k_entries = 7;
 constexpr const char *geometry_key = "geometry_limit";

@@ -34,7 +34,7 @@ constexpr field_row_t header_rows[] = {
      }},
 };
 
-/// A descriptor begins with its clock, or with two zeros and a tag behind them.
+/// A descriptor begins with its clock, or with two zeros and a tag after them.
 bool is_descriptor_next(const byte_naming_t &naming) {
   return naming.position() + descriptor_size <= checksum_offset &&
          (naming.next(0) != 0 || naming.next(1) != 0 || naming.next(3) != 0);

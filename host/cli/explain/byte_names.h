@@ -9,7 +9,7 @@
 
 namespace edid_cli {
 
-/// Parts of an EDID that are told apart by colour.
+/// Parts of an EDID, each with a colour of its own.
 enum class byte_block_t {
   identity,
   display,

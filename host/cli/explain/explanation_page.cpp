@@ -56,7 +56,7 @@ std::string explanation_page(const explained_t &explained) {
   const new_edid_t &bytes = explained.composition.new_edid;
   const std::vector<row_t> rows = rows_of(explained);
   const std::vector<byte_field_t> fields = name_bytes(bytes);
-  // What the library says here it has said before, or it is told in other words.
+  // What the library prints here it has printed before, or the page says it in other words.
   const discarded_output_t unseen;
   const decoded_edid_t new_edid(std::vector<u8>(bytes.begin(), bytes.end()));
   const platform_check_t check = check_platform();

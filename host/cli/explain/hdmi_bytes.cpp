@@ -56,7 +56,7 @@ constexpr const char *structures[] = {"frame packing",       "field alternative"
                                       "top-and-bottom",      "reserved",          "side-by-side (half)"};
 constexpr unsigned side_by_side_half = 8;
 
-/// One mode's 3D structure; from side-by-side (half) on with a byte of detail behind it.
+/// One mode's 3D structure; from side-by-side (half) on with a byte of detail after it.
 void name_3d_entry(byte_naming_t &naming) {
   const unsigned byte = naming.next();
   const unsigned structure = byte & 15U;

@@ -35,7 +35,7 @@ constexpr std::string_view platform_card_keys[] = {
     "4k_x_2k_priority_list", "4k_x_2k_addition_list", "audio.pass_through",
 };
 
-/// A name that may be broken behind its underscores.
+/// A name that may be broken after its underscores.
 std::string breakable_html(std::string_view name) {
   std::string html;
   for (const char character : html_text(name)) {

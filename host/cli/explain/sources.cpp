@@ -17,7 +17,7 @@ struct sink_origin_t {
   const char *name;
 };
 
-// The lowest bit of a decision's origins tells which of them its place counts.
+// A decision's place counts in the origin that is the lowest bit of its origins.
 constexpr sink_origin_t sink_origins[] = {
     {COMPOSE_ORIGIN_DETAILED_TIMING, "detailed timing"},    {COMPOSE_ORIGIN_STANDARD_TIMING, "standard timing"},
     {COMPOSE_ORIGIN_SHORT_VIDEO, "short video descriptor"}, {COMPOSE_ORIGIN_SINK_4K, "HDMI VIC"},

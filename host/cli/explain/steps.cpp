@@ -33,7 +33,7 @@ u32 usual_audio_entry(u32 type) {
   return detail << 16 | rates_32_to_48 << 8 | format << 3 | (channels - 1);
 }
 
-/// A key for one more audio format, behind those that are there.
+/// A key for one more audio format, after those that are there.
 std::string free_audio_key(const std::vector<list_entry_t> &entries) {
   const auto is_used = [&entries](const std::string &key) {
     return std::any_of(entries.begin(), entries.end(), [&key](const auto &entry) { return entry.name == key; });

@@ -21,7 +21,7 @@ std::vector<wanted_t> all_of(compose_subject subject, const std::vector<u32> &co
   return wanted;
 }
 
-/// The number behind a prefix, from 1 to @p last; 0 for anything else.
+/// The number after a prefix, from 1 to @p last; 0 for anything else.
 u32 number_in(std::string_view text, u32 last) {
   const auto number = parse_whole_number(text);
   return number && *number <= last ? *number : 0;

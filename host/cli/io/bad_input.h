@@ -1,4 +1,4 @@
-// What is wrong with what the user gave: told once on standard error, and the program ends with status 2.
+// What is wrong with what the user gave: one line on standard error, and the program ends with status 2.
 #pragma once
 
 #include <stdexcept>

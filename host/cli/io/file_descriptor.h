@@ -25,7 +25,7 @@ class file_descriptor_t {
     descriptor_ = descriptor;
   }
 
-  /// Tells whether closing succeeded: only then is known that what was written has arrived.
+  /// Returns whether closing succeeded: only then is known that what was written has arrived.
   bool close() {
     const int descriptor = std::exchange(descriptor_, -1);
     return descriptor < 0 || ::close(descriptor) == 0;

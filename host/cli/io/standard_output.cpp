@@ -17,6 +17,15 @@ namespace {
   throw bad_input_t(std::string("standard output: cannot write: ") + std::strerror(errno));
 }
 
+int open_null_device() {
+  constexpr const char *null_device = "/dev/null";
+  const int descriptor = open(null_device, O_WRONLY | O_CLOEXEC);
+  if (descriptor < 0) {
+    throw bad_input_t(std::string(null_device) + ": " + std::strerror(errno));
+  }
+  return descriptor;
+}
+
 }  // namespace
 
 standard_output_redirect_t::standard_output_redirect_t(int target)
@@ -32,8 +41,7 @@ standard_output_redirect_t::~standard_output_redirect_t() {
   dup2(original_.get(), STDOUT_FILENO);
 }
 
-discarded_output_t::discarded_output_t()
-    : nowhere_(open("/dev/null", O_WRONLY | O_CLOEXEC)), redirect_(nowhere_.get()) {}
+discarded_output_t::discarded_output_t() : nowhere_(open_null_device()), redirect_(nowhere_.get()) {}
 
 void flush_standard_output() {
   if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {

@@ -20,7 +20,7 @@ struct list_reading_t {
 /// Has the library compose without a sink from the configuration that is loaded, and listens to it.
 list_reading_t read_lists();
 
-/// Tells whether an entry of which this was said is left out.
+/// Returns whether an entry of which this was said is left out.
 bool is_skipped(const entry_messages_t &messages);
 
 }  // namespace edid_cli

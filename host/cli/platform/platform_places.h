@@ -1,4 +1,4 @@
-// Where in the platform's file stands what the library has read of it.
+// Where what the library has read stands in the platform's file.
 #pragma once
 
 #include <map>
