@@ -27,7 +27,7 @@ void measure_with_stack(benchmark::State &state, operation_t operation) {
 void run_with_values(benchmark::State &state, const sink_t &sink) {
   load_default_platform();
   values_t values;
-  edid_composer::_read_platform_values(values.get());
+  edid_composer::_read_platform_values(values.get(), nullptr);
   const compose_cfg_t cfg = sample_settings();
   output_t output;
   measure_with_stack(state, [&] {
@@ -43,7 +43,7 @@ void count(const compose_decision_t *, void *decisions) {
 void run_observed(benchmark::State &state, const sink_t &sink, compose_observer_t observer) {
   load_default_platform();
   values_t values;
-  edid_composer::_read_platform_values(values.get());
+  edid_composer::_read_platform_values(values.get(), nullptr);
   const compose_cfg_t cfg = sample_settings();
   output_t output;
   u64_t decisions = 0;

@@ -135,7 +135,7 @@ int main(int count, char **arguments) {
   if (std::freopen("/dev/null", "w", stdout) == nullptr) return 2;
   bench::load_default_platform();
   values_t values;
-  edid_composer::_read_platform_values(values.get());
+  edid_composer::_read_platform_values(values.get(), nullptr);
   const std::vector<bytes_t> sinks = readable_sinks(arguments[1]);
   if (sinks.empty()) {
     std::fprintf(stderr, "%s: no EDID of %zu bytes that both sides read\n", arguments[1], edid_size);

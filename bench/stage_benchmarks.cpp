@@ -24,7 +24,7 @@ class situation_t {
  public:
   explicit situation_t(const sink_t &sink) {
     load_default_platform();
-    _read_platform_values(values.get());
+    _read_platform_values(values.get(), nullptr);
     edid_prepare(&downstream);
     decode_edid_block_0(sink.data(), &downstream);
     if (sink.size() > block_size) decode_edid_extensions(sink.data() + block_size, block_size, &downstream);
@@ -104,7 +104,7 @@ void register_stage_benchmarks() {
     load_default_platform();
     measure(state, [] {
       values_t values;
-      _read_platform_values(values.get());
+      _read_platform_values(values.get(), nullptr);
     });
   });
   for (const auto &sink : sample_sinks())

@@ -20,15 +20,16 @@ REPORTS_AS(compose_edid_internal);
 constexpr u32 smallest_size = block_size;
 constexpr u32 largest_size = 2 * block_size;
 
-/// The records of one composition. They start zero-filled, so that one that was never prepared is destroyed cleanly.
+/// The records of one composition. All their list entries lie in the arena.
 struct workspace_t {
+  entry_arena_t arena;
   platform_values_t platform{};
   edid_t sink{};
   edid_t new_edid{};
 };
 
-/// A sink's EDID that can't be read is left out, not refused. Null: it can be read.
-compose_sink_status unreadable(const compose_request_t &request) {
+/// Whether the sink's EDID can be looked at: COMPOSE_SINK_READ, or why not. One that can't is left out, not refused.
+compose_sink_status look_at_sink(const compose_request_t &request) {
   compose_sink_status status = COMPOSE_SINK_READ;
   if (request.sink == nullptr) {
     status = COMPOSE_SINK_NONE;
@@ -69,7 +70,7 @@ bool is_output_valid(const compose_request_t &request) {
 /// The caller's platform values, else those of the configuration; null when that can't be read.
 const platform_values_t *platform_of(const compose_request_t &request, workspace_t *work) {
   if (request.platform_values != nullptr) return request.platform_values;
-  if (_read_platform_values(&work->platform)) return &work->platform;
+  if (_read_platform_values(&work->platform, &work->arena)) return &work->platform;
   LOG_ERROR("Failed trying to read the platform config file.");
   return nullptr;
 }
@@ -109,11 +110,11 @@ bool write(const compose_request_t &request, const platform_values_t &platform, 
   return true;
 }
 
-void read_sink_into(const compose_request_t &request, compose_sink_status status, edid_t *sink,
+void read_sink_into(workspace_t *work, const compose_request_t &request, compose_sink_status status,
                     compose_result_t *result) {
   sink_reading_t reading{.status = status};
   if (status == COMPOSE_SINK_READ) {
-    reading = read_sink(request.sink, request.sink_bytes, sink);
+    reading = read_sink(request.sink, request.sink_bytes, &work->sink, &work->arena);
   } else {
     LOG_TRACE("Valid edid not available. Continuing composing edid. Passed in edid:%p size:%d bytes",
               address(request.sink), request.sink_bytes);
@@ -124,49 +125,42 @@ void read_sink_into(const compose_request_t &request, compose_sink_status status
   result->sink_blocks_unread = reading.blocks_unread;
 }
 
-bool compose_with(const compose_request_t &request, compose_sink_status status, workspace_t *work,
-                  decisions_t *decisions, compose_result_t *result) {
-  const platform_values_t *const platform = platform_of(request, work);
-  if (platform == nullptr) return false;
-  edid_prepare(&work->sink);
-  edid_prepare(&work->new_edid);
-  read_sink_into(request, status, &work->sink, result);
-
-  const inputs_t inputs{work->sink, *platform, *request.settings};
-  outcomes_t outcomes;
-  journal_t journal(request.observer != nullptr);
-  if (!run_stages(inputs, &work->new_edid, &journal, &outcomes) ||
-      !write(request, *platform, &work->new_edid, &outcomes.encoding, result)) {
-    return false;
-  }
-  if (request.observer != nullptr) explain(inputs, outcomes, journal, work->new_edid, request.new_edid, decisions);
-  trace_new_edid(request.new_edid);
-  return true;
-}
-
-/// All of it, always, in this order; what fails here doesn't change the result.
-void clean_up(workspace_t *work) {
-  if (edid_destroy(&work->sink) != 1) LOG_ERROR("Failed cleaning up edid.");
-  if (edid_destroy(&work->new_edid) != 1) LOG_ERROR("Failed cleaning up new_edid.");
-  platform_values_destroy(&work->platform);
+/// Passes the decisions on to the observer, all or none.
+void pass_on_decisions(const compose_request_t &request, const inputs_t &inputs, const outcomes_t &outcomes,
+                       const journal_t &journal, const edid_t &new_record) {
+  if (request.observer == nullptr || !journal.is_complete()) return;
+  decisions_t decisions(inputs.arena);
+  explain(inputs, outcomes, journal, new_record, request.new_edid, &decisions);
+  decisions.pass_on(request.observer, request.observer_context);
 }
 
 }  // namespace
 
 bool compose(const compose_request_t &request, compose_result_t *result) {
-  const compose_sink_status status = unreadable(request);
+  const compose_sink_status status = look_at_sink(request);
   if (!is_output_valid(request)) return false;
   if (request.platform_values != nullptr && !ll_is_initialized(&request.platform_values->audio_list)) {
     LOG_ERROR("The passed in platform_values has not been initialized.");
     return false;
   }
   workspace_t work;
-  decisions_t decisions;
   platform_values_init(&work.platform);
-  const bool composed = compose_with(request, status, &work, &decisions, result);
-  clean_up(&work);
-  if (composed) decisions.pass_on(request.observer, request.observer_context);
-  return composed;
+  edid_prepare(&work.sink);
+  edid_prepare(&work.new_edid);
+  const platform_values_t *const platform = platform_of(request, &work);
+  if (platform == nullptr) return false;
+  read_sink_into(&work, request, status, result);
+
+  const inputs_t inputs{work.sink, *platform, *request.settings, &work.arena};
+  outcomes_t outcomes;
+  journal_t journal(request.observer != nullptr, &work.arena);
+  if (!run_stages(inputs, &work.new_edid, &journal, &outcomes) ||
+      !write(request, *platform, &work.new_edid, &outcomes.encoding, result)) {
+    return false;
+  }
+  trace_new_edid(request.new_edid);
+  pass_on_decisions(request, inputs, outcomes, journal, work.new_edid);
+  return true;
 }
 
 }  // namespace edid_composer

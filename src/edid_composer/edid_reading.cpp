@@ -11,10 +11,10 @@ namespace edid_composer {
 
 REPORTS_AS(compose_edid_internal);
 
-sink_reading_t read_sink(const u8 *sink_bytes, u32 size, edid_t *sink) {
+sink_reading_t read_sink(const u8 *sink_bytes, u32 size, edid_t *sink, entry_arena_t *arena) {
   LOG_TRACE("Decode EDID Block %d", 0);
   _dump_raw_edid_block(sink_bytes, 1);
-  sink_reading_t reading{.status = decode_base_block(sink_bytes, sink)};
+  sink_reading_t reading{.status = decode_base_block(sink_bytes, sink, arena)};
   if (reading.status != COMPOSE_SINK_READ) {
     LOG_ERROR("Failed decoding the edid block 0. Continuing.");
     return reading;
@@ -27,7 +27,7 @@ sink_reading_t read_sink(const u8 *sink_bytes, u32 size, edid_t *sink) {
   const u8 *const extension = sink_bytes + block_size;
   LOG_TRACE("Decode EDID Block 1");
   _dump_raw_edid_block(extension, length >= block_size ? 1 : 0);
-  const extension_outcome_t outcome = decode_cea_extension(extension, length, sink);
+  const extension_outcome_t outcome = decode_cea_extension(extension, length, sink, arena);
   if (outcome.status != COMPOSE_EXTENSION_READ) LOG_ERROR("Failed decoding the extension. Continuing.");
   reading.extension_status = length == 0 ? COMPOSE_EXTENSION_MISSING : outcome.status;
   reading.malformed_at = outcome.malformed_at;

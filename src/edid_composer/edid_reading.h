@@ -1,7 +1,7 @@
 // Reading of a whole EDID as a composition does it: dumped block by block, then decoded.
 #pragma once
 
-#include "edid_composer.h"
+#include "linked_list/entry_arena.h"
 
 namespace edid_composer {
 
@@ -14,7 +14,7 @@ struct sink_reading_t {
 };
 
 /// Decodes the sink's EDID into a prepared record, as far as it can be read.
-sink_reading_t read_sink(const u8 *sink_bytes, u32 size, edid_t *sink);
+sink_reading_t read_sink(const u8 *sink_bytes, u32 size, edid_t *sink, entry_arena_t *arena);
 
 /// While tracing is on, decodes the 256 bytes of the new EDID again: what the decoders trace of it is the point.
 void trace_new_edid(const u8 *new_edid);

@@ -1,7 +1,7 @@
 // What every stage of a composition decides from.
 #pragma once
 
-#include "edid_composer.h"
+#include "linked_list/entry_arena.h"
 
 namespace edid_composer {
 
@@ -9,6 +9,7 @@ struct inputs_t {
   const edid_t &sink;  ///< The sink's record; empty without a readable sink.
   const platform_values_t &platform;
   const compose_cfg_t &settings;
+  entry_arena_t *arena;  ///< Where the lists of the composition take their entries from.
 };
 
 /// Numbers that explain a reason; see compose_reason.

@@ -19,7 +19,7 @@ struct journal_entry_t {
 /// Keeps the entries of an observed composition; that of any other forgets them.
 class journal_t {
  public:
-  explicit journal_t(bool kept) : kept_(kept) {}
+  journal_t(bool kept, entry_arena_t *arena) : entries_(arena), kept_(kept) {}
 
   void note(const journal_entry_t &entry);
 

@@ -77,8 +77,8 @@ void decode_features(const byte_view_t &block, edid_t *edid) {
   edid->man_timings = block[base_block::man_timings];
 }
 
-bool decode_standard_timings(const byte_view_t &block, edid_t *edid) {
-  appender_t<std_timing_t> timings = standard_timing_appender(edid);
+bool decode_standard_timings(const byte_view_t &block, edid_t *edid, entry_arena_t *arena) {
+  appender_t<std_timing_t> timings = standard_timing_appender(edid, arena);
   for (u32 i = 0; i < base_block::standard_timing_count; ++i) {
     const u8 byte_a = block[base_block::standard_timings + 2 * i];
     const u8 byte_b = block[base_block::standard_timings + 2 * i + 1];
@@ -90,8 +90,8 @@ bool decode_standard_timings(const byte_view_t &block, edid_t *edid) {
   return true;
 }
 
-compose_sink_status decode_descriptors(const byte_view_t &block, edid_t *edid) {
-  appender_t<detailed_timing_t> timings = detailed_timing_appender(edid);
+compose_sink_status decode_descriptors(const byte_view_t &block, edid_t *edid, entry_arena_t *arena) {
+  appender_t<detailed_timing_t> timings = detailed_timing_appender(edid, arena);
   for (u32 i = 0; i < base_block::descriptor_count; ++i) {
     const byte_view_t d = block.from(base_block::descriptors + i * descriptor_size);
     if (_decode_edid_dtd(d, &timings, edid)) continue;
@@ -109,7 +109,7 @@ compose_sink_status decode_descriptors(const byte_view_t &block, edid_t *edid) {
 
 }  // namespace
 
-compose_sink_status decode_base_block(const u8 *edid_block, edid_t *edid) {
+compose_sink_status decode_base_block(const u8 *edid_block, edid_t *edid, entry_arena_t *arena) {
   if (!is_prepared(*edid)) return COMPOSE_SINK_OUT_OF_MEMORY;
   const byte_view_t block(edid_block, block_size);
   if (!verify_header(block)) return COMPOSE_SINK_HEADER_INVALID;
@@ -121,8 +121,8 @@ compose_sink_status decode_base_block(const u8 *edid_block, edid_t *edid) {
   edid->digital = (block[base_block::video_input] & base_block::digital_input) != 0;
   if (edid->digital == 0) LOG_WARNING("EDID inappropriately set to analog. Continuing.");
   decode_features(block, edid);
-  if (!decode_standard_timings(block, edid)) return COMPOSE_SINK_OUT_OF_MEMORY;
-  const compose_sink_status status = decode_descriptors(block, edid);
+  if (!decode_standard_timings(block, edid, arena)) return COMPOSE_SINK_OUT_OF_MEMORY;
+  const compose_sink_status status = decode_descriptors(block, edid, arena);
   if (status == COMPOSE_SINK_READ) edid->extension_count = block[base_block::extension_count];
   return status;
 }
@@ -140,5 +140,5 @@ u8 decode_edid_block_0(const u8 *edid_block, edid_t *edid) {
     LOG_ERROR("Function called with edid set to NULL.");
     return 0;
   }
-  return decode_base_block(edid_block, edid) == COMPOSE_SINK_READ ? 1 : 0;
+  return decode_base_block(edid_block, edid, nullptr) == COMPOSE_SINK_READ ? 1 : 0;
 }

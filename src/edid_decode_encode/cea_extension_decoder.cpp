@@ -40,8 +40,8 @@ compose_extension_status verify(const byte_view_t &extension) {
 }
 
 /// Decodes the detailed timings after the data blocks. A malformed one only logs.
-void decode_timings(const byte_view_t &extension, edid_t *edid) {
-  appender_t<detailed_timing_t> timings = detailed_timing_appender(edid);
+void decode_timings(const byte_view_t &extension, edid_t *edid, entry_arena_t *arena) {
+  appender_t<detailed_timing_t> timings = detailed_timing_appender(edid, arena);
   std::size_t offset = extension[layout::timings_offset];
   for (; offset + descriptor_size < extension.size(); offset += descriptor_size) {
     _decode_edid_dtd(extension.from(static_cast<u32>(offset)), &timings, edid);
@@ -129,9 +129,9 @@ bool decode_data_block(const byte_view_t &block, u32 tag, u32 length, block_list
   return true;
 }
 
-extension_outcome_t decode_data_blocks(const byte_view_t &extension, edid_t *edid) {
-  block_lists_t lists{.modes = appender_t<short_video_desc_t>(&edid->video_list, site, video_texts),
-                      .formats = appender_t<short_audio_desc_t>(&edid->audio_list, site)};
+extension_outcome_t decode_data_blocks(const byte_view_t &extension, edid_t *edid, entry_arena_t *arena) {
+  block_lists_t lists{.modes = appender_t<short_video_desc_t>(&edid->video_list, arena, site, video_texts),
+                      .formats = appender_t<short_audio_desc_t>(&edid->audio_list, arena, site)};
   data_blocks_t blocks(extension);
   while (blocks.next()) {
     if (!decode_data_block(extension.from(blocks->offset), blocks->tag, blocks->length, &lists, edid)) {
@@ -148,13 +148,13 @@ extension_outcome_t decode_data_blocks(const byte_view_t &extension, edid_t *edi
 
 }  // namespace
 
-extension_outcome_t decode_cea_extension(const u8 *edid_extension, u32 length, edid_t *edid) {
+extension_outcome_t decode_cea_extension(const u8 *edid_extension, u32 length, edid_t *edid, entry_arena_t *arena) {
   const byte_view_t extension(edid_extension, length);
   const compose_extension_status status = verify(extension);
   if (status != COMPOSE_EXTENSION_READ) return {status, 0};
   decode_flags(layout::support_flags, extension[layout::flags], edid);
-  decode_timings(extension, edid);
-  return decode_data_blocks(extension, edid);
+  decode_timings(extension, edid, arena);
+  return decode_data_blocks(extension, edid, arena);
 }
 
 }  // namespace edid_composer
@@ -170,5 +170,5 @@ u8 decode_edid_extensions(const u8 *edid_extension, u32 length, edid_t *edid) {
     LOG_ERROR("Function called with edid set to NULL.");
     return 0;
   }
-  return decode_cea_extension(edid_extension, length, edid).status == COMPOSE_EXTENSION_READ ? 1 : 0;
+  return decode_cea_extension(edid_extension, length, edid, nullptr).status == COMPOSE_EXTENSION_READ ? 1 : 0;
 }

@@ -1,12 +1,12 @@
-// Decoding of a whole block, with the reason where it ends early.
+// Decoding of a whole block, with the reason where it ends early. List entries come from the heap without an arena.
 #pragma once
 
-#include "edid_composer.h"
+#include "linked_list/entry_arena.h"
 
 namespace edid_composer {
 
 /// decode_edid_block_0(), in whose name it reports, for pointers that are not null.
-compose_sink_status decode_base_block(const u8 *edid_block, edid_t *edid);
+compose_sink_status decode_base_block(const u8 *edid_block, edid_t *edid, entry_arena_t *arena);
 
 /// What became of an extension.
 struct extension_outcome_t {
@@ -15,6 +15,6 @@ struct extension_outcome_t {
 };
 
 /// decode_edid_extensions(), in whose name it reports, for pointers that are not null.
-extension_outcome_t decode_cea_extension(const u8 *edid_extension, u32 length, edid_t *edid);
+extension_outcome_t decode_cea_extension(const u8 *edid_extension, u32 length, edid_t *edid, entry_arena_t *arena);
 
 }  // namespace edid_composer

@@ -74,9 +74,9 @@ bool is_display_descriptor(const byte_view_t &descriptor) {
   return descriptor.little_endian_16(detailed_timing::pixel_clock) == 0;
 }
 
-appender_t<detailed_timing_t> detailed_timing_appender(edid_t *edid) {
+appender_t<detailed_timing_t> detailed_timing_appender(edid_t *edid, entry_arena_t *arena) {
   REPORTS_AS(_decode_edid_dtd);
-  return appender_t<detailed_timing_t>(&edid->dtd_list, site, timing_texts);
+  return appender_t<detailed_timing_t>(&edid->dtd_list, arena, site, timing_texts);
 }
 
 bool _decode_edid_dtd(const byte_view_t &dtd, appender_t<detailed_timing_t> *timings, edid_t *edid) {

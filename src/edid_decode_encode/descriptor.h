@@ -10,7 +10,7 @@ namespace edid_composer {
 bool is_display_descriptor(const byte_view_t &descriptor);
 
 /// Appends the detailed timings of a record's descriptors.
-appender_t<detailed_timing_t> detailed_timing_appender(edid_t *edid);
+appender_t<detailed_timing_t> detailed_timing_appender(edid_t *edid, entry_arena_t *arena);
 
 /// Decodes one descriptor: a detailed timing is appended to @p timings, the others go to their fields of the record.
 bool _decode_edid_dtd(const byte_view_t &dtd, appender_t<detailed_timing_t> *timings, edid_t *edid);

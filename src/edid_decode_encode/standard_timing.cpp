@@ -12,9 +12,9 @@ constexpr u32 refresh_base = 60;
 
 }  // namespace
 
-appender_t<std_timing_t> standard_timing_appender(edid_t *edid) {
+appender_t<std_timing_t> standard_timing_appender(edid_t *edid, entry_arena_t *arena) {
   REPORTS_AS(_decode_edid_standard_timing);
-  return appender_t<std_timing_t>(&edid->std_timings, site);
+  return appender_t<std_timing_t>(&edid->std_timings, arena, site);
 }
 
 bool _decode_edid_standard_timing(u8 byte_a, u8 byte_b, appender_t<std_timing_t> *timings) {

@@ -5,6 +5,7 @@
 #include <cstring>
 
 #include "diagnostics.h"
+#include "linked_list/entry_arena.h"
 
 namespace edid_composer {
 
@@ -30,22 +31,44 @@ bool init_list(ll_list_t *list, u32 tag) {
   return true;
 }
 
+namespace {
+
 // Not calloc: the thread's cache of free blocks, which malloc uses, halves the time that an entry takes.
-ll_entry_t *create_unfilled_entry(u32 size, u32 tag, const void *entry_output, const void *data_output) {
+ll_entry_t *entry_of_heap(u32 size, const void *entry_output, const void *data_output) {
   REPORTS_AS(ll_create_entry);
   auto *const entry = static_cast<ll_entry_t *>(std::malloc(sizeof(ll_entry_t)));
   if (entry == nullptr) {
     LOG_BUG("calloc failed to allocate memory for the entry. ptr:%p", address(entry_output));
     return nullptr;
   }
-  void *const data = std::malloc(size);
-  if (data == nullptr) {
+  entry->data = std::malloc(size);
+  if (entry->data == nullptr) {
     LOG_BUG("calloc failed to allocate memory for the data storage. ptr:%p", address(data_output));
     std::free(entry);
     return nullptr;
   }
-  *entry = {.data = data, .next = nullptr, .list = nullptr, .type = tag};
   return entry;
+}
+
+ll_entry_t *entry_of_arena(u32 size, entry_arena_t *arena) {
+  auto *const entry = static_cast<ll_entry_t *>(arena->allocate(static_cast<u32>(sizeof(ll_entry_t)) + size));
+  if (entry != nullptr) entry->data = entry + 1;
+  return entry;
+}
+
+}  // namespace
+
+ll_entry_t *create_unfilled_entry(u32 size, u32 tag, entry_arena_t *arena) {
+  ll_entry_t *const entry = arena != nullptr ? entry_of_arena(size, arena) : entry_of_heap(size, &size, &size);
+  if (entry == nullptr) return nullptr;
+  entry->next = nullptr;
+  entry->list = nullptr;
+  entry->type = tag;
+  return entry;
+}
+
+void discard_entry(ll_entry_t *entry, const entry_arena_t *arena) {
+  if (arena == nullptr) ll_delete_entry(entry);
 }
 
 namespace {
@@ -144,7 +167,58 @@ bool is_within(const ll_list_t &list, i32 index) {
   return false;
 }
 
+/// A copy that is in no list yet; null when there is no memory for it, or it has no size.
+ll_entry_t *copy_of(const ll_entry_t &source, u32 size, entry_arena_t *arena) {
+  ll_entry_t *copy = nullptr;
+  void *payload = nullptr;
+  if (arena != nullptr) {
+    copy = create_unfilled_entry(size, source.type, arena);
+  } else {
+    ll_create_entry(static_cast<i32>(size), &copy, &payload, "");
+  }
+  if (copy == nullptr) return nullptr;
+  copy->type = source.type;
+  std::memcpy(copy->data, source.data, size);
+  return copy;
+}
+
 }  // namespace
+
+bool copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size, entry_arena_t *arena) {
+  REPORTS_AS(ll_copy_list);
+  if (src_list == nullptr) {
+    LOG_ERROR("\"src_list\" parameter is NULL. src_list:%p", address(src_list));
+    return false;
+  }
+  if (dst_list == nullptr) {
+    LOG_ERROR("\"dst_list\" parameter is NULL. dst_list:%p", address(dst_list));
+    return false;
+  }
+  if (!verify_integrity(src_list)) {
+    LOG_BUG("Source list failed integrity test.");
+    return false;
+  }
+  if (!verify_integrity(dst_list)) {
+    LOG_BUG("Destination list failed integrity test.");
+    return false;
+  }
+  // Counted, not followed to the end: a list that is copied onto itself grows while it is read.
+  const ll_entry_t *source = src_list->head;
+  for (u32 remaining = src_list->size; remaining > 0; --remaining, source = source->next) {
+    ll_entry_t *const copy = copy_of(*source, size, arena);
+    if (copy == nullptr) {
+      LOG_BUG("Failed creating entry for the destination list.");
+      return false;
+    }
+    if (!ll_add_entry_to_back(dst_list, copy)) {
+      discard_entry(copy, arena);
+      LOG_BUG("Failed adding entry to back of the destination list.");
+      return false;
+    }
+  }
+  return true;
+}
+
 }  // namespace edid_composer
 
 using namespace edid_composer;  // NOLINT(google-build-using-namespace): the operations below are the namespace's API
@@ -220,9 +294,14 @@ bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type
     return false;
   }
   const auto bytes = static_cast<u32>(size);
-  *entry = create_unfilled_entry(bytes, _calculate_str_checksum(type), address(entry), address(data));
-  *data = *entry == nullptr ? nullptr : std::memset((*entry)->data, 0, bytes);
-  return *entry != nullptr;
+  *data = nullptr;
+  *entry = entry_of_heap(bytes, entry, data);
+  if (*entry == nullptr) return false;
+  void *const payload = (*entry)->data;
+  std::memset(payload, 0, bytes);
+  **entry = {.data = payload, .next = nullptr, .list = nullptr, .type = _calculate_str_checksum(type)};
+  *data = payload;
+  return true;
 }
 
 bool ll_delete_entry(ll_entry_t *delete_entry) {
@@ -330,42 +409,5 @@ bool ll_delete_list(ll_list_t *list) {
 }
 
 bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size) {
-  REPORTS_AS(ll_copy_list);
-  if (src_list == nullptr) {
-    LOG_ERROR("\"src_list\" parameter is NULL. src_list:%p", address(src_list));
-    return false;
-  }
-  if (dst_list == nullptr) {
-    LOG_ERROR("\"dst_list\" parameter is NULL. dst_list:%p", address(dst_list));
-    return false;
-  }
-  if (!verify_integrity(src_list)) {
-    LOG_BUG("Source list failed integrity test.");
-    return false;
-  }
-  if (!verify_integrity(dst_list)) {
-    LOG_BUG("Destination list failed integrity test.");
-    return false;
-  }
-  // Counted, not followed to the end: a list that is copied onto itself grows while it is read.
-  const ll_entry_t *source = src_list->head;
-  for (u32 remaining = src_list->size; remaining > 0; --remaining, source = source->next) {
-    ll_entry_t *copy = nullptr;
-    void *payload = nullptr;
-    if (!ll_create_entry(static_cast<i32>(size), &copy, &payload, "")) {
-      LOG_BUG("Failed creating entry for the destination list.");
-      return false;
-    }
-    copy->type = source->type;
-    std::memcpy(payload, source->data, size);
-    if (!ll_add_entry_to_back(dst_list, copy)) {
-      if (ll_delete_entry(copy)) {
-        LOG_BUG("Failed adding entry to back of the destination list.");
-      } else {
-        LOG_BUG("Failed deleting entry.");
-      }
-      return false;
-    }
-  }
-  return true;
+  return copy_list(src_list, dst_list, size, nullptr);
 }

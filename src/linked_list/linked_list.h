@@ -5,6 +5,8 @@
 
 namespace edid_composer {
 
+class entry_arena_t;
+
 /// The magic of an initialised head: its own address, so that a moved or copied head is found out. 0 for a null list.
 u32 _get_magic_number(const ll_list_t *list);
 
@@ -23,8 +25,14 @@ constexpr u32 _calculate_str_checksum(const char *name) {
 /// ll_init, in whose name it reports, for a tag that is known.
 bool init_list(ll_list_t *list, u32 tag);
 
-/// ll_create_entry, in whose name it reports, for a payload that the caller fills. Null when there is no memory for it;
-/// the two outputs are then named in the report.
-ll_entry_t *create_unfilled_entry(u32 size, u32 tag, const void *entry_output, const void *data_output);
+/// ll_create_entry, in whose name it reports, for a payload that the caller fills; from the heap without an @p arena.
+/// Null when there is no memory for it.
+ll_entry_t *create_unfilled_entry(u32 size, u32 tag, entry_arena_t *arena);
+
+/// Frees an entry that no list holds, unless it belongs to an arena.
+void discard_entry(ll_entry_t *entry, const entry_arena_t *arena);
+
+/// ll_copy_list, in whose name it reports; the copies come from the heap without an @p arena.
+bool copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size, entry_arena_t *arena);
 
 }  // namespace edid_composer

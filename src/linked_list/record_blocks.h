@@ -1,4 +1,4 @@
-// Records that a composition keeps for itself, many to a list entry: one heap block serves for dozens of them.
+// Records that a composition keeps for itself, in blocks of its arena.
 #pragma once
 
 #include "linked_list/typed_list.h"
@@ -13,21 +13,18 @@ struct record_block_t {
   record_t records[capacity];
 };
 
-template <typename record_t, u32 capacity>
-inline constexpr const char *element_type_name<record_block_t<record_t, capacity>> = "record_block_t";
-
 /// Grows at its end and frees all when it goes. Addresses of records stay valid.
-/// As many as a block of some 1000 bytes holds, which the heap keeps at hand for the next composition.
 template <typename record_t>
 inline constexpr u32 records_per_block = 960 / sizeof(record_t);
 
+/// Grows at its end. Addresses of records stay valid as long as the arena that they come from.
 template <typename record_t, u32 capacity = records_per_block<record_t>>
 class record_blocks_t {
   using block_t = record_block_t<record_t, capacity>;
+  static_assert(sizeof(block_t) <= entry_arena_t::block_bytes);
 
  public:
-  record_blocks_t() { static_cast<void>(init_list<block_t>(&blocks_)); }
-  ~record_blocks_t() { ll_delete_list(&blocks_); }
+  explicit record_blocks_t(entry_arena_t *arena) : arena_(arena) {}
   record_blocks_t(const record_blocks_t &) = delete;
   record_blocks_t &operator=(const record_blocks_t &) = delete;
 
@@ -72,14 +69,11 @@ class record_blocks_t {
 
  private:
   bool add_block(const site_t &site, int line) {
-    ll_entry_t *entry = nullptr;
-    entry = create_unfilled_entry(sizeof(block_t), element_tag<block_t>, &entry, this);
-    if (entry == nullptr) {
+    auto *const block = static_cast<block_t *>(arena_->allocate(sizeof(block_t)));
+    if (block == nullptr) {
       log_error(site, line, "%s", new_entry_texts.creation_failed);
       return false;
     }
-    ll_add_entry_to_front(&blocks_, entry);
-    auto *const block = static_cast<block_t *>(entry->data);
     block->previous = last_;
     block->next = nullptr;
     block->count = 0;
@@ -88,7 +82,7 @@ class record_blocks_t {
     return true;
   }
 
-  ll_list_t blocks_{};
+  entry_arena_t *arena_;
   block_t *first_ = nullptr;
   block_t *last_ = nullptr;
 };

@@ -13,32 +13,34 @@ const ll_entry_t *begin_checked_walk(const named_list_t &named, const char *type
   return named.list->head;
 }
 
-namespace {
+bool untyped_appender_t::append(const void *record, u32 size, u32 tag) {
+  ll_entry_t *const entry = new_entry(record, size, tag);
+  return entry != nullptr && settle(add_to_back(entry), entry);
+}
 
-/// An entry that is in no list yet.
-ll_entry_t *new_entry(const void *record, u32 size, u32 tag, const char *failure, const site_t &site, int line) {
-  ll_entry_t *entry = nullptr;
-  entry = create_unfilled_entry(size, tag, &entry, &record);
+bool untyped_appender_t::prepend(const void *record, u32 size, u32 tag) {
+  ll_entry_t *const entry = new_entry(record, size, tag);
+  return entry != nullptr && settle(ll_add_entry_to_front(list_, entry), entry);
+}
+
+ll_entry_t *untyped_appender_t::new_entry(const void *record, u32 size, u32 tag) const {
+  ll_entry_t *const entry = create_unfilled_entry(size, tag, arena_);
   if (entry == nullptr) {
-    log_error(site, line, "%s", failure);
+    log_error(site_, line_, "%s", texts_.creation_failed);
   } else {
     std::memcpy(entry->data, record, size);
   }
   return entry;
 }
 
-}  // namespace
-
-bool untyped_appender_t::append(const void *record, u32 size, u32 tag) {
-  ll_entry_t *const entry = new_entry(record, size, tag, texts_.creation_failed, site_, line_);
-  if (entry == nullptr) return false;
-  if (add(entry)) return true;
+bool untyped_appender_t::settle(bool added, ll_entry_t *entry) const {
+  if (added) return true;
   log_error(site_, line_, "%s", texts_.addition_failed);
-  ll_delete_entry(entry);
+  discard_entry(entry, arena_);
   return false;
 }
 
-bool untyped_appender_t::add(ll_entry_t *entry) {
+bool untyped_appender_t::add_to_back(ll_entry_t *entry) {
   if (last_ == nullptr) {
     if (!ll_add_entry_to_back(list_, entry)) return false;
   } else {
@@ -48,15 +50,6 @@ bool untyped_appender_t::add(ll_entry_t *entry) {
   }
   last_ = entry;
   return true;
-}
-
-bool prepend_untyped(ll_list_t *list, const void *record, u32 size, u32 tag, const site_t &site, int line) {
-  ll_entry_t *const entry = new_entry(record, size, tag, new_entry_texts.creation_failed, site, line);
-  if (entry == nullptr || ll_add_entry_to_front(list, entry)) return entry != nullptr;
-  // kept: the words for the back of the list.
-  log_error(site, line, "%s", new_entry_texts.addition_failed);
-  ll_delete_entry(entry);
-  return false;
 }
 
 }  // namespace edid_composer

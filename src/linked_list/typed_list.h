@@ -7,15 +7,16 @@
 //
 // Elements are appended as copies, one or several:
 //
-//   if (!append(&edid->std_timings, timing, site)) return false;
-//
-//   appender_t<short_video_desc_t> modes(&edid->video_list, site);
+//   appender_t<short_video_desc_t> modes(&edid->video_list, arena, site);
 //   for (...) if (!modes.append(mode)) return false;
+//
+// Entries of a caller's record come from the heap, those of a composition's own lists from its arena.
 #pragma once
 
 #include <type_traits>
 
 #include "diagnostics.h"
+#include "linked_list/entry_arena.h"
 #include "linked_list/linked_list.h"
 
 namespace edid_composer {
@@ -113,10 +114,10 @@ elements<record_t> counted_elements(const ll_list_t &list) {
   return elements<record_t>(ll_size(&list) > 0 ? list.head : nullptr);
 }
 
-/// Deletes the elements of a sound list, from the one at @p first on, for which @p is_removed returns true. It is
-/// called with the place of each element and the element.
+/// Unlinks the elements of a sound list whose entries belong to an arena, from the one at @p first on, for which
+/// @p is_removed returns true. It is called with the place of each element and the element.
 template <typename record_t, typename predicate_t>
-void delete_elements(ll_list_t *list, i32 first, predicate_t is_removed) {
+void unlink_elements(ll_list_t *list, i32 first, predicate_t is_removed) {
   ll_entry_t **link = &list->head;
   for (i32 place = 0; *link != nullptr; ++place) {
     ll_entry_t *const entry = *link;
@@ -125,7 +126,6 @@ void delete_elements(ll_list_t *list, i32 first, predicate_t is_removed) {
       continue;
     }
     *link = entry->next;
-    ll_delete_entry(entry);
     --list->size;
   }
 }
@@ -141,11 +141,13 @@ inline constexpr new_entry_texts_t new_entry_texts{"Failed creating entry.",
                                                    "Failed adding entry to the back of the list."};
 
 /// Appends records to one list. The first addition verifies the list; the following ones know its end, so nobody else
-/// may change the list in between. Failures are reported in the name of @p site.
+/// may change the list in between. Failures are reported in the name of @p site. Without an @p arena the entries come
+/// from the heap.
 class untyped_appender_t {
  public:
-  untyped_appender_t(ll_list_t *list, const site_t &site, const new_entry_texts_t &texts, int line)
-      : list_(list), site_(site), texts_(texts), line_(line) {}
+  untyped_appender_t(ll_list_t *list, entry_arena_t *arena, const site_t &site, const new_entry_texts_t &texts,
+                     int line)
+      : list_(list), arena_(arena), site_(site), texts_(texts), line_(line) {}
 
   const ll_list_t &list() const { return *list_; }
   /// As ll_size, which verifies a list that nothing was appended to.
@@ -153,11 +155,15 @@ class untyped_appender_t {
 
  protected:
   [[nodiscard]] bool append(const void *record, u32 size, u32 tag);
+  [[nodiscard]] bool prepend(const void *record, u32 size, u32 tag);
 
  private:
-  bool add(ll_entry_t *entry);
+  ll_entry_t *new_entry(const void *record, u32 size, u32 tag) const;
+  bool settle(bool added, ll_entry_t *entry) const;
+  bool add_to_back(ll_entry_t *entry);
 
   ll_list_t *list_;
+  entry_arena_t *arena_;
   const site_t &site_;
   const new_entry_texts_t &texts_;
   int line_;
@@ -167,28 +173,17 @@ class untyped_appender_t {
 template <typename record_t>
 class appender_t : public untyped_appender_t {
  public:
-  explicit appender_t(ll_list_t *list, const site_t &site, const new_entry_texts_t &texts = new_entry_texts,
-                      int line = __builtin_LINE())
-      : untyped_appender_t(list, site, texts, line) {}
+  appender_t(ll_list_t *list, entry_arena_t *arena, const site_t &site,
+             const new_entry_texts_t &texts = new_entry_texts, int line = __builtin_LINE())
+      : untyped_appender_t(list, arena, site, texts, line) {}
 
   [[nodiscard]] bool append(const record_t &record) {
     return untyped_appender_t::append(&record, sizeof record, element_tag<record_t>);
   }
+  /// Puts the record before the others. kept: a failure has the words for the back of the list.
+  [[nodiscard]] bool prepend(const record_t &record) {
+    return untyped_appender_t::prepend(&record, sizeof record, element_tag<record_t>);
+  }
 };
-
-/// Appends a copy of @p record to @p list. Failures are reported in the name of @p site.
-template <typename record_t>
-[[nodiscard]] bool append(ll_list_t *list, const record_t &record, const site_t &site, int line = __builtin_LINE()) {
-  return appender_t<record_t>(list, site, new_entry_texts, line).append(record);
-}
-
-[[nodiscard]] bool prepend_untyped(ll_list_t *list, const void *record, u32 size, u32 tag, const site_t &site,
-                                   int line);
-
-/// Puts a copy of @p record before the others. Failures are reported in the name of @p site.
-template <typename record_t>
-[[nodiscard]] bool prepend(ll_list_t *list, const record_t &record, const site_t &site, int line = __builtin_LINE()) {
-  return prepend_untyped(list, &record, sizeof record, element_tag<record_t>, site, line);
-}
 
 }  // namespace edid_composer

@@ -16,6 +16,8 @@ inline bool is_chosen(const compose_decision_t &decision) {
 
 class decisions_t {
  public:
+  explicit decisions_t(entry_arena_t *arena) : decisions_(arena) {}
+
   /// Adds a candidate or value. Where there is no memory for it, the decisions stay incomplete.
   compose_decision_t *add(compose_subject subject, u32 code);
   /// The candidate of this code, added once however many name it.

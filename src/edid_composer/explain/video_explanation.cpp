@@ -110,7 +110,7 @@ void nominate_4k_modes(const hdmi_vics_t &vics, compose_origin origin, decisions
 
 void explain_video_modes(const inputs_t &inputs, const video_selection_t &selection, const journal_t &journal,
                          decisions_t *decisions) {
-  const auto &[sink, platform, settings] = inputs;
+  const auto &[sink, platform, settings, arena] = inputs;
   const i32 rate = selection.native_rate.hz;
   nominate_timings<detailed_timing_t>(sink.dtd_list, COMPOSE_ORIGIN_DETAILED_TIMING, journal, decisions);
   nominate_timings<std_timing_t>(sink.std_timings, COMPOSE_ORIGIN_STANDARD_TIMING, journal, decisions);

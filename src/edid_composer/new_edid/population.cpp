@@ -3,6 +3,7 @@
 #include <cstring>
 
 #include "edid_composer/new_edid/video_descriptors.h"
+#include "linked_list/linked_list.h"
 #include "text_field.h"
 
 namespace edid_composer {
@@ -64,12 +65,12 @@ void set_chromaticity(const edid_t &sink, edid_t *new_edid) {
   }
 }
 
-bool set_base_timings(const platform_values_t &platform, edid_t *new_edid) {
+bool set_base_timings(const platform_values_t &platform, edid_t *new_edid, entry_arena_t *arena) {
   constexpr u32 vga_60 = 0x20;
   new_edid->est_timings_1 = platform.established_timings_1 | vga_60;
   new_edid->est_timings_2 = platform.established_timings_2;
   new_edid->man_timings = platform.manufacturer_timings;
-  return ll_copy_list(&platform.std_timings, &new_edid->std_timings, sizeof(std_timing_t));
+  return copy_list(&platform.std_timings, &new_edid->std_timings, sizeof(std_timing_t), arena);
 }
 
 void set_extension_flags(const platform_values_t &platform, edid_t *new_edid) {
@@ -133,7 +134,7 @@ void set_speakers(const platform_values_t &platform, edid_t *new_edid) {
 }  // namespace
 
 population_t _populate_new_edid(const inputs_t &inputs, const hdmi_vics_t &modes_4k, edid_t *new_edid) {
-  const auto &[sink, platform, settings] = inputs;
+  const auto &[sink, platform, settings, arena] = inputs;
   population_t population;
   LOG_TRACE("Setting up the new EDID:");
   set_identity(platform, new_edid);
@@ -146,7 +147,7 @@ population_t _populate_new_edid(const inputs_t &inputs, const hdmi_vics_t &modes
   set_4k_modes(modes_4k, new_edid);
   set_display(new_edid);
   set_chromaticity(sink, new_edid);
-  if (!set_base_timings(platform, new_edid)) return population;
+  if (!set_base_timings(platform, new_edid, arena)) return population;
   set_extension_flags(platform, new_edid);
   population.physical_address = place_input(inputs);
   std::memcpy(new_edid->physical_address, population.physical_address.parts, sizeof new_edid->physical_address);
@@ -158,9 +159,9 @@ population_t _populate_new_edid(const inputs_t &inputs, const hdmi_vics_t &modes
   set_speakers(platform, new_edid);
 
   population.modes_before_padding = static_cast<i32>(new_edid->video_list.size);
-  if (!pad_video_modes(&new_edid->video_list)) return population;
+  if (!pad_video_modes(&new_edid->video_list, arena)) return population;
   trace_video_modes(&new_edid->video_list);
-  if (!add_detailed_timings(new_edid->video_list, &new_edid->dtd_list)) return population;
+  if (!add_detailed_timings(new_edid->video_list, &new_edid->dtd_list, arena)) return population;
   LOG_TRACE("\tEncoding the VIC list up to 31 modes. Total:%d", new_edid->video_list.size);
   new_edid->hdmi_video_present = new_edid->hdmi_3d_present != 0 || new_edid->hdmi_vic_len != 0;
   new_edid->xvycc601 = tri_state(platform.xvYCC601, sink.xvycc601);

@@ -11,8 +11,8 @@ REPORTS_AS(_populate_new_edid);
 
 }  // namespace
 
-bool pad_video_modes(ll_list_t *modes) {
-  appender_t<short_video_desc_t> padding(modes, site);
+bool pad_video_modes(ll_list_t *modes, entry_arena_t *arena) {
+  appender_t<short_video_desc_t> padding(modes, arena, site);
   for (auto size = static_cast<i32>(modes->size); size < fewest_modes; ++size) {
     LOG_ERROR(
         "The number of video formats to be encoded is less than 4! Padding until 4 is reached. Check the platform "
@@ -23,9 +23,9 @@ bool pad_video_modes(ll_list_t *modes) {
   return true;
 }
 
-bool add_detailed_timings(const ll_list_t &modes, ll_list_t *timings) {
+bool add_detailed_timings(const ll_list_t &modes, ll_list_t *timings, entry_arena_t *arena) {
   constexpr i32 most = 2;
-  appender_t<detailed_timing_t> added(timings, site);
+  appender_t<detailed_timing_t> added(timings, arena, site);
   for (const auto &mode : elements<const short_video_desc_t>(modes.head)) {
     if (timings->size == most) break;
     LOG_TRACE("\t\tVIC:%d %s", mode.vic, short_video_timing_string(mode.vic));

@@ -58,11 +58,11 @@ void _get_est_timing_callback(const configuration_entry_t &entry, u32 *mask) {
 
 }  // namespace
 
-void _get_platform_list(platform_list_type type, ll_list_t *list) {
+void _get_platform_list(platform_list_type type, ll_list_t *list, entry_arena_t *arena) {
   REPORTS_AS(_get_platform_list);
   const video_list_t &row = video_lists[type];
   LOG_TRACE("Reading %dHz %s list from platform config.", row.rate, row.use);
-  appender_t<short_video_desc_t> modes = video_mode_appender(list);
+  appender_t<short_video_desc_t> modes = video_mode_appender(list, arena);
   for (const configuration_entry_t &entry : _get_generic_platform_list(row.name, entry_kind_t::text))
     _get_vic_list_callback(entry, &modes);
   if (ll_size(list) == 0) {
@@ -84,9 +84,9 @@ void _get_est_timing_list(const char *list_name, u32 *mask) {
     _get_est_timing_callback(entry, mask);
 }
 
-void _get_std_timing_list(ll_list_t *list) {
+void _get_std_timing_list(ll_list_t *list, entry_arena_t *arena) {
   for (const configuration_entry_t &entry : _get_generic_platform_list("standard_timings", entry_kind_t::text))
-    _get_std_timing_callback(entry, list);
+    _get_std_timing_callback(entry, list, arena);
 }
 
 }  // namespace edid_composer

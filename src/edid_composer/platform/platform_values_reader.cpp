@@ -86,8 +86,8 @@ void read_settings(platform_values_t *values) {
   settle_week(values);
 }
 
-bool read_audio_entries(platform_values_t *values) {
-  appender_t<i32> entries(&values->audio_list, site);
+bool read_audio_entries(platform_values_t *values, entry_arena_t *arena) {
+  appender_t<i32> entries(&values->audio_list, arena, site);
   char path[] = CONFIGURATION_DOMAIN "audio.entry_?";
   for (char letter = 'a'; letter <= 'z'; ++letter) {
     path[sizeof path - 2] = letter;
@@ -98,12 +98,12 @@ bool read_audio_entries(platform_values_t *values) {
   return true;
 }
 
-void read_mode_lists(platform_values_t *values) {
+void read_mode_lists(platform_values_t *values, entry_arena_t *arena) {
   // An empty list has been reported by then, and is tolerated.
-  _get_platform_list(list_50_priority, &values->video_50_priority);
-  _get_platform_list(list_50_additional, &values->video_50_additional);
-  _get_platform_list(list_60_priority, &values->video_60_priority);
-  _get_platform_list(list_60_additional, &values->video_60_additional);
+  _get_platform_list(list_50_priority, &values->video_50_priority, arena);
+  _get_platform_list(list_50_additional, &values->video_50_additional, arena);
+  _get_platform_list(list_60_priority, &values->video_60_priority, arena);
+  _get_platform_list(list_60_additional, &values->video_60_additional, arena);
   _get_4k_x_2k_modes("4k_x_2k_priority_list", values->modes_4k_x_2k_priority);
   _get_4k_x_2k_modes("4k_x_2k_addition_list", values->modes_4k_x_2k_addition);
 }
@@ -119,21 +119,21 @@ void read_texts(platform_values_t *values) {
   read_text("monitor_serial", values->monitor_serial, "");
 }
 
-void read_timings(platform_values_t *values) {
+void read_timings(platform_values_t *values, entry_arena_t *arena) {
   _get_est_timing_list("established_timings_1", &values->established_timings_1);
   _get_est_timing_list("established_timings_2", &values->established_timings_2);
   _get_est_timing_list("manufacturer_timings", &values->manufacturer_timings);
-  _get_std_timing_list(&values->std_timings);
+  _get_std_timing_list(&values->std_timings, arena);
 }
 
 }  // namespace
 
-bool _read_platform_values(platform_values_t *values) {
+bool _read_platform_values(platform_values_t *values, entry_arena_t *arena) {
   read_settings(values);
-  if (!read_audio_entries(values)) return false;
-  read_mode_lists(values);
+  if (!read_audio_entries(values, arena)) return false;
+  read_mode_lists(values, arena);
   read_texts(values);
-  read_timings(values);
+  read_timings(values, arena);
   return true;
 }
 

@@ -36,7 +36,7 @@ class number_cutter_t {
 
 }  // namespace
 
-bool _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *timings) {
+bool _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *timings, entry_arena_t *arena) {
   REPORTS_AS(_get_std_timing_callback);
   constexpr i32 width_unit = 8;
   constexpr i32 lowest_refresh = 60;
@@ -74,7 +74,7 @@ bool _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *tim
   }
   const std_timing_t timing{
       .h_active = static_cast<u32>(width), .aspect_ratio = ratio, .refresh_rate = static_cast<u32>(refresh)};
-  return append(timings, timing, site);
+  return appender_t<std_timing_t>(timings, arena, site).append(timing);
 }
 
 }  // namespace edid_composer

@@ -3,10 +3,11 @@
 #pragma once
 
 #include "edid_composer/platform/configuration_list.h"
+#include "linked_list/entry_arena.h"
 
 namespace edid_composer {
 
 /// Appends the standard timing of an entry; false, with a report, when it is none.
-bool _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *timings);
+bool _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *timings, entry_arena_t *arena);
 
 }  // namespace edid_composer

@@ -80,9 +80,9 @@ bool _get_vic_list_callback(const configuration_entry_t &entry, appender_t<short
   return true;
 }
 
-appender_t<short_video_desc_t> video_mode_appender(ll_list_t *modes) {
+appender_t<short_video_desc_t> video_mode_appender(ll_list_t *modes, entry_arena_t *arena) {
   REPORTS_AS(_get_vic_list_callback);
-  return appender_t<short_video_desc_t>(modes, site);
+  return appender_t<short_video_desc_t>(modes, arena, site);
 }
 
 }  // namespace edid_composer

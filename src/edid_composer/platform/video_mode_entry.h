@@ -21,6 +21,6 @@ int _scan_video_mode(const char *text, video_mode_words_t *words);
 /// Appends the mode of an entry; false, with a report, when it is none.
 bool _get_vic_list_callback(const configuration_entry_t &entry, appender_t<short_video_desc_t> *modes);
 
-appender_t<short_video_desc_t> video_mode_appender(ll_list_t *modes);
+appender_t<short_video_desc_t> video_mode_appender(ll_list_t *modes, entry_arena_t *arena);
 
 }  // namespace edid_composer

@@ -90,7 +90,7 @@ void note(compose_origin origin, i32 index, const format_outcome_t &outcome, jou
 
 bool add_platform_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *journal) {
   const platform_values_t *const platform_values = &inputs.platform;
-  appender_t<short_audio_desc_t> chosen(formats, site);
+  appender_t<short_audio_desc_t> chosen(formats, inputs.arena, site);
   i32 index = 0;
   LOG_TRACE("\tReading the platform audio modes:");
   for (const auto &value : walk<const i32>(LIST(&platform_values->audio_list))) {
@@ -103,7 +103,7 @@ bool add_platform_formats(const inputs_t &inputs, ll_list_t *formats, journal_t 
 
 bool add_sink_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *journal) {
   const edid_t *const edid = &inputs.sink;
-  appender_t<short_audio_desc_t> chosen(formats, site);
+  appender_t<short_audio_desc_t> chosen(formats, inputs.arena, site);
   i32 index = 0;
   LOG_TRACE("\tExamining downstream audio formats:");
   for (const auto &audio : walk<const short_audio_desc_t>(LIST(&edid->audio_list))) {
@@ -115,9 +115,9 @@ bool add_sink_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *jou
 }
 
 /// The formats after the first, from the last on.
-void trace_backwards(const ll_list_t &formats) {
+void trace_backwards(const ll_list_t &formats, entry_arena_t *arena) {
   REPORTS_AS(_filter_audio_list_with_mask);
-  record_blocks_t<const short_audio_desc_t *> after_first;
+  record_blocks_t<const short_audio_desc_t *> after_first(arena);
   bool is_first = true;
   for (const auto &audio : elements<const short_audio_desc_t>(formats.head)) {
     if (!is_first) static_cast<void>(after_first.add(&audio, site));
@@ -129,7 +129,7 @@ void trace_backwards(const ll_list_t &formats) {
   });
 }
 
-bool ensure_basic_audio(ll_list_t *formats, journal_t *journal) {
+bool ensure_basic_audio(ll_list_t *formats, entry_arena_t *arena, journal_t *journal) {
   for (const auto &audio : walk<const short_audio_desc_t>(LIST(formats))) {
     LOG_TRACE("\tEntry:%d Channels:%d", audio.type, audio.channels);
     if (is_basic_audio(audio)) {
@@ -145,7 +145,7 @@ bool ensure_basic_audio(ll_list_t *formats, journal_t *journal) {
                                      .max_bitrate = 0,
                                      .value = 0,
                                      .wma_profile = 0};
-  if (!prepend(formats, basic, site)) return false;
+  if (!appender_t<short_audio_desc_t>(formats, arena, site).prepend(basic)) return false;
   journal->note({.subject = COMPOSE_SUBJECT_AUDIO_FORMAT,
                  .origin = COMPOSE_ORIGIN_LIBRARY,
                  .code = basic.type,
@@ -172,17 +172,17 @@ bool _filter_audio_formats(const inputs_t &inputs, ll_list_t *formats, journal_t
   if (pass_through > platform_only && !add_sink_formats(inputs, formats, journal)) return false;
   u32 mask = inputs.settings.audio_mask;
   if (sink_filter) mask &= _create_audio_mask(&inputs.sink.audio_list);
-  _filter_audio_list_with_mask(formats, mask, journal);
-  return ensure_basic_audio(formats, journal);
+  _filter_audio_list_with_mask(formats, mask, inputs.arena, journal);
+  return ensure_basic_audio(formats, inputs.arena, journal);
 }
 
-void _filter_audio_list_with_mask(ll_list_t *formats, u32 mask, journal_t *journal) {
+void _filter_audio_list_with_mask(ll_list_t *formats, u32 mask, entry_arena_t *arena, journal_t *journal) {
   REPORTS_AS(_filter_audio_list_with_mask);
   LOG_TRACE("\tMask:0x%08X", mask);
   LOG_TRACE("%s() - Printing reverse formats\n", site.operation);
-  if (is_tracing()) trace_backwards(*formats);
+  if (is_tracing()) trace_backwards(*formats, arena);
   // kept: the first format is never examined.
-  delete_elements<short_audio_desc_t>(formats, 1, [&](i32 place, const short_audio_desc_t &audio) {
+  unlink_elements<short_audio_desc_t>(formats, 1, [&](i32 place, const short_audio_desc_t &audio) {
     const u32 bit = _audio_type_to_audio_mask(audio.type);
     if ((bit & mask) != 0) return false;
     journal->note({.subject = COMPOSE_SUBJECT_AUDIO_FORMAT,

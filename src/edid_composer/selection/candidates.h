@@ -23,7 +23,7 @@ struct match_t {
 class candidates_t {
  public:
   /// Only @p ordered candidates can be listed and removed.
-  explicit candidates_t(bool ordered) : ordered_(ordered) {}
+  candidates_t(bool ordered, entry_arena_t *arena) : ordered_(ordered), list_(arena) {}
 
   /// False, reported in the name of @p site, when there is no memory for it.
   [[nodiscard]] bool add(const candidate_t &candidate, const site_t &site, int line = __builtin_LINE());

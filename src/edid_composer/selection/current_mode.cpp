@@ -10,17 +10,17 @@ REPORTS_AS(_filter_video_modes);
 
 void delete_first(u32 vic, ll_list_t *modes) {
   bool deleted = false;
-  delete_elements<short_video_desc_t>(modes, 0, [&](i32, const short_video_desc_t &mode) {
+  unlink_elements<short_video_desc_t>(modes, 0, [&](i32, const short_video_desc_t &mode) {
     if (deleted || mode.vic != vic) return false;
     deleted = true;
     return true;
   });
 }
 
-bool put_first(u32 vic, ll_list_t *modes) {
+bool put_first(u32 vic, ll_list_t *modes, entry_arena_t *arena) {
   delete_first(vic, modes);
   LOG_TRACE("\tAdding hdmi output mode as the priority mode:%s", short_video_timing_string(vic));
-  return prepend(modes, short_video_desc_t{.native = 0, .vic = vic, .stereo = 0}, site);
+  return appender_t<short_video_desc_t>(modes, arena, site).prepend({.native = 0, .vic = vic, .stereo = 0});
 }
 
 }  // namespace
@@ -37,7 +37,7 @@ current_mode_t put_current_mode_first(const inputs_t &inputs, ll_list_t *modes) 
     LOG_ERROR("Could not obtain a valid hdmi mode. Continuing.");
     return {true, COMPOSE_REASON_CURRENT_MODE_WITHOUT_VIC, 0};
   }
-  return {put_first(vic, modes), COMPOSE_REASON_CURRENT_MODE_FIRST, vic};
+  return {put_first(vic, modes, inputs.arena), COMPOSE_REASON_CURRENT_MODE_FIRST, vic};
 }
 
 bool _valid_current_mode(const video_mode_t &mode) {

@@ -52,7 +52,8 @@ bool add_platform_modes(i32 rate, const platform_values_t &platform, candidates_
 
 // 2. What of it the platform offers.
 
-bool prioritize(const ll_list_t *list, const candidates_t &candidates, ll_list_t *modes, journal_t *journal) {
+bool prioritize(const ll_list_t *list, const candidates_t &candidates, appender_t<short_video_desc_t> selected,
+                journal_t *journal) {
   if (is_tracing()) {
     log_trace(site, __LINE__, "\tPrioritization List:");
     for (const auto &video : walk<const short_video_desc_t>(LIST(list)))
@@ -60,7 +61,6 @@ bool prioritize(const ll_list_t *list, const candidates_t &candidates, ll_list_t
     log_trace(site, __LINE__, "Prioritize the list of valid modes and remove duplicates. Modes:%d MasterList:%d",
               candidates.size(), ll_size(list));
   }
-  appender_t<short_video_desc_t> selected(modes, site);
   for (const auto &wanted : walk<const short_video_desc_t>(LIST(list))) {
     const match_t match = candidates.match(wanted);
     if (!match.found) continue;
@@ -77,14 +77,15 @@ bool prioritize(const ll_list_t *list, const candidates_t &candidates, ll_list_t
 video_selection_t _filter_video_modes(const inputs_t &inputs, ll_list_t *modes, journal_t *journal) {
   const platform_values_t &platform = inputs.platform;
   video_selection_t selection;
-  candidates_t candidates(is_tracing() || platform.geometry_limit != 0);
+  candidates_t candidates(is_tracing() || platform.geometry_limit != 0, inputs.arena);
   if (!add_sink_modes(&inputs.sink, &candidates, journal)) return selection;
   selection.native_rate = _determine_tv_native_refresh_rate(inputs);
   const i32 rate = selection.native_rate.hz;
   if (!add_platform_modes(rate, platform, &candidates)) return selection;
   selection.geometry_limit = limit_geometry(inputs, &candidates, journal);
   const ll_list_t *const list = rate == 60 ? &platform.video_60_priority : &platform.video_50_priority;
-  if (!prioritize(list, candidates, modes, journal)) return selection;
+  if (!prioritize(list, candidates, appender_t<short_video_desc_t>(modes, inputs.arena, site), journal))
+    return selection;
   selection.current_mode = put_current_mode_first(inputs, modes);
   selection.complete = selection.current_mode.complete;
   if (selection.complete && is_tracing()) {
