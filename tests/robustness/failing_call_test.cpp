@@ -4,7 +4,6 @@
 
 #include <array>
 #include <optional>
-#include <regex>
 #include <string>
 #include <vector>
 
@@ -12,6 +11,7 @@
 #include "failing_call.h"
 #include "support/allocation_ledger.h"
 #include "support/output_capture.h"
+#include "support/patterns.h"
 
 namespace robustness {
 namespace {
@@ -81,8 +81,7 @@ const std::array<std::string, 6> platform_lists{"audio_list",        "video_50_p
 
 // The computed magic of a list depends on where it lies.
 std::string without_magic(const std::string &text) {
-  static const std::regex magic(R"( Magic:-?[0-9]+ )");
-  return std::regex_replace(text, magic, " Magic:M ");
+  return test_support::replaced(text, " Magic:-?[0-9]+ ", " Magic:M ");
 }
 
 class FailingCall : public testing::Test {
@@ -134,13 +133,12 @@ class FailingCall : public testing::Test {
 
   template <typename capture_t>
   std::vector<outcome_t> outcomes(operation_name_t operation, const capture_t &capture) {
-    static const std::regex number("[0-9]+");
     std::vector<outcome_t> result;
     std::string last;
     for (int nth = 1;; ++nth) {
       const std::optional<outcome_t> outcome = outcome_of(operation, nth, capture);
       if (!outcome) return result;
-      const std::string kind = std::regex_replace(outcome->lines, number, "#") + outcome->result;
+      const std::string kind = test_support::replaced(outcome->lines, "[0-9]+", "#") + outcome->result;
       if (kind != last) result.push_back(*outcome);
       last = kind;
     }
