@@ -9,7 +9,7 @@
 namespace test_support {
 namespace {
 
-constexpr std::size_t most_groups = 10;
+constexpr std::size_t most_groups = 16;
 using places_t = std::array<regmatch_t, most_groups>;
 
 class expression_t {
