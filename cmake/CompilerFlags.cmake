@@ -12,11 +12,6 @@ if(EDID_COMPOSER_SANITIZE)
   add_link_options(-fsanitize=address,undefined)
 endif()
 
-if(EDID_COMPOSER_SANITIZE_THREAD)
-  add_compile_options(-fsanitize=thread -fno-omit-frame-pointer)
-  add_link_options(-fsanitize=thread)
-endif()
-
 if(EDID_COMPOSER_FUZZ)
   add_compile_options(-fsanitize=fuzzer-no-link)
 endif()
@@ -36,8 +31,10 @@ target_compile_options(
             -fno-align-functions
             -fno-align-loops
             -fno-align-jumps>)
-if(NOT EDID_COMPOSER_SANITIZE AND NOT EDID_COMPOSER_SANITIZE_THREAD)
-  target_compile_options(edid_composer_library_flags INTERFACE $<$<NOT:$<CONFIG:Debug>>:-U_FORTIFY_SOURCE
-                                                               -D_FORTIFY_SOURCE=2>)
+if(NOT EDID_COMPOSER_SANITIZE)
+  target_compile_options(
+    edid_composer_library_flags
+    INTERFACE $<$<NOT:$<OR:$<CONFIG:Debug>,$<BOOL:$<TARGET_PROPERTY:INSTRUMENTED>>>>:-U_FORTIFY_SOURCE
+              -D_FORTIFY_SOURCE=2>)
 endif()
 target_link_libraries(edid_composer_library_flags INTERFACE edid_composer_warnings)

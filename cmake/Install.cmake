@@ -68,11 +68,9 @@ if(EDID_COMPOSER_HOST)
   set_target_properties(edid_composer_cli PROPERTIES INSTALL_RPATH "$ORIGIN/${library_place}")
   install(TARGETS edid_composer_cli RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR} COMPONENT tools)
   install_manual(edid-composer.1 1 tools)
-  if(EXISTS ${PROJECT_SOURCE_DIR}/completions/edid-composer.bash)
-    install(
-      FILES completions/edid-composer.bash
-      DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions
-      RENAME edid-composer
-      COMPONENT tools)
-  endif()
+  install(
+    FILES completions/edid-composer.bash
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions
+    RENAME edid-composer
+    COMPONENT tools)
 endif()

@@ -1,7 +1,14 @@
 # shellcheck shell=sh
 # Sourced by the scripts beside it: installs the Debian packages that they need.
+#
+# With --no-install as first argument of a script, a missing package ends it.
+no_install=''
+if [ "${1:-}" = --no-install ]; then
+  no_install=--no-install
+  shift
+fi
 
-# install_packages PACKAGE...: installs those that are missing, with apt-get, as root or through sudo.
+# install_packages PACKAGE...: installs those that are missing, as root or through sudo; prints which and how before.
 install_packages() {
   missing=''
   for package in "$@"; do
@@ -15,13 +22,19 @@ install_packages() {
 
   as_root=''
   if [ "$(id -u)" -ne 0 ]; then
-    if ! command -v sudo >/dev/null; then
-      echo "Missing packages:$missing. Install them as root, or install sudo." >&2
-      return 1
-    fi
-    as_root='sudo'
+    as_root='sudo '
   fi
-  echo "Installing$missing; may take 3 minutes."
+  echo "Missing packages:$missing"
+  echo "To install them: ${as_root}apt-get install --no-install-recommends$missing"
+  if [ -n "$no_install" ]; then
+    echo 'Nothing was installed, as --no-install was given.' >&2
+    return 1
+  fi
+  if [ -n "$as_root" ] && ! command -v sudo >/dev/null; then
+    echo 'Run that as root, or install sudo.' >&2
+    return 1
+  fi
+  echo 'Installing them now.'
   # Word splitting is wanted: one word for each package.
   # shellcheck disable=SC2086
   $as_root apt-get update -qq &&

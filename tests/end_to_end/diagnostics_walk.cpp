@@ -2,10 +2,10 @@
 
 #include <cstdio>
 #include <ostream>
-#include <regex>
 #include <utility>
 
 #include "support/output_capture.h"
+#include "support/patterns.h"
 
 namespace diagnostics_walk {
 namespace {
@@ -46,12 +46,9 @@ row_t trace(const std::string &function, const std::string &message, std::functi
 }
 
 std::string name_of(const testing::TestParamInfo<row_t> &row) {
-  static const std::regex function(R"((\w+)\(\))");
-  std::smatch match;
-  std::regex_search(row.param.line, match, function);
   char position[16];
   std::snprintf(position, sizeof position, "%03zu_", row.index);
-  return position + match.str(1);
+  return position + test_support::first_match(row.param.line, "(\\w+)\\(\\)").at(1);
 }
 
 void PrintTo(const row_t &row, std::ostream *stream) {

@@ -1,13 +1,13 @@
 // A platform that offers more than an EDID can hold.
 #include <gtest/gtest.h>
 
-#include <regex>
 #include <string>
 
 #include "composition.h"
 #include "support/configuration_tree.h"
 #include "support/hex_text.h"
 #include "support/output_capture.h"
+#include "support/patterns.h"
 #include "support/records.h"
 
 namespace {
@@ -125,8 +125,8 @@ TEST_F(FullComposition, SaysWhatWasLeftOut) {
                                  "Max:10 Requested:23");
   ASSERT_EQ(output.substr(0, warnings.size()), warnings);
   // Header 4, data blocks 154 - 4 + 4, detailed timing 18, serial number 18: 194 bytes.
-  const std::regex overflow(R"(edid_decode_encode:N:encode_edid\(\) ERROR: [^\n]*\b194\b[^\n]*\b127\b[^\n]*\n)");
-  EXPECT_TRUE(std::regex_match(output.substr(warnings.size()), overflow)) << output;
+  const char *const overflow = "edid_decode_encode:N:encode_edid\\(\\) ERROR: .*\\b194\\b.*\\b127\\b.*\n";
+  EXPECT_TRUE(test_support::matches(output.substr(warnings.size()), overflow)) << output;
 }
 
 TEST_F(FullComposition, IsTracedAsIfEverythingFitted) {

@@ -39,9 +39,7 @@ std::string report_of(const golden_case_t &golden_case, const std::vector<u8> &e
 }
 
 std::string hex_of(const golden_case_t &golden_case, const composition_t &composition) {
-  return format("# What the platform \"%s\" shows for the sink \"%s\".\n", golden_case.platform, golden_case.sink) +
-         "# " + golden_case.settings() + "\n" +
-         format("# The physical address stands at byte %u.\n\n", composition.address_offset) +
+  return golden_case.heading() + format("# The physical address stands at byte %u.\n\n", composition.address_offset) +
          annotated(composition.edid);
 }
 
@@ -69,7 +67,7 @@ composition_t composed_by(composer_t composer, void *context, const golden_case_
   constexpr u32 edid_size = 256;
   load_platform(golden_case.platform);
   const std::vector<u8> sink =
-      test_support::bytes_of_hex_file((sinks_directory() / (std::string(golden_case.sink) + ".txt")).string());
+      test_support::bytes_of_hex_file((sinks_directory() / (golden_case.sink + ".txt")).string());
   composition_t composition;
   composition.edid.resize(edid_size);
   const compose_cfg_t settings = settings_of(golden_case, &composition.address_offset);

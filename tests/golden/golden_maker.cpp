@@ -1,5 +1,5 @@
 // Writes the goldens anew, into the directory where they are kept or into the one that is named, and removes those of
-// cases that are no more.
+// cases that are no more. A new case needs a file NAME.hex with its first two lines.
 #include <cstdio>
 #include <exception>
 #include <filesystem>

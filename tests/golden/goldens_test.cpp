@@ -5,6 +5,7 @@
 #include <filesystem>
 #include <ostream>
 #include <set>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
@@ -102,6 +103,12 @@ TEST(GoldenDirectory, HoldsNothingElse) {
       expected.insert(name);
   }
   EXPECT_EQ(names_in(golden::golden_directory()), expected);
+}
+
+TEST(GoldenCases, BeginWithWhatTheyAreMadeFrom) {
+  for (const golden_case_t &golden_case : golden::golden_cases())
+    EXPECT_EQ(golden::case_of(golden_case.heading()).heading(), golden_case.heading());
+  EXPECT_THROW(golden::case_of("# What the platform shows\n00 FF\n"), std::runtime_error);
 }
 
 TEST(GoldenCases, AreEverySampleSinkBehindEveryPlatform) {

@@ -16,10 +16,10 @@ def cmake_targets(name, libdir, build_type):
     return {f"{folder}/{name}-targets.cmake", f"{folder}/{name}-targets-{build_type.lower()}.cmake"}
 
 
-def installed(libdir, build_type, has_completion):
+def installed(libdir, build_type):
     """The paths of each component, below the prefix."""
     package = f"{libdir}/cmake/edid_composer/edid_composer-config"
-    completion = {"share/bash-completion/completions/edid-composer"} if has_completion else set()
+    completion = {"share/bash-completion/completions/edid-composer"}
     return {
         "runtime": shared_library("edid_composer", libdir),
         "development": {

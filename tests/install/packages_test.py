@@ -63,7 +63,7 @@ class Packages(scratch.ScratchTest):
 
     def test_each_holds_its_component_and_its_licence(self):
         # Packages are installed in /usr/lib, whatever the build's own prefix.
-        expected = contents.installed(os.environ["LIBDIR"], os.environ["BUILD_TYPE"], self.has_completion)
+        expected = contents.installed(os.environ["LIBDIR"], os.environ["BUILD_TYPE"])
         for component in contents.COMPONENTS:
             with self.subTest(component=component):
                 files = {re.sub(r"(/man/man\d/.*)", r"\1.gz", f"usr/{path}") for path in expected[component]}

@@ -43,7 +43,6 @@ class ScratchTest(unittest.TestCase):
     source = pathlib.Path(os.environ["SOURCE_DIR"])
     build = pathlib.Path(os.environ["BUILD_DIR"])
     libdir = os.environ["LIBDIR"]
-    has_completion = bool(os.environ["HAS_COMPLETION"])
 
     @classmethod
     def setUpClass(cls):

@@ -27,6 +27,9 @@ codec_test::fields_t fields_of(const plain_record_t &record);
 /// A record that the encoder accepts: two detailed timings, every field within the range that its documentation gives.
 plain_record_t random_record(random_source_t &random);
 
+/// A record as the decoder makes one: every field has a value that its bytes can hold, and all of it fits.
+plain_record_t random_canonical_record(random_source_t &random);
+
 /// A timing that fits its descriptor, with a pixel clock that is not a multiple of 10 kHz.
 detailed_timing_t random_timing(random_source_t &random);
 

@@ -111,6 +111,57 @@ u32 random_count(random_source_t &random, u32 few, u32 many) {
   return random.chance(85) ? random.between(1, few) : random.between(few, many);
 }
 
+/// A text of which no character is lost.
+std::string canonical_text(random_source_t &random, u32 longest) {
+  std::string text(random.between(2, longest), '\0');
+  for (char &character : text)
+    character = static_cast<char>(random.between('!', '~'));
+  return text;
+}
+
+void make_base_block_canonical(random_source_t &random, edid_t *edid) {
+  edid->valid = edid->digital = edid->extension_count = 1;
+  for (std::size_t i = 0; i < 3; ++i)
+    edid->manufacturer[i] = static_cast<char>(random.between('A', 'Z'));
+  for (u8 edid_t::*size_or_rate : {&edid_t::h_size_cm, &edid_t::v_size_cm, &edid_t::min_v_rate, &edid_t::max_v_rate,
+                                   &edid_t::min_h_rate, &edid_t::max_h_rate}) {
+    edid->*size_or_rate = static_cast<u8>(random.between(1, 255));
+  }
+  edid->max_pixel_clock = 10 * random.between(1, 255);
+  set_text(edid->monitor_name, canonical_text(random, 13));
+  set_text(edid->serial_string, canonical_text(random, 12));  // A full one is followed by what reads as a timing.
+  set_text(edid->data_string, "");
+}
+
+void make_extension_canonical(random_source_t &random, edid_t *edid) {
+  edid->basic_audio = edid->ycbcr_444 = edid->ycbcr_422 = edid->hdmi_present = 1;
+  for (u8 &component : edid->physical_address)
+    component &= 15;
+  edid->max_tmds_clock = 5 * random.between(0, 255);
+  // Without interlaced latencies, the progressive ones stand for both.
+  const bool has_interlaced = random.chance(50);
+  edid->video_latency = static_cast<u16>(2 * random.between(0, 250));
+  edid->audio_latency = static_cast<u16>(2 * random.between(0, 250));
+  edid->i_video_latency = has_interlaced ? static_cast<u16>(2 * random.between(1, 250)) : edid->video_latency;
+  edid->i_audio_latency = has_interlaced ? static_cast<u16>(2 * random.between(1, 250)) : edid->audio_latency;
+  if (edid->hdmi_video_present == 0) edid->hdmi_3d_present = edid->image_size = 0;
+  edid->hdmi_vic_len = edid->hdmi_video_present == 0 ? u8{0} : static_cast<u8>(random.between(0, 3));
+  for (u32 i = 0; i < 7; ++i)
+    edid->hdmi_vic[i] = i < edid->hdmi_vic_len ? random.between(1, 127) : 0;
+}
+
+/// Some modes have 3D structures, no more than there is room for.
+std::vector<short_video_desc_t> canonical_modes(random_source_t &random, bool with_3d) {
+  std::vector<short_video_desc_t> modes;
+  for (u32 i = random.between(1, 20); i > 0; --i)
+    modes.push_back({random.flag(), random.between(40, 60), 0});  // None that 3D is mandatory for.
+  modes.front().native = 1;
+  if (!with_3d) return modes;
+  for (std::size_t i = 0; i < modes.size() && i < 4; ++i)
+    modes[i].stereo = random.one_of(std::array<u32, 4>{0, 0x01, 0x40, 0x80});
+  return modes;
+}
+
 }  // namespace
 
 detailed_timing_t random_timing(random_source_t &random) {
@@ -156,6 +207,25 @@ plain_record_t random_record(random_source_t &random) {
     record.video.push_back(random_video(random, percent_3d));
   for (u32 i = random_count(random, 5, 14); i > 0; --i)
     record.audio.push_back(random_audio(random));
+  return record;
+}
+
+plain_record_t random_canonical_record(random_source_t &random) {
+  plain_record_t record = random_record(random);
+  make_base_block_canonical(random, &record.scalars);
+  make_extension_canonical(random, &record.scalars);
+  record.std_timings.clear();
+  for (u32 i = random.between(0, 8); i > 0; --i)
+    record.std_timings.push_back({8 * random.between(33, 286), random.between(0, 3), random.between(60, 123)});
+  for (detailed_timing_t &timing : record.timings) {
+    timing.pixel_clock -= timing.pixel_clock % 10000;
+    timing.stereo = 0;
+  }
+  record.video = canonical_modes(random, record.scalars.hdmi_3d_present != 0);
+  record.audio.resize(std::min<std::size_t>(record.audio.size(), 4));
+  if (record.audio.empty()) record.audio.push_back({1, 2, 7, 5, 0, 0, 0});
+  for (short_audio_desc_t &audio : record.audio)
+    audio.max_bitrate -= audio.max_bitrate % 8;
   return record;
 }
 

@@ -1,10 +1,9 @@
 // A composition when memory runs out at any of its allocations.
 #include <gtest/gtest.h>
 
-#include <regex>
-
 #include "composition_table.h"
 #include "support/output_capture.h"
+#include "support/patterns.h"
 
 namespace robustness {
 namespace {
@@ -15,8 +14,7 @@ using test_support::output_of;
 
 // The computed magic of a list depends on where it lies.
 std::string without_magic(const std::string &text) {
-  static const std::regex magic(R"( Magic:-?[0-9]+ )");
-  return std::regex_replace(text, magic, " Magic:M ");
+  return test_support::replaced(text, " Magic:-?[0-9]+ ", " Magic:M ");
 }
 
 std::string diagnostics_of(const std::function<void()> &action) {

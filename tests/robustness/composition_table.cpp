@@ -1,10 +1,10 @@
 #include "composition_table.h"
 
 #include <cstdio>
-#include <regex>
 
 #include "support/hex_text.h"
 #include "support/output_capture.h"
+#include "support/patterns.h"
 
 namespace robustness {
 namespace {
@@ -230,10 +230,9 @@ table_t inspecting_stretches(const bytes_t &composed) {
 }
 
 std::string traced_diagnostics_of(const std::function<void()> &action) {
-  static const std::regex diagnostic(R"(\w+:N:\w+\(\) (ERROR|WARNING|BUG): .*)");
   std::string diagnostics;
   for (const std::string &line : test_support::traced_lines_of(action)) {
-    if (std::regex_match(line, diagnostic)) diagnostics += line + "\n";
+    if (test_support::matches(line, "\\w+:N:\\w+\\(\\) (ERROR|WARNING|BUG): .*")) diagnostics += line + "\n";
   }
   return diagnostics;
 }

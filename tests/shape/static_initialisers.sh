@@ -3,7 +3,6 @@
 # Usage: static_initialisers.sh LIBRARY
 . "$(dirname "$0")/reporting.sh"
 library=$1
-skip_with_sanitizers "the sanitizers register every object of the library when it is loaded"
 
 sections=$(readelf -SW "$library" | sed 's/^ *\[ *[0-9]*\] *//') || fail "readelf cannot read $library"
 # Prints address and size of a section, in hexadecimal.

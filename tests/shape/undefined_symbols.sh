@@ -3,7 +3,6 @@
 # Usage: undefined_symbols.sh LIBRARY
 . "$(dirname "$0")/reporting.sh"
 library=$1
-skip_with_sanitizers "the sanitizers' run-time library adds references of its own"
 
 undefined=$(nm -D --undefined-only "$library") || fail "nm cannot read $library"
 host=$(echo "$undefined" | awk '$1 == "U" && $2 !~ /@/ {print $2}' | sort)

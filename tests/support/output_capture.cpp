@@ -5,10 +5,10 @@
 
 #include <array>
 #include <cstdio>
-#include <regex>
 #include <system_error>
 
 #include "edid_composer.h"
+#include "support/patterns.h"
 
 namespace test_support {
 namespace {
@@ -80,15 +80,12 @@ std::string raw_output_of(const std::function<void()> &action) {
 std::string masked(std::string text) {
   // Addresses have more digits than any 32-bit number that is printed in hexadecimal. Under valgrind they have six or
   // seven, as no number has that stands behind a colon or an equals sign but for an audio format's "Val".
-  static const std::regex diagnostic(
-      R"((edid_composer|edid_decode_encode|utility|linked_list):[0-9]+:(\w+\(\) (ERROR|WARNING|BUG): ))");
-  static const std::regex trace(R"(( \t\t\t\w+\(\)):[0-9]+\n)");
-  static const std::regex pointer(R"(0x[0-9a-f]{9,16}\b)");
-  static const std::regex low_pointer(R"(([a-km-z][:=])0x[0-9a-f]{6,7}\b)");
-  text = std::regex_replace(text, diagnostic, "$1:N:$2");
-  text = std::regex_replace(text, trace, "$1:N\n");
-  text = std::regex_replace(text, low_pointer, "$1PTR");
-  return std::regex_replace(text, pointer, "PTR");
+  text =
+      replaced(text, "(edid_composer|edid_decode_encode|utility|linked_list):[0-9]+:(\\w+\\(\\) (ERROR|WARNING|BUG): )",
+               "$1:N:$2");
+  text = replaced(text, "( \t\t\t\\w+\\(\\)):[0-9]+$", "$1:N");
+  text = replaced(text, "([a-km-z][:=])0x[0-9a-f]{6,7}\\b", "$1PTR");
+  return replaced(text, "0x[0-9a-f]{9,16}\\b", "PTR");
 }
 
 std::string output_of(const std::function<void()> &action) {

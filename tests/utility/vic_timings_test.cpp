@@ -4,10 +4,10 @@
 #include <gtest/gtest.h>
 
 #include <cstring>
-#include <regex>
 #include <set>
 
 #include "support/edid_builder.h"
+#include "support/patterns.h"
 #include "utility/utility_lines.h"
 #include "utility/vic_expectations.h"
 
@@ -70,11 +70,10 @@ struct named_facts_t {
 };
 
 named_facts_t facts_in_name(const std::string &name) {
-  static const std::regex pattern(R"((\d+)(?:\((\d+)\))?x(\d+)([pi])(\d+)Hz(4x3|16x9))");
-  std::smatch match;
-  if (!std::regex_match(name, match, pattern)) throw std::invalid_argument(name);
-  const auto number = [&](std::size_t group) { return static_cast<u32>(std::stoul(match[group])); };
-  return {match[2].matched ? number(2) : number(1), number(3), match[4] == "i", number(5), match[6] == "16x9"};
+  const auto part = test_support::first_match(name, "^([0-9]+)(\\(([0-9]+)\\))?x([0-9]+)([pi])([0-9]+)Hz(4x3|16x9)$");
+  if (part.empty()) throw std::invalid_argument(name);
+  const auto number = [&](std::size_t group) { return static_cast<u32>(std::stoul(part[group])); };
+  return {part[3].empty() ? number(1) : number(3), number(4), part[5] == "i", number(6), part[7] == "16x9"};
 }
 
 TEST(VicTimings, AgreeWithTheNamesOfTheirVics) {

@@ -41,7 +41,7 @@ TEST_F(AtomicOutput, AFileThatIsOpenElsewhereKeepsItsContentThere) {
 }
 
 TEST_F(AtomicOutput, ANewFileHasThePermissionsOfTheUsersMask) {
-  process_t process{EDID_COMPOSER_PROGRAM, {"compose", "-o", directory_.path("new.bin")}};
+  process_t process{cli_program(), {"compose", "-o", directory_.path("new.bin")}};
   process.creation_mask = 027;
   ASSERT_EQ(process.run().status, 0);
   EXPECT_EQ(mode_of(directory_.path("new.bin")), 0640U);
@@ -67,14 +67,14 @@ TEST_F(AtomicOutput, AFileNameWithoutAFolderIsWrittenInTheCurrentOne) {
   const process_result_t result = process_t{
       "/bin/sh",
       {"-c", "cd \"$0\" && exec \"$1\" compose -o new.bin", directory_.path(""),
-       EDID_COMPOSER_PROGRAM}}.run();
+       cli_program()}}.run();
   EXPECT_EQ(result.status, 0) << result.error;
   EXPECT_THAT(directory_.names(), ElementsAre("new.bin"));
 }
 
 TEST_F(AtomicOutput, AFailureHalfWayLeavesTheOldContentAndNoTemporaryFile) {
   const std::string path = directory_.write("kept.bin", "old");
-  process_t process{EDID_COMPOSER_PROGRAM, {"compose", "-o", path}};
+  process_t process{cli_program(), {"compose", "-o", path}};
   process.file_size_limit = 200;
   expect_bad_input(process.run(), path + ": cannot write: File too large");
   EXPECT_EQ(content_of(path), "old");

@@ -1,11 +1,17 @@
 #include "cli/cli_fixture.h"
 
 #include <cstdio>
+#include <cstdlib>
 
 namespace host_test {
 
+std::string cli_program() {
+  const char *const other = std::getenv("EDID_COMPOSER");
+  return other == nullptr ? EDID_COMPOSER_PROGRAM : other;
+}
+
 process_result_t run_cli(const std::vector<std::string> &arguments, const std::string &input) {
-  return process_t{EDID_COMPOSER_PROGRAM, arguments, input}.run();
+  return process_t{cli_program(), arguments, input}.run();
 }
 
 std::string sample_sink(const std::string &name) {

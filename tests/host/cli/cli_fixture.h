@@ -12,6 +12,9 @@
 
 namespace host_test {
 
+/// The program under test: that which EDID_COMPOSER in the environment names, else the one built with the tests.
+std::string cli_program();
+
 /// Runs the program.
 process_result_t run_cli(const std::vector<std::string> &arguments, const std::string &input = "");
 

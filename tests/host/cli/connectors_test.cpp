@@ -60,7 +60,7 @@ TEST_F(Connectors, AreListedByNameWithTheirDisplays) {
 }
 
 TEST_F(Connectors, AreFoundThroughTheEnvironmentToo) {
-  process_t process{EDID_COMPOSER_PROGRAM, {"sinks"}};
+  process_t process{cli_program(), {"sinks"}};
   process.environment = {"EDID_COMPOSER_DRM_DIR=" + machine_};
   EXPECT_EQ(process.run().output, run({"sinks"}).output);
 }
@@ -86,7 +86,7 @@ TEST_F(Connectors, StandInPlaceOfFilesInEveryCommand) {
 TEST_F(Connectors, AFileOfThatNameComesFirst) {
   directory_.write("HDMI-A-1", sample_bytes("tv_720p_50hz"));
   process_t shell{"/bin/sh", {"-c", "cd \"$PLACE\" && exec \"$PROGRAM\" print --brief HDMI-A-1"}};
-  shell.environment = {"PLACE=" + directory_.path(""), std::string("PROGRAM=") + EDID_COMPOSER_PROGRAM,
+  shell.environment = {"PLACE=" + directory_.path(""), std::string("PROGRAM=") + cli_program(),
                        "EDID_COMPOSER_DRM_DIR=" + machine_};
   const process_result_t result = shell.run();
   EXPECT_EQ(result.status, 0) << result.error;

@@ -64,7 +64,7 @@ class Examples : public cli_fixture_t {
     for (const char *folder : {"bin", "sinks", "drm/card0-HDMI-A-1", "edids"}) {
       std::filesystem::create_directories(directory_.path(folder));
     }
-    std::filesystem::create_symlink(EDID_COMPOSER_PROGRAM, directory_.path("bin/edid-composer"));
+    std::filesystem::create_symlink(cli_program(), directory_.path("bin/edid-composer"));
     directory_.write("bin/xrandr", "#!/bin/sh\nprintf 'HDMI-1 connected\\n\\tEDID: \\n'\ncat tv.hex\n");
     chmod(directory_.path("bin/xrandr").c_str(), 0700);
     directory_.write("tv.hex", hex_of(sample_bytes("tv_4k"), "") + "\n");

@@ -184,7 +184,7 @@ TEST_F(SeveralSinks, AnEdidThatDoesNotFitTheDiskFailsItsSinkOnly) {
   std::filesystem::create_symlink("/dev/null", edids_ + "/b.bin");
   for (const std::string jobs : {"1", "3"}) {
     terminal_t terminal;
-    process_t process{EDID_COMPOSER_PROGRAM, {"compose", "--sink", sinks_, "-o", edids_, "--jobs", jobs}};
+    process_t process{cli_program(), {"compose", "--sink", sinks_, "-o", edids_, "--jobs", jobs}};
     process.output_file = terminal.name();
     process.file_size_limit = 200;
     EXPECT_EQ(process.run().status, 1);
@@ -210,7 +210,7 @@ TEST_F(SeveralSinks, AMessageWithAnAddressIsCountedOnceWhicheverThreadSaysIt) {
 TEST_F(SeveralSinks, ProgressIsShownOnATerminalOnly) {
   add_samples();
   terminal_t terminal;
-  process_t process{EDID_COMPOSER_PROGRAM, {"compose", "--sink", sinks_, "-o", edids_}};
+  process_t process{cli_program(), {"compose", "--sink", sinks_, "-o", edids_}};
   process.error_file = terminal.name();
   EXPECT_EQ(process.run().output, "composed  5\nfailed    0\n");
   const std::string shown = terminal.content();

@@ -11,7 +11,7 @@ using testing::HasSubstr;
 class StandardStreams : public cli_fixture_t {
  protected:
   process_result_t run_into_full_device(std::vector<std::string> arguments) {
-    process_t process{EDID_COMPOSER_PROGRAM, std::move(arguments)};
+    process_t process{cli_program(), std::move(arguments)};
     process.output_file = "/dev/full";
     return process.run();
   }
