@@ -1,5 +1,6 @@
 #include "edid_composer/selection/audio_formats.h"
 
+#include "edid_composer/selection/audio_mask.h"
 #include "edid_composer/selection/audio_matching.h"
 #include "linked_list/typed_list.h"
 #include "output.h"
@@ -114,21 +115,6 @@ bool add_sink_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *jou
   return true;
 }
 
-/// The formats after the first, from the last on.
-void trace_backwards(const ll_list_t &formats, entry_arena_t *arena) {
-  REPORTS_AS(_filter_audio_list_with_mask);
-  record_blocks_t<const short_audio_desc_t *> after_first(arena);
-  bool is_first = true;
-  for (const auto &audio : elements<const short_audio_desc_t>(formats.head)) {
-    if (!is_first) static_cast<void>(after_first.add(&audio, site));
-    is_first = false;
-  }
-  after_first.visit_backwards([](const short_audio_desc_t *audio) {
-    log_trace(site, __LINE__, "\t\tFormat:");
-    print_audio_structure(audio);
-  });
-}
-
 bool ensure_basic_audio(ll_list_t *formats, entry_arena_t *arena, journal_t *journal) {
   for (const auto &audio : walk<const short_audio_desc_t>(LIST(formats))) {
     LOG_TRACE("\tEntry:%d Channels:%d", audio.type, audio.channels);
@@ -174,23 +160,6 @@ bool _filter_audio_formats(const inputs_t &inputs, ll_list_t *formats, journal_t
   if (sink_filter) mask &= _create_audio_mask(&inputs.sink.audio_list);
   _filter_audio_list_with_mask(formats, mask, inputs.arena, journal);
   return ensure_basic_audio(formats, inputs.arena, journal);
-}
-
-void _filter_audio_list_with_mask(ll_list_t *formats, u32 mask, entry_arena_t *arena, journal_t *journal) {
-  REPORTS_AS(_filter_audio_list_with_mask);
-  LOG_TRACE("\tMask:0x%08X", mask);
-  LOG_TRACE("%s() - Printing reverse formats\n", site.operation);
-  if (is_tracing()) trace_backwards(*formats, arena);
-  // kept: the first format is never examined.
-  unlink_elements<short_audio_desc_t>(formats, 1, [&](i32 place, const short_audio_desc_t &audio) {
-    const u32 bit = _audio_type_to_audio_mask(audio.type);
-    if ((bit & mask) != 0) return false;
-    journal->note({.subject = COMPOSE_SUBJECT_AUDIO_FORMAT,
-                   .index = place,
-                   .reason = bit == 0 ? COMPOSE_REASON_TYPE_WITHOUT_BIT : COMPOSE_REASON_AUDIO_MASK,
-                   .values = bit == 0 ? reason_values(mask) : reason_values(mask, bit)});
-    return true;
-  });
 }
 
 }  // namespace edid_composer

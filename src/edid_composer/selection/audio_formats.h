@@ -16,7 +16,4 @@ enum pass_through_t : i32 {
 /// and basic audio in any case. False when a list entry could not be had.
 bool _filter_audio_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *journal);
 
-/// Takes the formats out whose type is not in @p mask, the first entry excepted.
-void _filter_audio_list_with_mask(ll_list_t *formats, u32 mask, entry_arena_t *arena, journal_t *journal);
-
 }  // namespace edid_composer

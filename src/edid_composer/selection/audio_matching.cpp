@@ -55,21 +55,6 @@ std::optional<short_audio_desc_t> _audio_format_in_downstream_sink(const edid_t 
   return std::nullopt;
 }
 
-u32 _audio_type_to_audio_mask(u32 type) {
-  // Type 15, the extension escape, has no bit: the types after it take the bits that follow type 14's.
-  if (type >= 1 && type <= 14) return 1U << (type - 1);
-  if (type >= 16 && type <= 18) return 1U << (type - 2);
-  return 0;
-}
-
-u32 _create_audio_mask(const ll_list_t *list) {
-  REPORTS_AS(_create_audio_mask);
-  u32 mask = 0;
-  for (const auto &audio : walk<const short_audio_desc_t>(LIST(list)))
-    mask |= _audio_type_to_audio_mask(audio.type);
-  return mask;
-}
-
 bool is_basic_audio(const short_audio_desc_t &audio) {
   constexpr u32 basic_rates = 0x07;
   return audio.type == audio_pcm && audio.channels == 2 && (audio.frequencies & basic_rates) != 0;

@@ -1,4 +1,4 @@
-// Which audio formats cover, match and mask each other.
+// Which audio formats cover and match each other.
 #pragma once
 
 #include <optional>
@@ -14,12 +14,6 @@ std::optional<i32> _audio_format_in_list(const ll_list_t *audio_list, const shor
 
 /// The format narrowed to what the sink's first format like it takes; nothing when the sink has none.
 std::optional<short_audio_desc_t> _audio_format_in_downstream_sink(const edid_t *edid, const short_audio_desc_t &audio);
-
-/// The bit of an audio type in an audio mask; 0 when it has none.
-u32 _audio_type_to_audio_mask(u32 type);
-
-/// The mask of all types in a list.
-u32 _create_audio_mask(const ll_list_t *list);
 
 /// Basic audio (CEA-861, section 7.5.2): 2-channel PCM at 32, 44.1 or 48 kHz.
 bool is_basic_audio(const short_audio_desc_t &audio);
