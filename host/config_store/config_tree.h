@@ -37,16 +37,40 @@ class config_tree_t {
   /// Finds the node at a path from the root; the empty path is the root. Takes the same time for any size of the tree.
   std::optional<node_handle_t> find(std::string_view path) const;
 
-  std::optional<node_handle_t> first_child(node_handle_t node) const;
-  std::optional<node_handle_t> next_sibling(node_handle_t node) const;
+  std::optional<node_handle_t> first_child(node_handle_t node) const {
+    const node_t *entry = at(node);
+    return entry == nullptr || entry->first_child == no_node ? std::nullopt : std::optional(entry->first_child);
+  }
+  std::optional<node_handle_t> next_sibling(node_handle_t node) const {
+    const node_t *entry = at(node);
+    return entry == nullptr || entry->next_sibling == no_node ? std::nullopt : std::optional(entry->next_sibling);
+  }
 
   /// What a node is and holds. Views live as long as the tree; for a handle of no node there is nothing.
-  std::optional<std::string_view> path(node_handle_t node) const;
-  std::optional<std::string_view> name(node_handle_t node) const;
-  std::optional<std::int32_t> integer(node_handle_t node) const;
-  std::optional<std::string_view> text(node_handle_t node) const;
+  std::optional<std::string_view> path(node_handle_t node) const {
+    const node_t *entry = at(node);
+    return entry == nullptr ? std::nullopt : std::optional(view(entry->path));
+  }
+  std::optional<std::string_view> name(node_handle_t node) const {
+    const node_t *entry = at(node);
+    if (entry == nullptr) {
+      return std::nullopt;
+    }
+    return view({entry->path.offset + entry->path.length - entry->name_length, entry->name_length});
+  }
+  std::optional<std::int32_t> integer(node_handle_t node) const {
+    const node_t *entry = at(node);
+    return entry == nullptr || entry->kind != node_kind_t::integer ? std::nullopt : std::optional(entry->number);
+  }
+  std::optional<std::string_view> text(node_handle_t node) const {
+    const node_t *entry = at(node);
+    return entry == nullptr || entry->kind != node_kind_t::text ? std::nullopt : std::optional(view(entry->text));
+  }
   /// The root has none.
-  std::optional<node_position_t> position(node_handle_t node) const;
+  std::optional<node_position_t> position(node_handle_t node) const {
+    const node_t *entry = at(node);
+    return entry == nullptr || node == root_handle ? std::nullopt : std::optional(entry->position);
+  }
 
  private:
   static constexpr node_handle_t no_node = 0xFFFFFFFF;
@@ -71,13 +95,17 @@ class config_tree_t {
 
   node_handle_t add(node_handle_t parent, std::string_view name, node_position_t position, node_kind_t kind);
   span_t store(std::string_view characters);
-  std::string_view view(span_t span) const;
-  const node_t *at(node_handle_t node) const;
+  std::string_view view(span_t span) const { return {characters_.data() + span.offset, span.length}; }
+  const node_t *at(node_handle_t node) const { return node < nodes_.size() ? &nodes_[node] : nullptr; }
 
   std::vector<node_t> nodes_;
   std::string characters_;
+  struct slot_t {
+    std::uint32_t hash = 0;  ///< Of the node's path; compared before the path is.
+    node_handle_t node = no_node;
+  };
   /// Open addressing by the path's hash, with at least half of the slots free. Its size is a power of two.
-  std::vector<node_handle_t> index_;
+  std::vector<slot_t> index_;
 };
 
 }  // namespace edid_config_store

@@ -3,21 +3,18 @@
 #include <utility>
 
 namespace edid_config_store {
-namespace {
 
-config_tree_t &instance() {
-  static config_tree_t tree;
+constinit const config_tree_t *g_loaded_tree = nullptr;
+
+const config_tree_t &empty_tree() {
+  static const config_tree_t tree;
   return tree;
 }
 
-}  // namespace
-
-const config_tree_t &current_tree() {
-  return instance();
-}
-
 void replace_current_tree(config_tree_t &&tree) {
-  instance() = std::move(tree);
+  static config_tree_t loaded;
+  loaded = std::move(tree);
+  g_loaded_tree = &loaded;
 }
 
 }  // namespace edid_config_store

@@ -34,37 +34,33 @@ bool init_list(ll_list_t *list, u32 tag) {
 namespace {
 
 // Not calloc: the thread's cache of free blocks, which malloc uses, halves the time that an entry takes.
-ll_entry_t *entry_of_heap(u32 size, const void *entry_output, const void *data_output) {
+inline ll_entry_t *entry_of_heap(u32 size, u32 tag, const void *entry_output, const void *data_output) {
   REPORTS_AS(ll_create_entry);
   auto *const entry = static_cast<ll_entry_t *>(std::malloc(sizeof(ll_entry_t)));
   if (entry == nullptr) {
     LOG_BUG("calloc failed to allocate memory for the entry. ptr:%p", address(entry_output));
     return nullptr;
   }
-  entry->data = std::malloc(size);
-  if (entry->data == nullptr) {
+  void *const data = std::malloc(size);
+  if (data == nullptr) {
     LOG_BUG("calloc failed to allocate memory for the data storage. ptr:%p", address(data_output));
     std::free(entry);
     return nullptr;
   }
+  *entry = {.data = data, .next = nullptr, .list = nullptr, .type = tag};
   return entry;
 }
 
-ll_entry_t *entry_of_arena(u32 size, entry_arena_t *arena) {
+inline ll_entry_t *entry_of_arena(u32 size, u32 tag, entry_arena_t *arena) {
   auto *const entry = static_cast<ll_entry_t *>(arena->allocate(static_cast<u32>(sizeof(ll_entry_t)) + size));
-  if (entry != nullptr) entry->data = entry + 1;
+  if (entry != nullptr) *entry = {.data = entry + 1, .next = nullptr, .list = nullptr, .type = tag};
   return entry;
 }
 
 }  // namespace
 
 ll_entry_t *create_unfilled_entry(u32 size, u32 tag, entry_arena_t *arena) {
-  ll_entry_t *const entry = arena != nullptr ? entry_of_arena(size, arena) : entry_of_heap(size, &size, &size);
-  if (entry == nullptr) return nullptr;
-  entry->next = nullptr;
-  entry->list = nullptr;
-  entry->type = tag;
-  return entry;
+  return arena != nullptr ? entry_of_arena(size, tag, arena) : entry_of_heap(size, tag, &size, &size);
 }
 
 void discard_entry(ll_entry_t *entry, const entry_arena_t *arena) {
@@ -295,13 +291,9 @@ bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type
   }
   const auto bytes = static_cast<u32>(size);
   *data = nullptr;
-  *entry = entry_of_heap(bytes, entry, data);
-  if (*entry == nullptr) return false;
-  void *const payload = (*entry)->data;
-  std::memset(payload, 0, bytes);
-  **entry = {.data = payload, .next = nullptr, .list = nullptr, .type = _calculate_str_checksum(type)};
-  *data = payload;
-  return true;
+  *entry = entry_of_heap(bytes, _calculate_str_checksum(type), entry, data);
+  if (*entry != nullptr) *data = std::memset((*entry)->data, 0, bytes);
+  return *entry != nullptr;
 }
 
 bool ll_delete_entry(ll_entry_t *delete_entry) {

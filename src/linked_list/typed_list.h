@@ -154,13 +154,25 @@ class untyped_appender_t {
   i32 size() const { return last_ != nullptr ? static_cast<i32>(list_->size) : ll_size(list_); }
 
  protected:
-  [[nodiscard]] bool append(const void *record, u32 size, u32 tag);
-  [[nodiscard]] bool prepend(const void *record, u32 size, u32 tag);
+  /// An entry that is in no list yet; null, reported, when there is no memory for it.
+  ll_entry_t *new_entry(u32 size, u32 tag) const {
+    ll_entry_t *const entry = create_unfilled_entry(size, tag, arena_);
+    if (entry == nullptr) log_error(site_, line_, "%s", texts_.creation_failed);
+    return entry;
+  }
+  [[nodiscard]] bool add_to_back(ll_entry_t *entry) {
+    if (last_ == nullptr) return add_first(entry);
+    last_->next = entry;
+    entry->list = list_;
+    ++list_->size;
+    last_ = entry;
+    return true;
+  }
+  [[nodiscard]] bool add_to_front(ll_entry_t *entry);
 
  private:
-  ll_entry_t *new_entry(const void *record, u32 size, u32 tag) const;
-  bool settle(bool added, ll_entry_t *entry) const;
-  bool add_to_back(ll_entry_t *entry);
+  bool add_first(ll_entry_t *entry);
+  bool refuse(ll_entry_t *entry) const;
 
   ll_list_t *list_;
   entry_arena_t *arena_;
@@ -178,11 +190,20 @@ class appender_t : public untyped_appender_t {
       : untyped_appender_t(list, arena, site, texts, line) {}
 
   [[nodiscard]] bool append(const record_t &record) {
-    return untyped_appender_t::append(&record, sizeof record, element_tag<record_t>);
+    ll_entry_t *const entry = filled_entry(record);
+    return entry != nullptr && add_to_back(entry);
   }
   /// Puts the record before the others. kept: a failure has the words for the back of the list.
   [[nodiscard]] bool prepend(const record_t &record) {
-    return untyped_appender_t::prepend(&record, sizeof record, element_tag<record_t>);
+    ll_entry_t *const entry = filled_entry(record);
+    return entry != nullptr && add_to_front(entry);
+  }
+
+ private:
+  ll_entry_t *filled_entry(const record_t &record) const {
+    ll_entry_t *const entry = new_entry(sizeof record, element_tag<record_t>);
+    if (entry != nullptr) *static_cast<record_t *>(entry->data) = record;
+    return entry;
   }
 };
 
