@@ -4,20 +4,35 @@
  *
  * A platform that sits between an HDMI source and a downstream sink presents an EDID of its own on its input. This
  * library composes it from the sink's EDID, the platform's configuration tree and the caller's settings for the port,
- * and decodes any EDID into a readable report.
+ * and decodes an EDID into a readable report.
+ *
+ * Composing one, with the configuration operations of the host (@ref host) in place:
+ *
+ * @code{.c}
+ * uint8_t new_edid[256];
+ * compose_cfg_t settings = {.audio_mask = 0xFFFFFFFF, .hdmi_3d_mode = 1, .port = 0};
+ * compose_request_t request = {.size = sizeof request,
+ *                              .sink = sink, .sink_bytes = sink_bytes,
+ *                              .new_edid = new_edid, .new_edid_bytes = sizeof new_edid,
+ *                              .settings = &settings};
+ * compose_result_t result = {.size = sizeof result};
+ * if (!compose_edid_request(&request, &result)) return -1;
+ * if (result.sink_status != COMPOSE_SINK_READ) puts(compose_sink_status_string(result.sink_status));
+ * return write_to_receiver(new_edid, result.bytes_written);
+ * @endcode
  *
  * Conventions that hold for every operation:
  *
- * - **Results.** Operations answer 1 (`true`) for success and 0 (`false`) for failure unless stated otherwise. There
+ * - **Results.** Operations return 1 (`true`) for success and 0 (`false`) for failure unless stated otherwise. There
  *   are no error codes and no exceptions: each failure is reported once, where it is detected, by one line on standard
  *   output (see @ref debug_enable for the four kinds of line).
  * - **Ownership.** Records are provided by the caller. All heap memory is list entries and their payloads, owned by the
  *   list that holds them and released by the record's own destroy operation. Nothing survives a call but what the
- * caller was given.
+ *   caller was given.
  * - **Threads.** The library keeps no state but the debug switch. Every operation may run on any thread, and on several
  *   threads at once as long as they work on different records and buffers. Lines that several threads print may
- *   interleave. Composing also calls the host's eight `config_*` operations: whether those may run at once is the
- * host's affair.
+ *   interleave. Composing also calls the host's eight `config_*` operations: whether those may run at once is
+ *   up to the host.
  * - **Units.** Pixel clocks are in hertz, refresh rates in whole hertz (truncated), latencies in milliseconds.
  *
  * Standards: EDID 1.3 is "VESA Enhanced EDID Standard, Release A, Revision 1"; CEA-861 is CEA-861-D; HDMI is the "High-
@@ -57,8 +72,8 @@ typedef int32_t i32;  /**< Signed 32-bit integer. */
  * | bug     | `module:line:function() BUG: ` message, newline            | always               |
  * | trace   | message, ` \t\t\tfunction():line`, newline                 | while tracing is on  |
  *
- * The module is `edid_composer`, `edid_decode_encode`, `utility` or `linked_list`. A bug line tells of a broken
- * internal invariant (a corrupt list, a failed allocation), the other two of bad input.
+ * The module is `edid_composer`, `edid_decode_encode`, `utility` or `linked_list`. A bug line reports a broken
+ * internal invariant (a corrupt list, a failed allocation), the other two report bad input.
  * @{ */
 
 /**
@@ -71,7 +86,7 @@ typedef int32_t i32;  /**< Signed 32-bit integer. */
  */
 EDID_COMPOSER_API void debug_enable(bool enable);
 
-/** Tells whether tracing is on. May be called from any thread. */
+/** @return whether tracing is on. May be called from any thread. */
 EDID_COMPOSER_API bool debug_enabled(void);
 
 /**
@@ -91,7 +106,7 @@ EDID_COMPOSER_API extern const char *const gVersion;
  *
  * A head must never be copied by value or moved: at another address it is not initialised.
  *
- * All operations answer true on success. Each failure prints one error or bug line of module `linked_list`. A list may
+ * All operations return true on success. Each failure prints one error or bug line of module `linked_list`. A list may
  * be used by one thread at a time.
  * @{ */
 
@@ -123,10 +138,11 @@ typedef struct ll_entry_t {
  */
 EDID_COMPOSER_API bool ll_init(ll_list_t *list, const char *type);
 
-/** Tells whether @p list is initialised at this address. Checks nothing else. Prints an error for a NULL list only. */
+/** @return whether @p list is initialised at this address. Checks nothing else. Prints an error for a NULL list only.
+ */
 EDID_COMPOSER_API bool ll_is_initialized(const ll_list_t *list);
 
-/** Tells whether @p list was initialised with the name @p type. A mismatch prints nothing; NULL arguments do. */
+/** @return whether @p list was initialised with the name @p type. A mismatch prints nothing; NULL arguments do. */
 EDID_COMPOSER_API bool ll_verify_list_type(const ll_list_t *list, const char *type);
 
 /**
@@ -334,7 +350,8 @@ typedef struct edid_t {
   u8 cnc2;                /**< 1 when content type cinema is supported. */
   u8 cnc3;                /**< 1 when content type game is supported. */
   u8 hdmi_video_present;  /**< 1 when the VSDB carries HDMI video fields (3D and 4Kx2K). */
-  u16 video_latency;      /**< Progressive video latency, ms. 0 when not given; above 500: no valid latency. */
+  u16 video_latency;      /**< Progressive video latency, ms. 0: not given. No valid latency: 508 as decoded, 65535 to
+                             encode. */
   u16 audio_latency;      /**< Progressive audio latency, ms. */
   u16 i_video_latency;    /**< Interlaced video latency, ms. */
   u16 i_audio_latency;    /**< Interlaced audio latency, ms. */
@@ -442,7 +459,7 @@ EDID_COMPOSER_API bool platform_values_init(platform_values_t *values);
 /**
  * Releases the six lists of an initialised record, once.
  *
- * @return true on success; false with a bug line that names the first list that could not be deleted. The lists behind
+ * @return true on success; false with a bug line that names the first list that could not be deleted. The lists after
  * it then keep their entries.
  */
 EDID_COMPOSER_API bool platform_values_destroy(platform_values_t *values);
@@ -469,10 +486,13 @@ typedef struct compose_cfg_t {
   u32 audio_sink_filter; /**< Exactly 1: offer only audio formats that the sink supports too. */
   i32 hdmi_3d_mode;      /**< 2: always offer 3D; 1: as the sink; anything else: never. */
   u32 edid_latency[4]; /**< The platform's own video, audio, interlaced video and interlaced audio latency, ms; added to
-                            the sink's. Above 500: no valid latency. */
+                            the sink's. Only the low 16 bits count: 65636 is 100. Above 500 (as
+                            counted): declared as no valid latency. */
   u8 *spa_offset;      /**< Receives the offset, within the 256 bytes, of the two bytes of the physical address, so that
                             a host can patch it for each input. May be NULL. */
-  u32 port;            /**< Zero-based number of the platform's input; the physical address uses port + 1, 8 bits. */
+  u32 port; /**< Number of the platform's input, from 0 to 14. The physical address holds port + 1 in 4 bits; of a
+                 larger one, which is not refused, the low 4 bits of port + 1 are written: port 15 gives
+                 the place 0, port 16 the place 1. */
 } compose_cfg_t;
 
 /**
@@ -481,7 +501,8 @@ typedef struct compose_cfg_t {
  * Reads the platform configuration through the host's `config_*` operations. A sink EDID that is missing or malformed
  * is reported, not refused: the composition goes on with what could be decoded.
  *
- * Prints errors and warnings of module `edid_composer`, and, while tracing is on, every decision and both EDIDs in
+ * Prints errors and warnings of the modules `edid_composer`, `edid_decode_encode` and `utility`, and, while tracing is
+ * on, every decision and both EDIDs in
  * hexadecimal.
  *
  * @param edid_block the sink's EDID, or NULL when there is none. Its first @p edid_bytes bytes are read.
@@ -515,131 +536,206 @@ EDID_COMPOSER_API bool compose_edid_internal(const u8 *edid_block, u32 edid_byte
 
 /** @defgroup explaining Why an EDID offers what it offers
  *
- * A composition can be observed: @ref compose_edid_request reports, for everything that could have been in the new EDID,
- * whether it is there, and why. Each candidate gets exactly one record: each VIC that the sink, a priority list or an
- * addition list names, each 4Kx2K mode, each audio format of the platform and of the sink; and so does each of the
- * derived values that @ref compose_subject lists. A record tells what became of its candidate in the bytes that were
+ * A composition can be observed: @ref compose_edid_request reports, for everything that could have been in the new
+ * EDID, whether it is there, and why. Each candidate gets exactly one record: each VIC that the sink, a priority list
+ * or an addition list names, each 4Kx2K mode, each audio format of the platform and of the sink; and so does each of
+ * the derived values that @ref compose_subject lists. A record says what became of its candidate in the bytes that were
  * written, also where the encoder had to leave out what the stages before it had chosen. When
- * @ref COMPOSE_SUBJECT_EXTENSION_ROOM says that a data block is too long, sources read what stands behind it otherwise
- * than it is meant.
+ * @ref COMPOSE_SUBJECT_EXTENSION_ROOM says that a data block is too long, sources misread what follows
+ * it.
  * @{ */
 
 /** What a decision is about; @ref compose_decision_t::subject. It says what @ref compose_decision_t::code is. */
 enum compose_subject {
-  COMPOSE_SUBJECT_VIDEO_MODE = 1,       /**< A video mode; code: its VIC (CEA-861, section 4). */
-  COMPOSE_SUBJECT_SINK_TIMING = 2,      /**< A detailed or standard timing of the sink that has no VIC; code: 0. */
-  COMPOSE_SUBJECT_4K_MODE = 3,          /**< A 4Kx2K mode; code: its HDMI_VIC (HDMI 1.4a, section 8.2.3.1). */
-  COMPOSE_SUBJECT_AUDIO_FORMAT = 4,     /**< An audio format; code: @ref short_audio_desc_t::type, 0 for none. */
-  COMPOSE_SUBJECT_NATIVE_RATE = 5,      /**< The refresh family, whose lists are used; code: 50 or 60. */
-  COMPOSE_SUBJECT_GEOMETRY_LIMIT = 6,   /**< The height that modes may have; code: lines; 0 without a limit, or without
-                                             a short video descriptor. */
-  COMPOSE_SUBJECT_CURRENT_MODE = 7,     /**< The mode that the platform puts out now; code: its VIC, 0 when unused. */
-  COMPOSE_SUBJECT_PHYSICAL_ADDRESS = 8, /**< The CEC physical address; code: 0x1230 for 1.2.3.0. */
-  COMPOSE_SUBJECT_DEEP_COLOR = 9,       /**< A colour depth; code: bits per pixel, 30, 36 or 48. */
-  COMPOSE_SUBJECT_TMDS_CLOCK = 10,      /**< The maximum TMDS clock; code: MHz, 0 when it is not declared. */
-  COMPOSE_SUBJECT_LATENCY = 11,       /**< A latency; code: 0 video, 1 audio, 2 interlaced video, 3 interlaced audio. */
-  COMPOSE_SUBJECT_3D = 12,            /**< Whether 3D is offered; code: 1 or 0. */
-  COMPOSE_SUBJECT_PADDING = 13,       /**< Modes added to reach the fewest an EDID has; code: how many. */
-  COMPOSE_SUBJECT_EXTENSION_ROOM = 14 /**< Room in the CEA extension; code: bytes needed before the checksum. */
+  /** A video mode; code: its VIC (CEA-861, section 4). */
+  COMPOSE_SUBJECT_VIDEO_MODE = 1,
+  /** A detailed or standard timing of the sink that has no VIC; code: 0. */
+  COMPOSE_SUBJECT_SINK_TIMING = 2,
+  /** A 4Kx2K mode; code: its HDMI_VIC (HDMI 1.4a, section 8.2.3.1). */
+  COMPOSE_SUBJECT_4K_MODE = 3,
+  /** An audio format; code: @ref short_audio_desc_t::type, 0 for none. */
+  COMPOSE_SUBJECT_AUDIO_FORMAT = 4,
+  /** The refresh family, whose lists are used; code: 50 or 60. */
+  COMPOSE_SUBJECT_NATIVE_RATE = 5,
+  /** The height that modes may have; code: lines; 0 without a limit, or without a short video descriptor. */
+  COMPOSE_SUBJECT_GEOMETRY_LIMIT = 6,
+  /** The mode that the platform puts out now; code: its VIC, 0 when unused. */
+  COMPOSE_SUBJECT_CURRENT_MODE = 7,
+  /** The CEC physical address; code: 0x1230 for 1.2.3.0. */
+  COMPOSE_SUBJECT_PHYSICAL_ADDRESS = 8,
+  /** A colour depth; code: bits per pixel, 30, 36 or 48. */
+  COMPOSE_SUBJECT_DEEP_COLOR = 9,
+  /** The maximum TMDS clock; code: MHz, 0 when it is not declared. */
+  COMPOSE_SUBJECT_TMDS_CLOCK = 10,
+  /** A latency; code: 0 video, 1 audio, 2 interlaced video, 3 interlaced audio. */
+  COMPOSE_SUBJECT_LATENCY = 11,
+  /** Whether 3D is offered; code: 1 or 0. */
+  COMPOSE_SUBJECT_3D = 12,
+  /** Modes added to reach the fewest an EDID has; code: how many. */
+  COMPOSE_SUBJECT_PADDING = 13,
+  /** Room in the CEA extension; code: bytes needed before the checksum. */
+  COMPOSE_SUBJECT_EXTENSION_ROOM = 14
 };
 
 /** What was decided; @ref compose_decision_t::verdict. */
 enum compose_verdict {
-  COMPOSE_VERDICT_OFFERED =
-      1, /**< In the new EDID, as named; of modes, 3D structures aside. A derived value: as asked for. */
-  COMPOSE_VERDICT_LEFT_OUT = 2, /**< Not in the new EDID. A derived value: not declared, or not in force. */
-  COMPOSE_VERDICT_CHANGED = 3   /**< In the new EDID, but not as it was named or asked for. */
+  /** In the new EDID, as named; of modes, 3D structures aside. A derived value: as asked for. */
+  COMPOSE_VERDICT_OFFERED = 1,
+  /** Not in the new EDID. A derived value: not declared, or not in force. */
+  COMPOSE_VERDICT_LEFT_OUT = 2,
+  /** In the new EDID, but not as it was named or asked for. */
+  COMPOSE_VERDICT_CHANGED = 3
 };
 
 /**
- * Why; @ref compose_decision_t::reason. What stands in braces are the numbers behind it, as they lie in
+ * Why; @ref compose_decision_t::reason. The numbers in braces explain it; they lie, in this order, in
  * @ref compose_decision_t::value. @ref compose_reason_string has the reason in words.
  */
 enum compose_reason {
-  COMPOSE_REASON_SINK_HAS_IT = 1,          /**< The priority list names it and the sink has it. */
-  COMPOSE_REASON_PLATFORM_ADDS_IT = 2,     /**< The priority list names it and the addition list has it. */
-  COMPOSE_REASON_IS_CURRENT_MODE = 3,      /**< The platform puts it out now. */
-  COMPOSE_REASON_PADS_THE_LIST = 4,        /**< Stands in for modes that are missing. */
-  COMPOSE_REASON_NOT_IN_PRIORITY_LIST = 5, /**< The sink or the addition list has it, the priority list doesn't. */
-  COMPOSE_REASON_NOT_AVAILABLE = 6,        /**< Neither the sink nor the addition list has it. */
-  COMPOSE_REASON_OTHER_REFRESH_FAMILY = 7, /**< Only lists of the other family name it {family in use}. */
-  COMPOSE_REASON_TALLER_THAN_SINK = 8,     /**< Above the geometry limit {lines of the mode, limit}. */
-  COMPOSE_REASON_NO_ROOM =
-      9, /**< Chosen, but the extension holds no more of its kind {descriptors of its kind there}. */
-  COMPOSE_REASON_TIMING_WITHOUT_VIC =
-      10, /**< No VIC has it {active pixels, active lines of a frame or 0, Hz, 1 interlaced}. */
-  COMPOSE_REASON_PLATFORM_FORMAT = 11,     /**< The platform has it {channels}. */
-  COMPOSE_REASON_SINK_FORMAT = 12,         /**< Passed through from the sink {channels}. */
-  COMPOSE_REASON_NARROWED_TO_SINK = 13,    /**< Narrowed to what the sink takes {channels asked for, channels left,
-                                                sample rates asked for, sample rates left}. */
-  COMPOSE_REASON_BASIC_AUDIO = 14,         /**< Basic audio, added as no format has it {channels}. */
-  COMPOSE_REASON_NOT_AN_AUDIO_FORMAT = 15, /**< The platform's entry can't be decoded {its value}. */
-  COMPOSE_REASON_SINK_FORMATS_ONLY = 16,   /**< Audio pass-through takes the sink's formats only {pass-through}. */
-  COMPOSE_REASON_PLATFORM_FORMATS_ONLY =
-      17,                          /**< Audio pass-through takes the platform's formats only {pass-through}. */
-  COMPOSE_REASON_NOT_IN_SINK = 18, /**< The sink has no format like it {channels}. */
-  COMPOSE_REASON_DUPLICATE =
-      19, /**< A format before it covers it {channels, place of that among the formats chosen so far}. */
-  COMPOSE_REASON_AUDIO_MASK = 20,       /**< The audio mask excludes its type {mask in force, bit of the type}. */
-  COMPOSE_REASON_TYPE_WITHOUT_BIT = 21, /**< No audio mask has a bit for its type {mask in force}. */
-  COMPOSE_REASON_RATE_OF_DETAILED_TIMING = 22, /**< The sink's first timing that tells {its position, Hz}. */
-  COMPOSE_REASON_RATE_OF_STANDARD_TIMING = 23, /**< The sink's first standard timing that tells {its position, Hz}. */
-  COMPOSE_REASON_RATE_OF_SHORT_VIDEO = 24,  /**< The sink's first short video descriptor that tells {position, Hz}. */
-  COMPOSE_REASON_RATE_OF_PLATFORM = 25,     /**< The platform's, as the sink tells none. */
-  COMPOSE_REASON_RATE_FORCED = 26,          /**< 60, as the platform's is neither 50 nor 60 {the platform's}. */
-  COMPOSE_REASON_GEOMETRY_OF_SINK = 27,     /**< That of the sink's tallest short video descriptor. */
-  COMPOSE_REASON_GEOMETRY_UNLIMITED = 28,   /**< The platform sets no limit. */
-  COMPOSE_REASON_CURRENT_MODE_FIRST = 29,   /**< Put first {width, height, Hz, interlaced}. */
-  COMPOSE_REASON_CURRENT_MODE_IGNORED = 30, /**< The platform doesn't ask for it {width, height, Hz, interlaced}. */
-  COMPOSE_REASON_CURRENT_MODE_IMPLAUSIBLE = 31, /**< Not a mode {width, height, Hz, interlaced}. */
-  COMPOSE_REASON_CURRENT_MODE_WITHOUT_VIC = 32, /**< No VIC has it {width, height, Hz, interlaced}. */
-  COMPOSE_REASON_ADDRESS_OF_ROOT = 33,          /**< The platform is the television {port}. */
-  COMPOSE_REASON_ADDRESS_BELOW_SINK = 34,       /**< The port in the sink's first free place {port, sink's address}. */
-  COMPOSE_REASON_ADDRESS_WITHOUT_SINK = 35,     /**< None: no HDMI sink {port}. */
-  COMPOSE_REASON_ADDRESS_OF_SINK_INVALID = 36,  /**< None: the sink's begins with 0 {port, sink's address}. */
-  COMPOSE_REASON_ADDRESS_WITHOUT_PLACE = 37,    /**< None: the sink's has no free place {port, sink's address}. */
-  COMPOSE_REASON_DEEP_COLOR_OF_PLATFORM = 38,   /**< As the platform says {1 or 0}. */
-  COMPOSE_REASON_DEEP_COLOR_REQUIRED = 39,      /**< HDMI requires 36 bit where 30 bit is offered. */
-  COMPOSE_REASON_DEEP_COLOR_NEVER = 40,         /**< Not offered by this library. */
-  COMPOSE_REASON_TMDS_OVERRIDE = 41,    /**< The platform's own, in steps of 5 MHz {MHz asked for, sink's MHz}. */
-  COMPOSE_REASON_TMDS_OF_MODES = 42,    /**< What the modes need {pixel clock in kHz, percent of it, sink's MHz}. */
-  COMPOSE_REASON_TMDS_OF_4K_MODES = 43, /**< What 4Kx2K modes need {pixel clock in kHz, percent, sink's MHz}. */
-  COMPOSE_REASON_TMDS_NOT_NEEDED = 44,  /**< The modes stay below 165 MHz {pixel clock in kHz, percent, sink's}. */
-  COMPOSE_REASON_TMDS_LARGEST = 45,     /**< Cut to what the field can hold {MHz wanted, MHz held}. */
-  COMPOSE_REASON_LATENCY_OF_BOTH =
-      46, /**< The platform's and the sink's in sum {own ms, sink's ms, ms declared: even, at most 500}. */
-  COMPOSE_REASON_LATENCY_NONE = 47, /**< Neither delays; offered as 0 ms where the other latencies need it to be. */
-  COMPOSE_REASON_LATENCY_TOO_LONG =
-      48,                         /**< One of both is longer than 500 ms: declared as not valid {own ms, sink's ms}. */
-  COMPOSE_REASON_3D_ALWAYS = 49,  /**< The caller asks for it {setting, sink's}. */
-  COMPOSE_REASON_3D_OF_SINK = 50, /**< The sink has it {setting, sink's}. */
-  COMPOSE_REASON_3D_NOT_IN_SINK = 51, /**< The sink doesn't have it {setting, sink's}. */
-  COMPOSE_REASON_3D_OFF = 52,         /**< The caller doesn't want it {setting, sink's}. */
-  COMPOSE_REASON_TOO_FEW_MODES = 53,  /**< VIC 1 was added {modes chosen, fewest}. */
-  COMPOSE_REASON_ENOUGH_MODES = 54,   /**< Nothing was added {modes chosen, fewest}. */
-  COMPOSE_REASON_ROOM_ENOUGH = 55,    /**< Every byte fits {bytes needed, bytes there, bytes of the longest data block
-                                           that can become too long, most}. */
-  COMPOSE_REASON_ROOM_EXCEEDED = 56,  /**< The rest is left out {as above}. */
-  COMPOSE_REASON_BLOCK_TOO_LONG = 57, /**< A data block is longer than its length field can tell, and read as shorter
-                                           {as above}. */
-  COMPOSE_REASON_NOT_ANNOUNCED = 58   /**< The base block doesn't announce the extension, as without a monitor name
-                                           {as above}. */
+  /** The priority list names it and the sink has it. */
+  COMPOSE_REASON_SINK_HAS_IT = 1,
+  /** The priority list names it and the addition list has it. */
+  COMPOSE_REASON_PLATFORM_ADDS_IT = 2,
+  /** The platform puts it out now. */
+  COMPOSE_REASON_IS_CURRENT_MODE = 3,
+  /** Stands in for modes that are missing. */
+  COMPOSE_REASON_PADS_THE_LIST = 4,
+  /** The sink or the addition list has it, the priority list doesn't. */
+  COMPOSE_REASON_NOT_IN_PRIORITY_LIST = 5,
+  /** Neither the sink nor the addition list has it. */
+  COMPOSE_REASON_NOT_AVAILABLE = 6,
+  /** Only lists of the other family name it {family in use}. */
+  COMPOSE_REASON_OTHER_REFRESH_FAMILY = 7,
+  /** Above the geometry limit {lines of the mode, limit}. */
+  COMPOSE_REASON_TALLER_THAN_SINK = 8,
+  /** Chosen, but the extension holds no more of its kind {descriptors of its kind there}. */
+  COMPOSE_REASON_NO_ROOM = 9,
+  /** No VIC has it {active pixels, active lines of a frame or 0, Hz, 1 interlaced}. */
+  COMPOSE_REASON_TIMING_WITHOUT_VIC = 10,
+  /** The platform has it {channels}. */
+  COMPOSE_REASON_PLATFORM_FORMAT = 11,
+  /** Passed through from the sink {channels}. */
+  COMPOSE_REASON_SINK_FORMAT = 12,
+  /** Narrowed to what the sink takes {channels asked for, channels left, sample rates asked for, sample rates left}. */
+  COMPOSE_REASON_NARROWED_TO_SINK = 13,
+  /** Basic audio, added as no format has it {channels}. */
+  COMPOSE_REASON_BASIC_AUDIO = 14,
+  /** The platform's entry can't be decoded {its value}. */
+  COMPOSE_REASON_NOT_AN_AUDIO_FORMAT = 15,
+  /** Audio pass-through takes the sink's formats only {pass-through}. */
+  COMPOSE_REASON_SINK_FORMATS_ONLY = 16,
+  /** Audio pass-through takes the platform's formats only {pass-through}. */
+  COMPOSE_REASON_PLATFORM_FORMATS_ONLY = 17,
+  /** The sink has no format like it {channels}. */
+  COMPOSE_REASON_NOT_IN_SINK = 18,
+  /** A format before it covers it {channels, place of that among the formats chosen so far}. */
+  COMPOSE_REASON_DUPLICATE = 19,
+  /** The audio mask excludes its type {mask in force, bit of the type}. */
+  COMPOSE_REASON_AUDIO_MASK = 20,
+  /** No audio mask has a bit for its type {mask in force}. */
+  COMPOSE_REASON_TYPE_WITHOUT_BIT = 21,
+  /** That of the sink's first detailed timing at 50 or 60 Hz {position, Hz}. */
+  COMPOSE_REASON_RATE_OF_DETAILED_TIMING = 22,
+  /** That of the sink's first standard timing at 60 Hz {position, Hz}. */
+  COMPOSE_REASON_RATE_OF_STANDARD_TIMING = 23,
+  /** That of the sink's first descriptor at 50 or 60 Hz {position, Hz}. */
+  COMPOSE_REASON_RATE_OF_SHORT_VIDEO = 24,
+  /** The platform's, as no timing of the sink is at 50 or 60 Hz. */
+  COMPOSE_REASON_RATE_OF_PLATFORM = 25,
+  /** 60, as the platform's is neither 50 nor 60 {the platform's}. */
+  COMPOSE_REASON_RATE_FORCED = 26,
+  /** That of the sink's tallest short video descriptor. */
+  COMPOSE_REASON_GEOMETRY_OF_SINK = 27,
+  /** The platform sets no limit. */
+  COMPOSE_REASON_GEOMETRY_UNLIMITED = 28,
+  /** Put first {width, height, Hz, interlaced}. */
+  COMPOSE_REASON_CURRENT_MODE_FIRST = 29,
+  /** The platform doesn't ask for it {width, height, Hz, interlaced}. */
+  COMPOSE_REASON_CURRENT_MODE_IGNORED = 30,
+  /** Not a mode {width, height, Hz, interlaced}. */
+  COMPOSE_REASON_CURRENT_MODE_IMPLAUSIBLE = 31,
+  /** No VIC has it {width, height, Hz, interlaced}. */
+  COMPOSE_REASON_CURRENT_MODE_WITHOUT_VIC = 32,
+  /** The platform is the television {port}. */
+  COMPOSE_REASON_ADDRESS_OF_ROOT = 33,
+  /** The port in the sink's first free place {port, sink's address}. */
+  COMPOSE_REASON_ADDRESS_BELOW_SINK = 34,
+  /** None: no HDMI sink {port}. */
+  COMPOSE_REASON_ADDRESS_WITHOUT_SINK = 35,
+  /** None: the sink's begins with 0 {port, sink's address}. */
+  COMPOSE_REASON_ADDRESS_OF_SINK_INVALID = 36,
+  /** None: the sink's has no free place {port, sink's address}. */
+  COMPOSE_REASON_ADDRESS_WITHOUT_PLACE = 37,
+  /** As the platform says {1 or 0}. */
+  COMPOSE_REASON_DEEP_COLOR_OF_PLATFORM = 38,
+  /** HDMI requires 36 bit where 30 bit is offered. */
+  COMPOSE_REASON_DEEP_COLOR_REQUIRED = 39,
+  /** Not offered by this library. */
+  COMPOSE_REASON_DEEP_COLOR_NEVER = 40,
+  /** The platform's own, in steps of 5 MHz {MHz asked for, sink's MHz}. */
+  COMPOSE_REASON_TMDS_OVERRIDE = 41,
+  /** What the modes need {pixel clock in kHz, percent of it, sink's MHz}. */
+  COMPOSE_REASON_TMDS_OF_MODES = 42,
+  /** What 4Kx2K modes need {pixel clock in kHz, percent, sink's MHz}. */
+  COMPOSE_REASON_TMDS_OF_4K_MODES = 43,
+  /** The modes stay below 165 MHz {pixel clock in kHz, percent, sink's}. */
+  COMPOSE_REASON_TMDS_NOT_NEEDED = 44,
+  /** Cut to what the field can hold {MHz wanted, MHz held}. */
+  COMPOSE_REASON_TMDS_LARGEST = 45,
+  /** The platform's and the sink's in sum {own ms, sink's ms, ms declared: even, at most 500}. */
+  COMPOSE_REASON_LATENCY_OF_BOTH = 46,
+  /** Neither delays; offered as 0 ms where the other latencies need it to be. */
+  COMPOSE_REASON_LATENCY_NONE = 47,
+  /** One of both is longer than 500 ms: declared as not valid {own ms, sink's ms}. */
+  COMPOSE_REASON_LATENCY_TOO_LONG = 48,
+  /** The caller asks for it {setting, sink's}. */
+  COMPOSE_REASON_3D_ALWAYS = 49,
+  /** The sink has it {setting, sink's}. */
+  COMPOSE_REASON_3D_OF_SINK = 50,
+  /** The sink doesn't have it {setting, sink's}. */
+  COMPOSE_REASON_3D_NOT_IN_SINK = 51,
+  /** The caller doesn't want it {setting, sink's}. */
+  COMPOSE_REASON_3D_OFF = 52,
+  /** VIC 1 was added {modes chosen, fewest}. */
+  COMPOSE_REASON_TOO_FEW_MODES = 53,
+  /** Nothing was added {modes chosen, fewest}. */
+  COMPOSE_REASON_ENOUGH_MODES = 54,
+  /** Every byte fits {bytes needed, bytes there, bytes of the longest data block that can become too long, most}. */
+  COMPOSE_REASON_ROOM_ENOUGH = 55,
+  /** The rest is left out {as above}. */
+  COMPOSE_REASON_ROOM_EXCEEDED = 56,
+  /** A data block is too long for its length field, and read as shorter {as above}. */
+  COMPOSE_REASON_BLOCK_TOO_LONG = 57,
+  /** The base block doesn't announce the extension, as without a monitor name {as above}. */
+  COMPOSE_REASON_NOT_ANNOUNCED = 58
 };
 
 /** Who named a candidate; bits of @ref compose_decision_t::origins. */
 enum compose_origin {
-  COMPOSE_ORIGIN_DETAILED_TIMING = 0x0001,     /**< A detailed timing of the sink; place in sink_index. */
-  COMPOSE_ORIGIN_STANDARD_TIMING = 0x0002,     /**< A standard timing of the sink; place in sink_index. */
-  COMPOSE_ORIGIN_SHORT_VIDEO = 0x0004,         /**< A short video descriptor of the sink; place in sink_index. */
-  COMPOSE_ORIGIN_SINK_4K = 0x0008,             /**< An HDMI_VIC of the sink; place in sink_index. */
-  COMPOSE_ORIGIN_SINK_AUDIO = 0x0010,          /**< A short audio descriptor of the sink; place in sink_index. */
-  COMPOSE_ORIGIN_PRIORITY_LIST = 0x0020,       /**< The priority list in use; place in priority_index. */
-  COMPOSE_ORIGIN_ADDITION_LIST = 0x0040,       /**< The addition list in use; place in addition_index. */
-  COMPOSE_ORIGIN_OTHER_PRIORITY_LIST = 0x0080, /**< The other family's; place in priority_index if alone. */
-  COMPOSE_ORIGIN_OTHER_ADDITION_LIST = 0x0100, /**< The other family's; place in addition_index if alone. */
-  COMPOSE_ORIGIN_PLATFORM_AUDIO = 0x0200,      /**< The platform's audio list; place in priority_index. */
-  COMPOSE_ORIGIN_CURRENT_MODE = 0x0400,        /**< The caller's current mode. */
-  COMPOSE_ORIGIN_LIBRARY = 0x0800              /**< The library itself: padding and basic audio. */
+  /** A detailed timing of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_DETAILED_TIMING = 0x0001,
+  /** A standard timing of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_STANDARD_TIMING = 0x0002,
+  /** A short video descriptor of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_SHORT_VIDEO = 0x0004,
+  /** An HDMI_VIC of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_SINK_4K = 0x0008,
+  /** A short audio descriptor of the sink; place in sink_index. */
+  COMPOSE_ORIGIN_SINK_AUDIO = 0x0010,
+  /** The priority list in use; place in priority_index. */
+  COMPOSE_ORIGIN_PRIORITY_LIST = 0x0020,
+  /** The addition list in use; place in addition_index. */
+  COMPOSE_ORIGIN_ADDITION_LIST = 0x0040,
+  /** The other family's; place in priority_index if alone. */
+  COMPOSE_ORIGIN_OTHER_PRIORITY_LIST = 0x0080,
+  /** The other family's; place in addition_index if alone. */
+  COMPOSE_ORIGIN_OTHER_ADDITION_LIST = 0x0100,
+  /** The platform's audio list; place in priority_index. */
+  COMPOSE_ORIGIN_PLATFORM_AUDIO = 0x0200,
+  /** The caller's current mode. */
+  COMPOSE_ORIGIN_CURRENT_MODE = 0x0400,
+  /** The library itself: padding and basic audio. */
+  COMPOSE_ORIGIN_LIBRARY = 0x0800
 };
 
 /** One decision of a composition. It holds no pointers: a copy of it keeps its meaning. */
@@ -651,12 +747,12 @@ typedef struct compose_decision_t {
   u32 reason;  /**< Why; @ref compose_reason. */
   u32 origins; /**< Who named the candidate: mask of @ref compose_origin; 0 for derived values. */
   i32 sink_index; /**< Place, from 0, of the first descriptor of the sink that names it, among those of the kind that
-                       the lowest bit of origins tells and that could be decoded; -1 when none does. */
+                       the lowest bit of origins names and that could be decoded; -1 when none does. */
   i32 priority_index; /**< Place, from 0, among the entries of the list that names it as it was read, without those that
                          were skipped; -1 when none does. */
   i32 addition_index; /**< As above, for the addition list. */
   i32 position;       /**< Place, from 0, among the new EDID's descriptors of its kind; -1 when it isn't there. */
-  i32 value[4];       /**< The numbers behind the reason; see @ref compose_reason. The others are 0. */
+  i32 value[4];       /**< The numbers that explain the reason; see @ref compose_reason. The others are 0. */
 } compose_decision_t;
 
 /**
@@ -686,11 +782,16 @@ EDID_COMPOSER_API const char *compose_reason_string(u32 reason);
 
 /** What kind of line a composition has written; @ref compose_log_line_t::kind. */
 enum compose_log_kind {
-  COMPOSE_LOG_ERROR = 1,   /**< On standard output: `module:line:function() ERROR: text`. */
-  COMPOSE_LOG_WARNING = 2, /**< On standard output: `module:line:function() WARNING: text`. */
-  COMPOSE_LOG_BUG = 3,     /**< On standard output: `module:line:function() BUG: text`. */
-  COMPOSE_LOG_TRACE = 4,   /**< On standard output: the text, then ` \t\t\tfunction():line`. */
-  COMPOSE_LOG_TEXT = 5     /**< A line of a report or of a dump: on standard output the text alone. */
+  /** On standard output: `module:line:function() ERROR: text`. */
+  COMPOSE_LOG_ERROR = 1,
+  /** On standard output: `module:line:function() WARNING: text`. */
+  COMPOSE_LOG_WARNING = 2,
+  /** On standard output: `module:line:function() BUG: text`. */
+  COMPOSE_LOG_BUG = 3,
+  /** On standard output: the text, then ` \t\t\tfunction():line`. */
+  COMPOSE_LOG_TRACE = 4,
+  /** A line of a report or of a dump: on standard output the text alone. */
+  COMPOSE_LOG_TEXT = 5
 };
 
 /** One line of a composition. The texts are valid until the callback returns. */
@@ -718,31 +819,49 @@ typedef void (*compose_log_t)(const compose_log_line_t *line, void *context);
 
 /** What became of the sink's base block; @ref compose_result_t::sink_status. */
 enum compose_sink_status {
-  COMPOSE_SINK_NONE = 1,                /**< No sink was given: a NULL pointer, or no bytes. */
-  COMPOSE_SINK_READ = 2,                /**< The base block was read. */
-  COMPOSE_SINK_LENGTH_INVALID = 3,      /**< Not read: its length is no multiple of 128 bytes. */
-  COMPOSE_SINK_HEADER_INVALID = 4,      /**< Refused: bytes 0 to 7 are not the header (EDID 1.3, section 3.1). */
-  COMPOSE_SINK_CHECKSUM_INVALID = 5,    /**< Refused: the 128 bytes do not sum to 0 (EDID 1.3, section 3.12). */
-  COMPOSE_SINK_VERSION_UNSUPPORTED = 6, /**< Refused: neither version 1.3 nor a later revision of version 1. */
-  COMPOSE_SINK_DESCRIPTOR_INVALID = 7,  /**< Reading ended at a malformed 18-byte descriptor: what stands before it is
-                                             used, what follows it and the extension are not. */
-  COMPOSE_SINK_OUT_OF_MEMORY = 8        /**< Reading ended because a list entry could not be had. */
+  /** No sink was given: a NULL pointer, or no bytes. */
+  COMPOSE_SINK_NONE = 1,
+  /** The base block was read. */
+  COMPOSE_SINK_READ = 2,
+  /** Not read: its length is no multiple of 128 bytes. */
+  COMPOSE_SINK_LENGTH_INVALID = 3,
+  /** Refused: bytes 0 to 7 are not the header (EDID 1.3, section 3.1). */
+  COMPOSE_SINK_HEADER_INVALID = 4,
+  /** Refused: the 128 bytes do not sum to 0 (EDID 1.3, section 3.12). */
+  COMPOSE_SINK_CHECKSUM_INVALID = 5,
+  /** Refused: neither version 1.3 nor a later revision of version 1. */
+  COMPOSE_SINK_VERSION_UNSUPPORTED = 6,
+  /** Reading ended at a malformed 18-byte descriptor: what stands before it is used, what follows it and the extension
+   *  are not. */
+  COMPOSE_SINK_DESCRIPTOR_INVALID = 7,
+  /** Reading ended because a list entry could not be had. */
+  COMPOSE_SINK_OUT_OF_MEMORY = 8
 };
 
 /** What became of the sink's block 1; @ref compose_result_t::sink_extension_status. */
 enum compose_extension_status {
-  COMPOSE_EXTENSION_NOT_LOOKED_AT = 1,        /**< The base block was not read to its end, so block 1 was not either. */
-  COMPOSE_EXTENSION_NOT_ANNOUNCED = 2,        /**< The base block announces no extension (byte 126 is 0). */
-  COMPOSE_EXTENSION_READ = 3,                 /**< Block 1 was read as CEA-861 extension. */
-  COMPOSE_EXTENSION_MISSING = 4,              /**< Announced, but the sink has no more than 128 bytes. */
-  COMPOSE_EXTENSION_NOT_CEA = 5,              /**< Refused: its tag (byte 0) is not 2. */
-  COMPOSE_EXTENSION_REVISION_UNSUPPORTED = 6, /**< Refused: its revision (byte 1) is not 3. */
-  COMPOSE_EXTENSION_CHECKSUM_INVALID = 7,     /**< Refused: its 128 bytes do not sum to 0. */
-  COMPOSE_EXTENSION_OFFSET_UNSUPPORTED = 8,   /**< Refused: its detailed timings (byte 2) begin after byte 110, which
-                                                   the standard allows and this library does not. */
-  COMPOSE_EXTENSION_MALFORMED = 9,            /**< A data block overruns its collection: what stands before it is used.
-                                                   See @ref compose_result_t::sink_malformed_at. */
-  COMPOSE_EXTENSION_OUT_OF_MEMORY = 10        /**< Reading ended because a list entry could not be had. */
+  /** The base block was not read to its end, so block 1 was not either. */
+  COMPOSE_EXTENSION_NOT_LOOKED_AT = 1,
+  /** The base block announces no extension (byte 126 is 0). */
+  COMPOSE_EXTENSION_NOT_ANNOUNCED = 2,
+  /** Block 1 was read as CEA-861 extension. */
+  COMPOSE_EXTENSION_READ = 3,
+  /** Announced, but the sink has no more than 128 bytes. */
+  COMPOSE_EXTENSION_MISSING = 4,
+  /** Refused: its tag (byte 0) is not 2. */
+  COMPOSE_EXTENSION_NOT_CEA = 5,
+  /** Refused: its revision (byte 1) is not 3. */
+  COMPOSE_EXTENSION_REVISION_UNSUPPORTED = 6,
+  /** Refused: its 128 bytes do not sum to 0. */
+  COMPOSE_EXTENSION_CHECKSUM_INVALID = 7,
+  /** Refused: its detailed timings (byte 2) begin after byte 110, which the standard allows and this library does not.
+   */
+  COMPOSE_EXTENSION_OFFSET_UNSUPPORTED = 8,
+  /** A data block overruns its collection: what stands before it is used. See @ref
+   *  compose_result_t::sink_malformed_at. */
+  COMPOSE_EXTENSION_MALFORMED = 9,
+  /** Reading ended because a list entry could not be had. */
+  COMPOSE_EXTENSION_OUT_OF_MEMORY = 10
 };
 
 /**
@@ -774,9 +893,9 @@ typedef struct compose_result_t {
   u32 sink_status;             /**< What became of the sink's base block; @ref compose_sink_status. 0 when the call was
                                     refused before the sink was looked at. */
   u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. */
-  u32 sink_malformed_at;       /**< The byte, when @ref sink_extension_status is COMPOSE_EXTENSION_MALFORMED, of block 1, from 0, at which the
-                                    data block begins that overruns; else 0. */
-  u32 sink_blocks_unread;      /**< Extension blocks after block 1 that are announced and given, but not read. */
+  u32 sink_malformed_at; /**< The byte, when @ref sink_extension_status is COMPOSE_EXTENSION_MALFORMED, of block 1, from
+                            0, at which the data block begins that overruns; else 0. */
+  u32 sink_blocks_unread; /**< Extension blocks after block 1 that are announced and given, but not read. */
 } compose_result_t;
 
 /**
@@ -842,7 +961,7 @@ EDID_COMPOSER_API u8 decode_edid_block_0(const u8 *edid_block, edid_t *edid);
  * (HDMI 1.4a, section 8.3.2), into a record.
  *
  * @param edid_extension the extension block.
- * @param length number of bytes there; none is read behind them, and what is missing of a block reads as 0. More than
+ * @param length number of bytes there; none is read after them, and what is missing of a block reads as 0. More than
  * 128 bytes: detailed timings are looked for in the blocks that follow as well.
  * @param edid the record that the base block was decoded into; its lists are appended to.
  * @return 1 on success; 0, with one error line, for a NULL argument, another tag or revision, a bad checksum, or a data
@@ -865,7 +984,7 @@ EDID_COMPOSER_API u8 decode_edid_short_audio(u8 byte1, u8 byte2, u8 byte3, short
  * Encodes a record as base block and CEA-861 extension with the HDMI vendor-specific data block.
  *
  * At most 8 standard timings, 32 short video descriptors and 10 short audio descriptors are written; more of the latter
- * two give a warning. What does not fit the extension is not written, and one error line tells how many bytes it
+ * two give a warning. What does not fit the extension is not written, and one error line says how many bytes it
  * needed; the result does not change by it.
  *
  * @param edid_blocks receives the bytes; nothing is written outside of them.
@@ -903,7 +1022,7 @@ EDID_COMPOSER_API u8 print_edid_struct(const edid_t *edid, u8 brief, const char 
 
 /** @defgroup timings Video timings
  *
- * Conversions between video identification codes (VICs 1 to 64 of CEA-861, section 4), timings and modes. They answer 1
+ * Conversions between video identification codes (VICs 1 to 64 of CEA-861, section 4), timings and modes. They return 1
  * when a match was found and 0 otherwise; bad arguments print an error line of module `utility`.
  * @{ */
 
@@ -950,7 +1069,7 @@ EDID_COMPOSER_API u32 calculate_refresh_rate(u32 pixel_clock, u32 h_active, u32 
 
 /** @defgroup names Names and printers
  *
- * Name functions answer a read-only text, never NULL, valid as long as the library is loaded. Unknown values have a
+ * Name functions return a read-only text, never NULL, valid as long as the library is loaded. Unknown values have a
  * text too.
  * @{ */
 
@@ -1049,10 +1168,10 @@ EDID_COMPOSER_API i32 get_pc_int(const char *key, i32 min, i32 max, i32 default_
 /** @defgroup host Operations that the host supplies
  *
  * The platform's configuration: a tree of named nodes that hold integers and strings. The library leaves these eight
- * operations undefined; the process that loads it defines them. They answer 0 for success.
+ * operations undefined; the process that loads it defines them. They return 0 for success.
  *
  * A path is a sequence of node names separated by dots, from the root. @p root is always 0. Nodes are known by handles
- * of the host's choice, which must stay valid for the duration of one call into the library. An operation that answers
+ * of the host's choice, which must stay valid for the duration of one call into the library. An operation that returns
  * another status leaves its output alone.
  * @{ */
 
@@ -1064,7 +1183,7 @@ EDID_COMPOSER_API int config_get_str(u32 root, const char *path, char *buffer, u
 EDID_COMPOSER_API int config_node_find(u32 root, const char *path, u32 *node);
 /** Finds the first child of @p node. 2: no children; any other status counts as found. */
 EDID_COMPOSER_API int config_node_first_child(u32 node, u32 *child);
-/** Finds the node behind @p node. Nonzero: it is the last one. */
+/** Finds the node after @p node. Nonzero: it is the last one. */
 EDID_COMPOSER_API int config_node_next_sibling(u32 node, u32 *sibling);
 /** Copies what fits of the name of @p node (the last component of its path), with its NUL, into @p buffer. */
 EDID_COMPOSER_API int config_node_get_name(u32 node, char *buffer, u32 size);

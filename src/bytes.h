@@ -18,7 +18,7 @@ class byte_view_t {
   constexpr bool contains(u32 offset) const { return offset < size_; }
   constexpr u8 operator[](u32 offset) const { return contains(offset) ? data_[offset] : u8{0}; }
 
-  /// What lies at @p offset and behind.
+  /// What lies at @p offset and after it.
   constexpr byte_view_t from(u32 offset) const {
     return contains(offset) ? byte_view_t(data_ + offset, size_ - offset) : byte_view_t(data_, 0);
   }
@@ -51,12 +51,12 @@ constexpr u8 low_byte(u32 value) {
   return static_cast<u8>(value & 0xFF);
 }
 
-/// Writes bytes one behind the other into a buffer of fixed size.
+/// Writes bytes one after the other into a buffer of fixed size.
 class byte_writer_t {
  public:
   constexpr byte_writer_t(u8 *data, u32 capacity) : data_(data), capacity_(capacity) {}
 
-  /// Offset of the next byte; goes on behind the end of the buffer, so that it tells what was needed.
+  /// Offset of the next byte; goes on past the end of the buffer, so that it shows what was needed.
   constexpr u32 position() const { return position_; }
   constexpr void seek(u32 position) { position_ = position; }
 

@@ -6,7 +6,7 @@
 
 namespace edid_composer {
 
-/// A copy of a text field that has a NUL behind it in any case, for printing.
+/// A copy of a text field that ends with a NUL in any case, for printing.
 template <std::size_t size>
 class text_field_t {
  public:

@@ -6,7 +6,7 @@
 
 namespace edid_composer {
 
-/// Tells a display descriptor, whose pixel clock is 0, from a detailed timing.
+/// True for a display descriptor, whose pixel clock is 0; false for a detailed timing.
 bool is_display_descriptor(const byte_view_t &descriptor);
 
 /// Appends the detailed timings of a record's descriptors.

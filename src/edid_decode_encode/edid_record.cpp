@@ -38,10 +38,5 @@ u8 edid_destroy(edid_t *edid) {
       return 0;
     }
   }
-  for (const auto &row : record_lists) {
-    if (ll_is_initialized(&(edid->*row.list))) {
-      LOG_BUG("Deleted list believes it is still initialized: %s.", row.name);
-    }
-  }
   return 1;
 }

@@ -317,15 +317,8 @@ bool ll_delete_entry_at(ll_list_t *list, u32 index) {
   ll_entry_t *const victim = *link;
   *link = victim->next;
   victim->list = nullptr;
-  if (!ll_delete_entry(victim)) {
-    LOG_ERROR("Failed deleting entry.");
-    return false;
-  }
+  ll_delete_entry(victim);
   --list->size;
-  if (!verify_integrity(list)) {
-    LOG_BUG("List failed the integrity check. list:%p", address(list));
-    return false;
-  }
   return true;
 }
 
@@ -384,20 +377,15 @@ bool ll_delete_list(ll_list_t *list) {
     LOG_BUG("Failed verifying integrity of the list. list:%p", address(list));
     return false;
   }
-  bool deleted = true;
   for (ll_entry_t *entry = list->head; entry != nullptr;) {
     ll_entry_t *const next = entry->next;
-    entry->list = nullptr;
-    if (!ll_delete_entry(entry)) {
-      LOG_BUG("Failed deleting an entry during list deletion. ptr:%p", address(entry));
-      deleted = false;
-    }
+    ll_delete_entry(entry);
     entry = next;
   }
   list->size = 0;
   list->head = nullptr;
   list->magic = 0;
-  return deleted;
+  return true;
 }
 
 bool ll_copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size) {

@@ -50,10 +50,10 @@ constexpr text_t reason_texts[] = {
     {COMPOSE_REASON_DUPLICATE, "a format before it covers it"},
     {COMPOSE_REASON_AUDIO_MASK, "the caller's audio mask excludes it"},
     {COMPOSE_REASON_TYPE_WITHOUT_BIT, "no audio mask has a bit for its type"},
-    {COMPOSE_REASON_RATE_OF_DETAILED_TIMING, "a detailed timing of the sink tells it"},
-    {COMPOSE_REASON_RATE_OF_STANDARD_TIMING, "a standard timing of the sink tells it"},
-    {COMPOSE_REASON_RATE_OF_SHORT_VIDEO, "a short video descriptor of the sink tells it"},
-    {COMPOSE_REASON_RATE_OF_PLATFORM, "the platform's, as no mode of the sink tells it"},
+    {COMPOSE_REASON_RATE_OF_DETAILED_TIMING, "that of the sink's first detailed timing at 50 or 60 Hz"},
+    {COMPOSE_REASON_RATE_OF_STANDARD_TIMING, "that of the sink's first standard timing at 60 Hz"},
+    {COMPOSE_REASON_RATE_OF_SHORT_VIDEO, "that of the sink's first short video descriptor at 50 or 60 Hz"},
+    {COMPOSE_REASON_RATE_OF_PLATFORM, "the platform's, as no timing of the sink is at 50 or 60 Hz"},
     {COMPOSE_REASON_RATE_FORCED, "the platform's rate is neither 50 nor 60"},
     {COMPOSE_REASON_GEOMETRY_OF_SINK, "the tallest short video descriptor of the sink"},
     {COMPOSE_REASON_GEOMETRY_UNLIMITED, "the platform sets no limit"},
@@ -85,7 +85,7 @@ constexpr text_t reason_texts[] = {
     {COMPOSE_REASON_ENOUGH_MODES, "enough modes were chosen"},
     {COMPOSE_REASON_ROOM_ENOUGH, "every byte fits"},
     {COMPOSE_REASON_ROOM_EXCEEDED, "the extension is full: what comes last is left out"},
-    {COMPOSE_REASON_BLOCK_TOO_LONG, "a data block is longer than its length field can tell"},
+    {COMPOSE_REASON_BLOCK_TOO_LONG, "a data block is too long for its length field"},
     {COMPOSE_REASON_NOT_ANNOUNCED, "without a monitor name the extension is not announced"},
 };
 

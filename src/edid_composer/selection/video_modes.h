@@ -19,7 +19,7 @@ struct video_selection_t {
 /// Appends to @p modes what the platform's priority list names and the sink or the addition list has, best first.
 video_selection_t _filter_video_modes(const inputs_t &inputs, ll_list_t *modes, journal_t *journal);
 
-/// Adds each entry of @p extra_list (VIC and 3D mask) to the candidates. @p of_sink tells whose list it is.
+/// Adds each entry of @p extra_list (VIC and 3D mask) to the candidates. @p of_sink says whose list it is.
 bool _combine_lists(candidates_t *candidates, const ll_list_t *extra_list, bool of_sink);
 
 }  // namespace edid_composer
