@@ -1,0 +1,126 @@
+// The two patterns over lists that the library repeats: the checked walk, and the new entry with its clean-up.
+#include "linked_list/typed_list.h"
+
+#include "linked_list/list_fixture.h"
+#include "support/failing_allocation.h"
+
+namespace linked_list_tests {
+namespace {
+
+using edid_composer::append;
+using edid_composer::init_list;
+using edid_composer::named_list_t;
+using edid_composer::new_entry_t;
+using edid_composer::new_entry_texts_t;
+using edid_composer::site_t;
+using edid_composer::walk;
+using test_support::failing_allocation_t;
+using test_support::output_of;
+
+constexpr site_t reporter{"utility", "_reporter"};
+constexpr new_entry_texts_t texts{"No entry.", "Not added."};
+
+named_list_t named(const ll_list_t *list) {
+  return {list, "&record->numbers", reporter, 42};
+}
+
+std::string reported_error(const std::string &message) {
+  return test_support::error_line("utility", "_reporter", message);
+}
+
+std::vector<i32> walked(const ll_list_t *list) {
+  std::vector<i32> numbers;
+  for (const i32 &number : walk<const i32>(named(list)))
+    numbers.push_back(number);
+  return numbers;
+}
+
+TEST(CheckedWalk, VisitsEntriesFrontToBackSilently) {
+  list_of_int_t list{4, 5, 6};
+  list_of_int_t empty;
+  EXPECT_EQ(output_of([&] {
+              EXPECT_EQ(walked(list.get()), (std::vector<i32>{4, 5, 6}));
+              EXPECT_EQ(walked(empty.get()), std::vector<i32>{});
+            }),
+            "");
+}
+
+TEST(CheckedWalk, LendsEntriesForChanging) {
+  list_of_int_t list{4, 5};
+  for (i32 &number : walk<i32>(named(list.get())))
+    number *= 10;
+  EXPECT_EQ(list.numbers(), (std::vector<i32>{40, 50}));
+}
+
+TEST(CheckedWalk, ReportsAListOfAnotherTypeAndGoesOn) {
+  list_of_int_t list{4, 5};
+  list->type = 1;
+  EXPECT_EQ(output_of([&] {
+              EXPECT_EQ(walked(list.get()), (std::vector<i32>{4, 5}));
+            }),
+            reported_error("The list types don't match."));
+}
+
+TEST(CheckedWalk, NamesANullListByItsExpressionAndType) {
+  EXPECT_EQ(output_of([] { EXPECT_EQ(walked(nullptr), std::vector<i32>{}); }),
+            error("ll_verify_list_type", "list ptr is NULL.") + reported_error("The list types don't match.") +
+                test_support::bug_line("utility", "_reporter", "The list:&record->numbers of type:int is NULL."));
+}
+
+TEST(ElementTypes, AreNamedAfterTheirRecords) {
+  const auto tag_of = [](auto initialise) {
+    ll_list_t list{};
+    EXPECT_TRUE(initialise(&list));
+    return list;
+  };
+  ll_list_t list = tag_of(init_list<i32>);
+  EXPECT_TRUE(ll_verify_list_type(&list, "int"));
+  list = tag_of(init_list<short_video_desc_t>);
+  EXPECT_TRUE(ll_verify_list_type(&list, "short_video_desc_t"));
+  list = tag_of(init_list<std_timing_t>);
+  EXPECT_TRUE(ll_verify_list_type(&list, "std_timing_t"));
+  list = tag_of(init_list<detailed_timing_t>);
+  EXPECT_TRUE(ll_verify_list_type(&list, "detailed_timing_t"));
+  list = tag_of(init_list<short_audio_desc_t>);
+  EXPECT_TRUE(ll_verify_list_type(&list, "short_audio_desc_t"));
+}
+
+TEST(NewEntry, AppendsACopyOfARecord) {
+  list_of_int_t list{1};
+  EXPECT_EQ(output_of([&] { EXPECT_TRUE(append<i32>(list.get(), 2, reporter, texts)); }), "");
+  EXPECT_EQ(list.numbers(), (std::vector<i32>{1, 2}));
+}
+
+TEST(NewEntry, GoesToTheFrontOnDemand) {
+  list_of_int_t list{1};
+  new_entry_t<i32> entry(reporter, texts);
+  ASSERT_TRUE(entry);
+  *entry = 2;
+  EXPECT_TRUE(entry.add_to_front(list.get()));
+  EXPECT_EQ(list.numbers(), (std::vector<i32>{2, 1}));
+}
+
+TEST(NewEntry, ReportsAFailedCreationInTheCallersWords) {
+  list_of_int_t list;
+  const std::string output = output_of([&] {
+    const failing_allocation_t failing(1);
+    EXPECT_FALSE(append<i32>(list.get(), 2, reporter, texts));
+    EXPECT_TRUE(failing.happened());
+  });
+  EXPECT_EQ(output, bug("ll_create_entry", "calloc failed to allocate memory for the entry. ptr:PTR") +
+                        reported_error("No entry."));
+}
+
+TEST(NewEntry, IsFreedAgainWhenTheListRefusesIt) {
+  list_of_int_t list;
+  list->type = 1;
+  EXPECT_EQ(output_of([&] { EXPECT_FALSE(append<i32>(list.get(), 2, reporter, texts)); }),
+            bug("ll_add_entry_to_back",
+                "This entry represents a different type and cannot be added to this list. List:0x00000001 "
+                "Entry:0x00746E69") +
+                reported_error("Not added."));
+  EXPECT_EQ(list->size, 0u);
+}
+
+}  // namespace
+}  // namespace linked_list_tests
