@@ -23,7 +23,7 @@ using test_support::output_of;
 
 constexpr const char *compose = "compose_edid_internal";
 
-class FailingPipeline : public testing::Test {
+class FailingComposition : public testing::Test {
  protected:
   std::string failure() {
     return output_of([&] { EXPECT_FALSE(compose_edid_internal(nullptr, 0, new_.data(), 256, &cfg_, values_.get())); });
@@ -34,7 +34,7 @@ class FailingPipeline : public testing::Test {
   bytes_t new_ = bytes_t(256, 0xA5);
 };
 
-TEST_F(FailingPipeline, VideoModes) {
+TEST_F(FailingComposition, VideoModes) {
   values_->video_60_additional.magic ^= 1;
   const std::string output = failure();
   values_->video_60_additional.magic ^= 1;
@@ -44,12 +44,12 @@ TEST_F(FailingPipeline, VideoModes) {
   EXPECT_EQ(new_, bytes_t(256, 0xA5));
 }
 
-TEST_F(FailingPipeline, AudioFormats) {
-  // The only allocations before are those of the four selected modes and their candidates.
+TEST_F(FailingComposition, AudioFormats) {
+  // The only allocations before are those of the four selected modes.
   append_modes(values_->video_60_priority, {{16, 0}, {4, 0}, {2, 0}, {1, 0}});
   append_modes(values_->video_60_additional, {{16, 0}, {4, 0}, {2, 0}, {1, 0}});
   const std::string output = output_of([&] {
-    const test_support::failing_allocation_t failing(2 * 8 + 1);
+    const test_support::failing_allocation_t failing(2 * 4 + 1);
     EXPECT_FALSE(compose_edid_internal(nullptr, 0, new_.data(), 256, &cfg_, values_.get()));
   });
   EXPECT_EQ(output, test_support::bug_line("linked_list", "ll_create_entry",
@@ -59,7 +59,7 @@ TEST_F(FailingPipeline, AudioFormats) {
   EXPECT_EQ(new_, bytes_t(256, 0xA5));
 }
 
-TEST_F(FailingPipeline, Population) {
+TEST_F(FailingComposition, Population) {
   // A VIC that nobody knows, configured and confirmed by the caller's own lists.
   append_modes(values_->video_60_priority, {{100, 0}, {4, 0}, {2, 0}, {1, 0}});
   append_modes(values_->video_60_additional, {{100, 0}, {4, 0}, {2, 0}, {1, 0}});
@@ -71,7 +71,7 @@ TEST_F(FailingPipeline, Population) {
   EXPECT_EQ(new_, bytes_t(256, 0xA5));
 }
 
-TEST_F(FailingPipeline, Encoding) {
+TEST_F(FailingComposition, Encoding) {
   append_modes(values_->video_60_priority, {{16, 0}, {4, 0}, {2, 0}, {1, 0}});
   append_modes(values_->video_60_additional, {{16, 0}, {4, 0}, {2, 0}, {1, 0}});
   // An audio format of type 0 cannot be encoded; the sink's first one is never filtered out.
@@ -87,22 +87,7 @@ TEST_F(FailingPipeline, Encoding) {
           error(compose, "Failed encoding the new edid."));
 }
 
-std::string uninitialised_list() {
-  return error_line("linked_list", "ll_verify_integrity",
-                    "Corrupt List: List not initialized. Ptr:PTR ExpectedMagic:0 Magic:M Size:0 Head:(nil) ");
-}
-
-// The computed magic depends on where the list lies.
-std::string without_magic(std::string text) {
-  const std::string label = " Magic:";
-  for (std::size_t at = text.find(label); at != std::string::npos; at = text.find(label, at + 1)) {
-    const std::size_t start = at + label.size();
-    text.replace(start, text.find(' ', start) - start, "M");
-  }
-  return text;
-}
-
-TEST_F(FailingPipeline, ConfigurationIsCleanedUpBeforeTheOtherRecordsWerePrepared) {
+TEST_F(FailingComposition, ConfigurationIsCleanedUpBeforeTheOtherRecordsWerePrepared) {
   test_support::configuration_tree_t tree;
   tree.fill_completely();
   bool result = true;
@@ -113,19 +98,16 @@ TEST_F(FailingPipeline, ConfigurationIsCleanedUpBeforeTheOtherRecordsWerePrepare
   EXPECT_FALSE(result);
   const std::string unprepared =
       error_line("edid_decode_encode", "edid_destroy", "List is not initialized. List:standard_timing_list.");
-  EXPECT_EQ(without_magic(output), test_support::bug_line("linked_list", "ll_create_entry",
-                                                          "calloc failed to allocate memory for the entry. ptr:PTR") +
-                                       error("_read_platform_values", "Failed creating entry.") +
-                                       error(compose, "Failed trying to read the platform config file.") + unprepared +
-                                       error(compose, "Failed cleaning up edid.") + unprepared +
-                                       error(compose, "Failed cleaning up new_edid.") + uninitialised_list() +
-                                       test_support::bug_line("linked_list", "ll_delete_list",
-                                                              "Failed verifying integrity of the list. list:PTR") +
-                                       error(compose, "Failed cleaning up video list."));
+  EXPECT_EQ(output, test_support::bug_line("linked_list", "ll_create_entry",
+                                           "calloc failed to allocate memory for the entry. ptr:PTR") +
+                        error("_read_platform_values", "Failed creating entry.") +
+                        error(compose, "Failed trying to read the platform config file.") + unprepared +
+                        error(compose, "Failed cleaning up edid.") + unprepared +
+                        error(compose, "Failed cleaning up new_edid."));
   EXPECT_EQ(new_, bytes_t(256, 0xA5));
 }
 
-TEST_F(FailingPipeline, EveryAllocationThatFailsIsReportedAndLeaksNothing) {
+TEST_F(FailingComposition, EveryAllocationThatFailsIsReportedAndLeaksNothing) {
   test_support::configuration_tree_t tree;
   tree.fill_completely();
   tree.set("current_mode_set_to_priority", 1);

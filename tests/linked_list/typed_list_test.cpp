@@ -1,4 +1,4 @@
-// The two patterns over lists that the library repeats: the checked walk, and the new entry with its clean-up.
+// The patterns over lists that the library repeats: the checked walk, and adding and deleting elements.
 #include "linked_list/typed_list.h"
 
 #include "linked_list/list_fixture.h"
@@ -7,11 +7,12 @@
 namespace linked_list_tests {
 namespace {
 
-using edid_composer::append;
+using edid_composer::appender_t;
+using edid_composer::delete_elements;
 using edid_composer::init_list;
 using edid_composer::named_list_t;
-using edid_composer::new_entry_t;
 using edid_composer::new_entry_texts_t;
+using edid_composer::prepend;
 using edid_composer::site_t;
 using edid_composer::walk;
 using test_support::failing_allocation_t;
@@ -85,41 +86,72 @@ TEST(ElementTypes, AreNamedAfterTheirRecords) {
   EXPECT_TRUE(ll_verify_list_type(&list, "short_audio_desc_t"));
 }
 
-TEST(NewEntry, AppendsACopyOfARecord) {
-  list_of_int_t list{1};
-  EXPECT_EQ(output_of([&] { EXPECT_TRUE(append<i32>(list.get(), 2, reporter, texts)); }), "");
-  EXPECT_EQ(list.numbers(), (std::vector<i32>{1, 2}));
+TEST(ElementLookup, IsNullWithTheListsLinesWhenThereIsNone) {
+  list_of_int_t list{4, 5};
+  EXPECT_EQ(*edid_composer::entry_at<i32>(list.get(), 1), 5);
+  EXPECT_NE(output_of([&] { EXPECT_EQ(edid_composer::entry_at<i32>(list.get(), 2), nullptr); }), "");
 }
 
-TEST(NewEntry, GoesToTheFrontOnDemand) {
+TEST(Appender, AppendsCopiesAtTheEnd) {
   list_of_int_t list{1};
-  new_entry_t<i32> entry(reporter, texts);
-  ASSERT_TRUE(entry);
-  *entry = 2;
-  EXPECT_TRUE(entry.add_to_front(list.get()));
+  appender_t<i32> numbers(list.get(), reporter);
+  EXPECT_EQ(numbers.size(), 1);
+  EXPECT_EQ(output_of([&] {
+              for (const i32 number : {2, 3, 4})
+                EXPECT_TRUE(numbers.append(number));
+            }),
+            "");
+  EXPECT_EQ(list.numbers(), (std::vector<i32>{1, 2, 3, 4}));
+  EXPECT_EQ(numbers.size(), 4);
+  EXPECT_TRUE(ll_verify_integrity(list.get()));
+}
+
+TEST(Appender, ReportsAFailedCreationInItsWordsAndGoesOn) {
+  list_of_int_t list;
+  appender_t<i32> numbers(list.get(), reporter, texts);
+  EXPECT_TRUE(numbers.append(1));
+  for (const char *part : {"entry", "data storage"}) {
+    EXPECT_EQ(output_of([&] {
+                const failing_allocation_t failing(part == std::string("entry") ? 1 : 2);
+                EXPECT_FALSE(numbers.append(2));
+                EXPECT_TRUE(failing.happened());
+              }),
+              bug("ll_create_entry", std::string("calloc failed to allocate memory for the ") + part + ". ptr:PTR") +
+                  reported_error("No entry."));
+  }
+  EXPECT_TRUE(numbers.append(3));
+  EXPECT_EQ(list.numbers(), (std::vector<i32>{1, 3}));
+}
+
+TEST(Appender, FreesAnEntryThatTheListRefuses) {
+  list_of_int_t list;
+  list->type = 1;
+  const std::string different = "This entry represents a different type and cannot be added to";
+  const std::string types = " list. List:0x00000001 Entry:0x00746E69";
+  EXPECT_EQ(output_of([&] { EXPECT_FALSE(appender_t<i32>(list.get(), reporter, texts).append(2)); }),
+            bug("ll_add_entry_to_back", different + " this" + types) + reported_error("Not added."));
+  EXPECT_EQ(output_of([&] { EXPECT_FALSE(prepend<i32>(list.get(), 2, reporter)); }),
+            bug("ll_add_entry_to_front", different + "this" + types) +
+                reported_error("Failed adding entry to the back of the list."));
+  EXPECT_EQ(list->size, 0u);
+}
+
+TEST(Prepending, PutsACopyBeforeTheOthers) {
+  list_of_int_t list{1};
+  EXPECT_EQ(output_of([&] { EXPECT_TRUE(prepend<i32>(list.get(), 2, reporter)); }), "");
   EXPECT_EQ(list.numbers(), (std::vector<i32>{2, 1}));
 }
 
-TEST(NewEntry, ReportsAFailedCreationInTheCallersWords) {
-  list_of_int_t list;
-  const std::string output = output_of([&] {
-    const failing_allocation_t failing(1);
-    EXPECT_FALSE(append<i32>(list.get(), 2, reporter, texts));
-    EXPECT_TRUE(failing.happened());
+TEST(DeletingElements, LeavesASoundListOfTheOthers) {
+  list_of_int_t list{1, 2, 3, 4, 5};
+  std::vector<i32> places;
+  delete_elements<i32>(list.get(), 1, [&](i32 place, const i32 &number) {
+    places.push_back(place);
+    return number % 2 == 1;
   });
-  EXPECT_EQ(output, bug("ll_create_entry", "calloc failed to allocate memory for the entry. ptr:PTR") +
-                        reported_error("No entry."));
-}
-
-TEST(NewEntry, IsFreedAgainWhenTheListRefusesIt) {
-  list_of_int_t list;
-  list->type = 1;
-  EXPECT_EQ(output_of([&] { EXPECT_FALSE(append<i32>(list.get(), 2, reporter, texts)); }),
-            bug("ll_add_entry_to_back",
-                "This entry represents a different type and cannot be added to this list. List:0x00000001 "
-                "Entry:0x00746E69") +
-                reported_error("Not added."));
-  EXPECT_EQ(list->size, 0u);
+  EXPECT_EQ(places, (std::vector<i32>{1, 2, 3, 4}));
+  EXPECT_EQ(list.numbers(), (std::vector<i32>{1, 2, 4}));
+  EXPECT_TRUE(ll_verify_integrity(list.get()));
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cstdio>
 #include <string>
 #include <vector>
@@ -42,7 +43,7 @@ class Candidates : public testing::Test {
     return modes;
   }
 
-  candidates_t candidates_;
+  candidates_t candidates_{true};
   test_support::scoped_list_t<short_video_desc_t> extra_;
 };
 
@@ -62,6 +63,25 @@ TEST_F(Candidates, AreTheSinksWhenOneOfThemIs) {
   add({16, 0, true});
   add({16, 0, false});
   EXPECT_TRUE(candidates_.match({.native = 0, .vic = 16, .stereo = 0}).of_sink);
+}
+
+TEST_F(Candidates, MatchTheSameWhetherTheyAreKeptInOrderOrNot) {
+  candidates_t unordered(false);
+  for (u32 i = 0; i < 400; ++i) {
+    // VICs on both sides of the largest that a short video descriptor can hold.
+    const candidate_t candidate{100 + i * 7 % 50, 1U << i % 8, i % 5 == 0};
+    add(candidate);
+    EXPECT_TRUE(unordered.add(candidate, reporter));
+  }
+  EXPECT_EQ(unordered.size(), 400U);
+  for (u32 vic = 95; vic < 155; ++vic) {
+    const short_video_desc_t wanted{.native = 0, .vic = vic, .stereo = 0x5A};
+    const match_t match = candidates_.match(wanted);
+    EXPECT_EQ(match.found, vic >= 100 && vic < 150) << vic;
+    EXPECT_EQ(unordered.match(wanted).found, match.found) << vic;
+    EXPECT_EQ(unordered.match(wanted).of_sink, match.of_sink) << vic;
+    EXPECT_EQ(unordered.match(wanted).stereo, match.stereo) << vic;
+  }
 }
 
 TEST_F(Candidates, ThatAreRemovedMatchNothingAndDoNotCount) {
@@ -119,11 +139,10 @@ TEST_F(Candidates, OfAListThatWasNeverInitialisedAreReportedByTheirOwnAddress) {
 }
 
 TEST_F(Candidates, StopAtTheFirstOneThatThereIsNoMemoryFor) {
-  modes_t first_block;
-  for (u32 vic = 1; vic <= 64; ++vic)
-    first_block.emplace_back(vic, 0);
-  append_modes(*extra_, first_block);
-  append_modes(*extra_, {{1, 0}, {2, 0}});
+  modes_t many;
+  for (u32 i = 0; i < 200; ++i)
+    many.emplace_back(i, 0);
+  append_modes(*extra_, many);
   EXPECT_EQ(output_of([&] {
               const test_support::failing_allocation_t failing(3);
               EXPECT_FALSE(combine());
@@ -131,7 +150,10 @@ TEST_F(Candidates, StopAtTheFirstOneThatThereIsNoMemoryFor) {
             test_support::bug_line("linked_list", "ll_create_entry",
                                    "calloc failed to allocate memory for the entry. ptr:PTR") +
                 error("_combine_lists", "Failed creating entry."));
-  EXPECT_EQ(modes(), first_block);
+  const modes_t kept = modes();
+  EXPECT_FALSE(kept.empty());
+  EXPECT_LT(kept.size(), many.size());
+  EXPECT_TRUE(std::equal(kept.begin(), kept.end(), many.begin()));
 }
 
 }  // namespace

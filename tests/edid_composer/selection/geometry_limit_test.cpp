@@ -44,7 +44,7 @@ class GeometryLimit : public testing::Test {
   }
 
   test_support::scoped_list_t<short_video_desc_t> list_;
-  edid_composer::candidates_t candidates_;
+  edid_composer::candidates_t candidates_{true};
   edid_composer::journal_t journal_{false};
 };
 

@@ -249,8 +249,9 @@ TEST_F(VideoModeFilter, OutputListOfAnotherTypeFailsTheFilter) {
 
 TEST_F(VideoModeFilter, EveryFailedAllocationFailsTheFilterAndLeaksNothing) {
   append(sink_->dtd_list, timing_of_vic(16));
-  append_modes(sink_->video_list, {{4, 0}});
+  append_modes(sink_->video_list, {{4, 0}, {5, 0}});
   append_modes(values_->video_60_priority, {{16, 0}, {1, 0}, {4, 0}});
+  values_->geometry_limit = 1;
   values_->current_mode_set_to_priority = 1;
   cfg_.hdmi_current_mode = {1280, 720, 0, 60};
 
@@ -287,6 +288,7 @@ TEST_F(VideoModeFilter, WithoutMemoryForCandidatesNamesTheListThatTheyAreOf) {
   const std::string no_memory = test_support::bug_line("linked_list", "ll_create_entry",
                                                        "calloc failed to allocate memory for the entry. ptr:PTR") +
                                 error("_combine_lists", "Failed creating entry.");
+  values_->geometry_limit = 1;
   append_modes(values_->video_60_additional, {{5, 0}});
   EXPECT_EQ(failure(), no_memory + error(filter, "Failed combining 60Hz lists."));
   append_modes(sink_->video_list, {{4, 0}});
