@@ -6,7 +6,7 @@
 #include <cstring>
 #include <numeric>
 
-#include "edid_composer/platform_values_reader.h"
+#include "edid_composer/platform/platform_values_reader.h"
 #include "edid_decode_encode/record_fields.h"
 #include "failure_table.h"
 #include "sample.h"
