@@ -13,7 +13,7 @@ constexpr const char *function = "_decode_edid_dtd";
 
 bool decode(const bytes_t &descriptor, edid_t *edid) {
   const exact_bytes_t bytes(descriptor);
-  auto timings = edid_composer::detailed_timing_appender(edid);
+  auto timings = edid_composer::detailed_timing_appender(edid, nullptr);
   return edid_composer::_decode_edid_dtd(edid_composer::byte_view_t(bytes.data(), bytes.size()), &timings, edid);
 }
 

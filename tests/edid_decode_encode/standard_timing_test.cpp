@@ -8,7 +8,7 @@ namespace codec_test {
 TEST(StandardTiming, IsReadFromEachPairOfBytesUnlessItIsTheFillerAndWrittenAsTheSame) {
   for (u32 a = 0; a < 256; ++a) {
     scoped_edid_t edid;
-    auto timings = edid_composer::standard_timing_appender(edid.get());
+    auto timings = edid_composer::standard_timing_appender(edid.get(), nullptr);
     bytes_t expected;
     EXPECT_EQ(traced_output_of([&] {
                 for (u32 b = 0; b < 256; ++b) {
@@ -29,7 +29,7 @@ TEST(StandardTiming, IsReadFromEachPairOfBytesUnlessItIsTheFillerAndWrittenAsThe
 
 TEST(StandardTiming, HasItsFields) {
   scoped_edid_t edid;
-  auto timings = edid_composer::standard_timing_appender(edid.get());
+  auto timings = edid_composer::standard_timing_appender(edid.get(), nullptr);
   for (const auto &[a, b] : {std::pair<u8, u8>{0xD1, 0xFB}, {0x01, 0x41}, {0x00, 0x80}, {0xFF, 0x01}})
     EXPECT_TRUE(edid_composer::_decode_edid_standard_timing(a, b, &timings));
   EXPECT_EQ(test_support::std_timings_of(edid->std_timings),

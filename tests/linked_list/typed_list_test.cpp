@@ -8,12 +8,12 @@ namespace linked_list_tests {
 namespace {
 
 using edid_composer::appender_t;
-using edid_composer::delete_elements;
+using edid_composer::entry_arena_t;
 using edid_composer::init_list;
 using edid_composer::named_list_t;
 using edid_composer::new_entry_texts_t;
-using edid_composer::prepend;
 using edid_composer::site_t;
+using edid_composer::unlink_elements;
 using edid_composer::walk;
 using test_support::failing_allocation_t;
 using test_support::output_of;
@@ -94,7 +94,7 @@ TEST(ElementLookup, IsNullWithTheListsLinesWhenThereIsNone) {
 
 TEST(Appender, AppendsCopiesAtTheEnd) {
   list_of_int_t list{1};
-  appender_t<i32> numbers(list.get(), reporter);
+  appender_t<i32> numbers(list.get(), nullptr, reporter);
   EXPECT_EQ(numbers.size(), 1);
   EXPECT_EQ(output_of([&] {
               for (const i32 number : {2, 3, 4})
@@ -108,7 +108,7 @@ TEST(Appender, AppendsCopiesAtTheEnd) {
 
 TEST(Appender, ReportsAFailedCreationInItsWordsAndGoesOn) {
   list_of_int_t list;
-  appender_t<i32> numbers(list.get(), reporter, texts);
+  appender_t<i32> numbers(list.get(), nullptr, reporter, texts);
   EXPECT_TRUE(numbers.append(1));
   for (const char *part : {"entry", "data storage"}) {
     EXPECT_EQ(output_of([&] {
@@ -128,30 +128,56 @@ TEST(Appender, FreesAnEntryThatTheListRefuses) {
   list->type = 1;
   const std::string different = "This entry represents a different type and cannot be added to";
   const std::string types = " list. List:0x00000001 Entry:0x00746E69";
-  EXPECT_EQ(output_of([&] { EXPECT_FALSE(appender_t<i32>(list.get(), reporter, texts).append(2)); }),
+  EXPECT_EQ(output_of([&] { EXPECT_FALSE(appender_t<i32>(list.get(), nullptr, reporter, texts).append(2)); }),
             bug("ll_add_entry_to_back", different + " this" + types) + reported_error("Not added."));
-  EXPECT_EQ(output_of([&] { EXPECT_FALSE(prepend<i32>(list.get(), 2, reporter)); }),
+  EXPECT_EQ(output_of([&] { EXPECT_FALSE(appender_t<i32>(list.get(), nullptr, reporter).prepend(2)); }),
             bug("ll_add_entry_to_front", different + "this" + types) +
                 reported_error("Failed adding entry to the back of the list."));
   EXPECT_EQ(list->size, 0u);
 }
 
-TEST(Prepending, PutsACopyBeforeTheOthers) {
+TEST(Appender, PrependsACopyOnDemand) {
   list_of_int_t list{1};
-  EXPECT_EQ(output_of([&] { EXPECT_TRUE(prepend<i32>(list.get(), 2, reporter)); }), "");
+  EXPECT_EQ(output_of([&] { EXPECT_TRUE(appender_t<i32>(list.get(), nullptr, reporter).prepend(2)); }), "");
   EXPECT_EQ(list.numbers(), (std::vector<i32>{2, 1}));
 }
 
-TEST(DeletingElements, LeavesASoundListOfTheOthers) {
-  list_of_int_t list{1, 2, 3, 4, 5};
-  std::vector<i32> places;
-  delete_elements<i32>(list.get(), 1, [&](i32 place, const i32 &number) {
-    places.push_back(place);
+TEST(Arena, HoldsEntriesThatAreUnlinkedAndGoWithIt) {
+  entry_arena_t arena;
+  ll_list_t list{};
+  ASSERT_TRUE(init_list<i32>(&list));
+  appender_t<i32> numbers(&list, &arena, reporter);
+  std::vector<i32> expected;
+  for (i32 number = 0; number < 200; ++number) {
+    EXPECT_TRUE(numbers.append(number));
+    if (number == 0 || number % 2 == 0) expected.push_back(number);
+  }
+  i32 next_place = 1;
+  unlink_elements<i32>(&list, 1, [&](i32 place, const i32 &number) {
+    EXPECT_EQ(place, next_place++);
     return number % 2 == 1;
   });
-  EXPECT_EQ(places, (std::vector<i32>{1, 2, 3, 4}));
-  EXPECT_EQ(list.numbers(), (std::vector<i32>{1, 2, 4}));
-  EXPECT_TRUE(ll_verify_integrity(list.get()));
+  EXPECT_EQ(test_support::elements_of<i32>(list), expected);
+  EXPECT_TRUE(ll_verify_integrity(&list));
+}
+
+TEST(Arena, WithoutMemoryLeavesTheListAsItIs) {
+  entry_arena_t arena;
+  ll_list_t list{};
+  ASSERT_TRUE(init_list<i32>(&list));
+  appender_t<i32> numbers(&list, &arena, reporter);
+  EXPECT_TRUE(numbers.append(1));
+  EXPECT_EQ(output_of([&] {
+              const failing_allocation_t failing(1);
+              i32 kept = 1;
+              while (numbers.append(++kept))
+                ASSERT_LT(kept, 1000);
+              EXPECT_EQ(ll_size(&list), kept - 1);
+            }),
+            bug("ll_create_entry", "calloc failed to allocate memory for the entry. ptr:PTR") +
+                reported_error("Failed creating entry."));
+  EXPECT_TRUE(numbers.append(2));
+  EXPECT_TRUE(ll_verify_integrity(&list));
 }
 
 }  // namespace

@@ -25,7 +25,7 @@ class PhysicalAddress : public testing::Test {
   void sink_at(const address_t &address) { std::copy(address.begin(), address.end(), sink_->physical_address); }
   void port(u32 counted_from_1) { cfg_.port = counted_from_1 - 1; }
   address_t address() {
-    const auto placed = edid_composer::place_input({*sink_.get(), *values_.get(), cfg_});
+    const auto placed = edid_composer::place_input({*sink_.get(), *values_.get(), cfg_, nullptr});
     return std::to_array(placed.parts);
   }
   /// The address, and the one line that explains it.

@@ -28,20 +28,20 @@ TEST_F(PopulationFields, IdentityIsThePlatforms) {
   std::strcpy(values_->monitor_name, "Thirteen char");
   std::strcpy(values_->monitor_serial, "SN-1");
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(new_->product_code, 0xBEEFU);
-  EXPECT_EQ(new_->serial_number, 0xFFFFFFFFU);
-  EXPECT_EQ(new_->week, 255);
-  EXPECT_EQ(new_->year, 2014U);
-  EXPECT_STREQ(new_->manufacturer, "ABC");
-  EXPECT_STREQ(new_->monitor_name, "Thirteen char");
-  EXPECT_STREQ(new_->serial_string, "SN-1");
-  EXPECT_STREQ(new_->data_string, "");
+  EXPECT_EQ(new_.product_code, 0xBEEFU);
+  EXPECT_EQ(new_.serial_number, 0xFFFFFFFFU);
+  EXPECT_EQ(new_.week, 255);
+  EXPECT_EQ(new_.year, 2014U);
+  EXPECT_STREQ(new_.manufacturer, "ABC");
+  EXPECT_STREQ(new_.monitor_name, "Thirteen char");
+  EXPECT_STREQ(new_.serial_string, "SN-1");
+  EXPECT_STREQ(new_.data_string, "");
 }
 
 TEST_F(PopulationFields, WeekKeepsItsLowEightBits) {
   values_->week = 300;
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(new_->week, 44);
+  EXPECT_EQ(new_.week, 44);
 }
 
 TEST_F(PopulationFields, TextsWithoutEndAreCopiedToTheirFieldsSize) {
@@ -49,40 +49,40 @@ TEST_F(PopulationFields, TextsWithoutEndAreCopiedToTheirFieldsSize) {
   std::memset(values_->monitor_name, 'N', sizeof values_->monitor_name);
   std::memset(values_->monitor_serial, 'S', sizeof values_->monitor_serial);
   const std::string output = traced_output();
-  EXPECT_EQ(std::string(new_->manufacturer, 4), "MMMM");
-  EXPECT_EQ(std::string(new_->monitor_name, 14), std::string(14, 'N'));
-  EXPECT_EQ(std::string(new_->serial_string, 14), std::string(14, 'S'));
+  EXPECT_EQ(std::string(new_.manufacturer, 4), "MMMM");
+  EXPECT_EQ(std::string(new_.monitor_name, 14), std::string(14, 'N'));
+  EXPECT_EQ(std::string(new_.serial_string, 14), std::string(14, 'S'));
   EXPECT_NE(output.find(trace("_populate_new_edid", "\tManufacturer ID = MMMM")), std::string::npos);
   EXPECT_NE(output.find(trace("_populate_new_edid", "\tMonitor Name    = NNNNNNNNNNNNNN")), std::string::npos);
 }
 
 TEST_F(PopulationFields, FixedValuesOfTheBaseBlock) {
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(new_->version, 1);
-  EXPECT_EQ(new_->revision, 3);
-  EXPECT_EQ(new_->digital, 1);
-  EXPECT_EQ(new_->h_size_cm, 160);
-  EXPECT_EQ(new_->v_size_cm, 90);
-  EXPECT_EQ(new_->gamma, 120U);
-  EXPECT_EQ(new_->standby, 0);
-  EXPECT_EQ(new_->suspend, 0);
-  EXPECT_EQ(new_->active_off, 0);
-  EXPECT_EQ(new_->standard_colorspace, 1);
-  EXPECT_EQ(new_->preferred_timing, 1);
-  EXPECT_EQ(new_->gtf, 0);
-  EXPECT_EQ(new_->min_v_rate, 49);
-  EXPECT_EQ(new_->max_v_rate, 61);
-  EXPECT_EQ(new_->min_h_rate, 15);
-  EXPECT_EQ(new_->max_h_rate, 70);
-  EXPECT_EQ(new_->max_pixel_clock, 150U);
-  EXPECT_EQ(new_->basic_audio, 1);
-  EXPECT_EQ(new_->ycbcr_444, 1);
-  EXPECT_EQ(new_->ycbcr_422, 1);
-  EXPECT_EQ(new_->hdmi_present, 1);
-  EXPECT_EQ(new_->dc_48bit, 0);
-  EXPECT_EQ(new_->dvi_dual, 0);
-  EXPECT_EQ(new_->underscan, 0);
-  EXPECT_EQ(new_->valid, 0);
+  EXPECT_EQ(new_.version, 1);
+  EXPECT_EQ(new_.revision, 3);
+  EXPECT_EQ(new_.digital, 1);
+  EXPECT_EQ(new_.h_size_cm, 160);
+  EXPECT_EQ(new_.v_size_cm, 90);
+  EXPECT_EQ(new_.gamma, 120U);
+  EXPECT_EQ(new_.standby, 0);
+  EXPECT_EQ(new_.suspend, 0);
+  EXPECT_EQ(new_.active_off, 0);
+  EXPECT_EQ(new_.standard_colorspace, 1);
+  EXPECT_EQ(new_.preferred_timing, 1);
+  EXPECT_EQ(new_.gtf, 0);
+  EXPECT_EQ(new_.min_v_rate, 49);
+  EXPECT_EQ(new_.max_v_rate, 61);
+  EXPECT_EQ(new_.min_h_rate, 15);
+  EXPECT_EQ(new_.max_h_rate, 70);
+  EXPECT_EQ(new_.max_pixel_clock, 150U);
+  EXPECT_EQ(new_.basic_audio, 1);
+  EXPECT_EQ(new_.ycbcr_444, 1);
+  EXPECT_EQ(new_.ycbcr_422, 1);
+  EXPECT_EQ(new_.hdmi_present, 1);
+  EXPECT_EQ(new_.dc_48bit, 0);
+  EXPECT_EQ(new_.dvi_dual, 0);
+  EXPECT_EQ(new_.underscan, 0);
+  EXPECT_EQ(new_.valid, 0);
 }
 
 std::vector<u32> primaries_of(const edid_t &edid) {
@@ -99,10 +99,10 @@ TEST_F(PopulationFields, ColourPrimariesAreTheSinksWhenItsHeaderWasGood) {
   sink_->white_x = 7;
   sink_->white_y = 1023;
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(primaries_of(*new_.get()), (std::vector<u32>{640, 348, 287, 609, 159, 72, 290, 305}));
+  EXPECT_EQ(primaries_of(new_), (std::vector<u32>{640, 348, 287, 609, 159, 72, 290, 305}));
   sink_->valid = 1;
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(primaries_of(*new_.get()), (std::vector<u32>{1, 2, 3, 4, 5, 6, 7, 1023}));
+  EXPECT_EQ(primaries_of(new_), (std::vector<u32>{1, 2, 3, 4, 5, 6, 7, 1023}));
 }
 
 TEST_F(PopulationFields, TimingBytesArePlatformsWith640x480AtSixtyHertz) {
@@ -110,9 +110,9 @@ TEST_F(PopulationFields, TimingBytesArePlatformsWith640x480AtSixtyHertz) {
   values_->established_timings_2 = 0xFF;
   values_->manufacturer_timings = 0x80;
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(new_->est_timings_1, 0xA1U);
-  EXPECT_EQ(new_->est_timings_2, 0xFFU);
-  EXPECT_EQ(new_->man_timings, 0x80U);
+  EXPECT_EQ(new_.est_timings_1, 0xA1U);
+  EXPECT_EQ(new_.est_timings_2, 0xFFU);
+  EXPECT_EQ(new_.man_timings, 0x80U);
 }
 
 TEST_F(PopulationFields, StandardTimingsAreThePlatformsAndNotTheSinks) {
@@ -120,7 +120,7 @@ TEST_F(PopulationFields, StandardTimingsAreThePlatformsAndNotTheSinks) {
   append(values_->std_timings, std_timing_t{1920, 3, 75});
   append(sink_->std_timings, std_timing_t{640, 1, 60});
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(test_support::std_timings_of(new_->std_timings),
+  EXPECT_EQ(test_support::std_timings_of(new_.std_timings),
             (std::vector<test_support::std_timing_words_t>{{1280, 2, 60}, {1920, 3, 75}}));
   EXPECT_EQ(ll_size(&values_->std_timings), 2);
 }
@@ -129,7 +129,7 @@ TEST_F(PopulationFields, UnderscanIsAFlag) {
   for (const i32 value : {0, 1, 2, -1}) {
     values_->underscan = value;
     EXPECT_EQ(output(), "");
-    EXPECT_EQ(new_->underscan, value == 0 ? 0 : 1);
+    EXPECT_EQ(new_.underscan, value == 0 ? 0 : 1);
   }
 }
 
@@ -138,9 +138,9 @@ TEST_F(PopulationFields, SpeakersAreTheBytesOfTheirMask) {
     values_->speaker_entry = 0x7FF;
     return traced_output();
   }();
-  EXPECT_EQ(new_->speaker[0], 0xFF);
-  EXPECT_EQ(new_->speaker[1], 0x07);
-  EXPECT_EQ(new_->speaker[2], 0x00);
+  EXPECT_EQ(new_.speaker[0], 0xFF);
+  EXPECT_EQ(new_.speaker[1], 0x07);
+  EXPECT_EQ(new_.speaker[2], 0x00);
   EXPECT_NE(output.find(trace("_populate_new_edid", "\tspeaker = 3:0x00 2:0x07 1:0xFF")), std::string::npos);
   values_->speaker_entry = static_cast<i32>(0xAB345678);
   EXPECT_NE(traced_output().find(trace("_populate_new_edid", "\tspeaker = 3:0x34 2:0x56 1:0x78")), std::string::npos);
@@ -154,9 +154,9 @@ TEST_F(PopulationFields, Hdmi3dFollowsItsMode) {
     cfg_.hdmi_3d_mode = mode;
     sink_->hdmi_3d_present = static_cast<u8>(of_sink);
     EXPECT_EQ(output(), "");
-    EXPECT_EQ(new_->hdmi_3d_present, declared) << mode;
-    EXPECT_EQ(new_->image_size, declared) << mode;
-    EXPECT_EQ(new_->hdmi_video_present, declared) << mode;
+    EXPECT_EQ(new_.hdmi_3d_present, declared) << mode;
+    EXPECT_EQ(new_.image_size, declared) << mode;
+    EXPECT_EQ(new_.hdmi_video_present, declared) << mode;
   }
 }
 
@@ -164,12 +164,12 @@ TEST_F(PopulationFields, HdmiVideoIsPresentForA4kMode) {
   modes_4k_.add(3);
   modes_4k_.add(1);
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(new_->hdmi_video_present, 1);
-  EXPECT_EQ(new_->image_size, 0);
-  EXPECT_EQ(new_->hdmi_vic_len, 2);
-  EXPECT_EQ(new_->hdmi_vic[0], 3U);
-  EXPECT_EQ(new_->hdmi_vic[1], 1U);
-  EXPECT_EQ(new_->hdmi_vic[2], 0U);
+  EXPECT_EQ(new_.hdmi_video_present, 1);
+  EXPECT_EQ(new_.image_size, 0);
+  EXPECT_EQ(new_.hdmi_vic_len, 2);
+  EXPECT_EQ(new_.hdmi_vic[0], 3U);
+  EXPECT_EQ(new_.hdmi_vic[1], 1U);
+  EXPECT_EQ(new_.hdmi_vic[2], 0U);
 }
 
 TEST_F(PopulationFields, TriStateValuesAreOffOnOrTheSinks) {
@@ -182,7 +182,7 @@ TEST_F(PopulationFields, TriStateValuesAreOffOnOrTheSinks) {
       EXPECT_EQ(output(), "");
       const bool expected = value == 2 ? of_sink != 0 : value != 0;
       for (const u8 flag :
-           {new_->supports_ai, new_->xvycc601, new_->xvycc709, new_->cnc0, new_->cnc1, new_->cnc2, new_->cnc3}) {
+           {new_.supports_ai, new_.xvycc601, new_.xvycc709, new_.cnc0, new_.cnc1, new_.cnc2, new_.cnc3}) {
         EXPECT_EQ(flag, expected ? 1 : 0) << value << " " << int{of_sink};
       }
     }
@@ -196,13 +196,13 @@ TEST_F(PopulationFields, TriStateValuesAreIndependentOfEachOther) {
   sink_->cnc0 = sink_->cnc2 = sink_->cnc3 = 1;
   sink_->xvycc709 = 1;
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(new_->cnc0, 0);
-  EXPECT_EQ(new_->cnc1, 1);
-  EXPECT_EQ(new_->cnc2, 1);
-  EXPECT_EQ(new_->cnc3, 0);
-  EXPECT_EQ(new_->supports_ai, 0);
-  EXPECT_EQ(new_->xvycc601, 0);
-  EXPECT_EQ(new_->xvycc709, 1);
+  EXPECT_EQ(new_.cnc0, 0);
+  EXPECT_EQ(new_.cnc1, 1);
+  EXPECT_EQ(new_.cnc2, 1);
+  EXPECT_EQ(new_.cnc3, 0);
+  EXPECT_EQ(new_.supports_ai, 0);
+  EXPECT_EQ(new_.xvycc601, 0);
+  EXPECT_EQ(new_.xvycc709, 1);
 }
 
 struct deep_colour_t {
@@ -225,17 +225,17 @@ TEST_F(PopulationFields, DeepColourOf30BitsNeeds36) {
                                       "is supported. Please correct this in your platform configuration file. "
                                       "DC_30bit:true DC_36bit:false DC_48bit:false Setting 36bit support to true.")
                             : "");
-    EXPECT_EQ(new_->dc_30bit, colour.declared_30);
-    EXPECT_EQ(new_->dc_36bit, colour.declared_36);
-    EXPECT_EQ(new_->dc_48bit, 0);
-    EXPECT_EQ(new_->dc_y444, colour.declared_30 | colour.declared_36);
+    EXPECT_EQ(new_.dc_30bit, colour.declared_30);
+    EXPECT_EQ(new_.dc_36bit, colour.declared_36);
+    EXPECT_EQ(new_.dc_48bit, 0);
+    EXPECT_EQ(new_.dc_y444, colour.declared_30 | colour.declared_36);
   }
 }
 
 TEST_F(PopulationFields, SinksDeepColourIsNotTakenOver) {
   sink_->dc_30bit = sink_->dc_36bit = sink_->dc_48bit = sink_->dc_y444 = sink_->dvi_dual = 1;
   EXPECT_EQ(output(), "");
-  EXPECT_EQ(new_->dc_30bit | new_->dc_36bit | new_->dc_48bit | new_->dc_y444 | new_->dvi_dual, 0);
+  EXPECT_EQ(new_.dc_30bit | new_.dc_36bit | new_.dc_48bit | new_.dc_y444 | new_.dvi_dual, 0);
 }
 
 TEST_F(PopulationFields, LatencyIsTheSumOfTwoValidOnes) {
@@ -270,7 +270,7 @@ TEST_F(PopulationFields, LatencyIsTheSumOfTwoValidOnes) {
       std::array<u32, 4> expected{3, 3, 3, 3};
       expected[field] = sum;
       EXPECT_EQ(
-          (std::array<u32, 4>{new_->video_latency, new_->audio_latency, new_->i_video_latency, new_->i_audio_latency}),
+          (std::array<u32, 4>{new_.video_latency, new_.audio_latency, new_.i_video_latency, new_.i_audio_latency}),
           expected)
           << platform << " " << of_sink;
     }

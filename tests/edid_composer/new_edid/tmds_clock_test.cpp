@@ -70,7 +70,7 @@ TEST_F(TmdsClock, IsDeclaredForDeepColour) {
 TEST_F(TmdsClock, Of30BitDeepColourIsThatOf36) {
   values_->dc_30bit = 1;
   output();
-  EXPECT_EQ(new_->max_tmds_clock, 225U);
+  EXPECT_EQ(new_.max_tmds_clock, 225U);
 }
 
 TEST_F(TmdsClock, IsAtLeast297MegahertzFor4kModes) {

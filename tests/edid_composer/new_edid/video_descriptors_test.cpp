@@ -22,7 +22,7 @@ constexpr const char *function = "_populate_new_edid";
 
 class PopulationModes : public composer_fixtures::Population {
  protected:
-  modes_t new_modes() { return test_support::modes_of(new_->video_list); }
+  modes_t new_modes() { return test_support::modes_of(new_.video_list); }
 };
 
 std::string too_few(int count) {
@@ -43,7 +43,7 @@ std::string unknown_vic(u32 vic) {
 TEST_F(PopulationModes, FirstTwoAreTheDetailedTimings) {
   select({{31, 5}, {5, 0}, {19, 0}, {16, 0}});
   EXPECT_EQ(output(), "");
-  const auto timings = test_support::elements_of<detailed_timing_t>(new_->dtd_list);
+  const auto timings = test_support::elements_of<detailed_timing_t>(new_.dtd_list);
   ASSERT_EQ(timings.size(), 2U);
   const detailed_timing_t first = test_support::timing_of_vic(31);
   const detailed_timing_t second = test_support::timing_of_vic(5);
@@ -58,7 +58,7 @@ TEST_F(PopulationModes, NoneBecomeFourOfVic1) {
   select({});
   EXPECT_EQ(output(), empty_list + too_few(0) + too_few(1) + too_few(2) + too_few(3));
   EXPECT_EQ(new_modes(), (modes_t{{1, 0}, {1, 0}, {1, 0}, {1, 0}}));
-  const auto timings = test_support::elements_of<detailed_timing_t>(new_->dtd_list);
+  const auto timings = test_support::elements_of<detailed_timing_t>(new_.dtd_list);
   ASSERT_EQ(timings.size(), 2U);
   EXPECT_EQ(timings[1].h_active, 640U);
 }
@@ -72,10 +72,10 @@ TEST_F(PopulationModes, ThreeArePaddedByOne) {
 TEST_F(PopulationModes, UnknownVicAmongTheFirstTwoFails) {
   select({{16, 0}, {65, 0}, {4, 0}, {1, 0}});
   prepare();
-  EXPECT_EQ(test_support::output_of([&] { EXPECT_FALSE(populate()); }),
+  EXPECT_EQ(test_support::output_of([&] { EXPECT_FALSE(populate(&arena_)); }),
             unknown_vic(65) + bug("_maximum_pixel_clock", "\tFailed converting VIC:65 to a DTD.") + unknown_vic(65) +
                 error(function, "Error converting vic to dtd. Vic:65:Unknown Value"));
-  EXPECT_EQ(ll_size(&new_->dtd_list), 1);
+  EXPECT_EQ(ll_size(&new_.dtd_list), 1);
 }
 
 TEST_F(PopulationModes, UnknownVicBehindTheFirstTwoIsCarriedThrough) {
@@ -86,28 +86,31 @@ TEST_F(PopulationModes, UnknownVicBehindTheFirstTwoIsCarriedThrough) {
 
 TEST_F(PopulationModes, EveryFailedAllocationOfAModeFailsThePopulation) {
   select({{16, 0}, {4, 0}, {2, 0}});
-  // Two allocations each: the padding, two timings.
-  for (int nth = 1; nth <= 7; ++nth) {
+  bool failed = true;
+  u32 room = 0;
+  for (; failed; room += 8) {
     prepare();
-    bool result = false;
+    edid_composer::entry_arena_t arena;
+    composer_fixtures::leave_room(&arena, room);
     const std::string output = test_support::output_of([&] {
-      const test_support::failing_allocation_t failing(nth);
-      result = populate();
+      const test_support::failing_allocation_t failing(1);
+      EXPECT_EQ(populate(&arena), !failing.happened());
+      failed = failing.happened();
     });
-    EXPECT_EQ(result, nth == 7);
     const std::string failure = test_support::bug_line("linked_list", "ll_create_entry",
-                                                       std::string("calloc failed to allocate memory for the ") +
-                                                           (nth % 2 == 1 ? "entry" : "data storage") + ". ptr:PTR") +
+                                                       "calloc failed to allocate memory for the entry. ptr:PTR") +
                                 error(function, "Failed creating entry.");
-    EXPECT_EQ(output, too_few(3) + (nth == 7 ? "" : failure));
+    EXPECT_EQ(output, too_few(3) + (failed ? failure : ""));
   }
+  // The padding, two timings.
+  EXPECT_GT(room, 3 * sizeof(ll_entry_t) + 2 * sizeof(detailed_timing_t));
 }
 
 TEST_F(PopulationModes, NewRecordsListThatRefusesATimingFailsThePopulation) {
   prepare();
-  ASSERT_TRUE(ll_delete_list(&new_->dtd_list));
-  ASSERT_TRUE(ll_init(&new_->dtd_list, "int"));
-  const std::string output = test_support::output_of([&] { EXPECT_FALSE(populate()); });
+  ASSERT_TRUE(ll_delete_list(&new_.dtd_list));
+  ASSERT_TRUE(ll_init(&new_.dtd_list, "int"));
+  const std::string output = test_support::output_of([&] { EXPECT_FALSE(populate(&arena_)); });
   EXPECT_EQ(test_support::count_of(output, "\n"), 2) << output;
   EXPECT_NE(output.find("ll_add_entry_to_back() BUG: This entry represents a different type"), std::string::npos);
   EXPECT_NE(output.find(error(function, "Failed adding entry to the back of the list.")), std::string::npos);

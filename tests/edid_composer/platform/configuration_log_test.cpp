@@ -97,7 +97,8 @@ TEST(ConfigurationLog, EmptyConfigurationIsReportedKeyByKeyInTheOrderOfReading) 
   const configuration_tree_t tree;
   platform_values_t values;
   ASSERT_TRUE(platform_values_init(&values));
-  EXPECT_EQ(test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values)); }), expected_log(false));
+  EXPECT_EQ(test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values, nullptr)); }),
+            expected_log(false));
   EXPECT_TRUE(platform_values_destroy(&values));
 }
 
@@ -105,7 +106,8 @@ TEST(ConfigurationLog, EmptyConfigurationIsTracedKeyByKeyToo) {
   const configuration_tree_t tree;
   platform_values_t values;
   ASSERT_TRUE(platform_values_init(&values));
-  EXPECT_EQ(test_support::traced_output_of([&] { EXPECT_TRUE(_read_platform_values(&values)); }), expected_log(true));
+  EXPECT_EQ(test_support::traced_output_of([&] { EXPECT_TRUE(_read_platform_values(&values, nullptr)); }),
+            expected_log(true));
   EXPECT_TRUE(platform_values_destroy(&values));
 }
 
@@ -113,7 +115,7 @@ TEST(ConfigurationLog, EmptyConfigurationYieldsTheDefaults) {
   const configuration_tree_t tree;
   platform_values_t values;
   ASSERT_TRUE(platform_values_init(&values));
-  test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values)); });
+  test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values, nullptr)); });
 
   test_support::scoped_values_t defaults;
   EXPECT_EQ(values.native_refresh_rate, 60);
@@ -141,7 +143,7 @@ TEST(ConfigurationLog, EveryPathIsAskedForOnceAndFromTheRoot) {
   const configuration_tree_t tree;
   platform_values_t values;
   ASSERT_TRUE(platform_values_init(&values));
-  test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values)); });
+  test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values, nullptr)); });
   EXPECT_TRUE(platform_values_destroy(&values));
 
   std::vector<std::string> paths;
@@ -187,7 +189,7 @@ TEST(ConfigurationLog, TextsAreAskedForWithTheSizesOfTheirFields) {
   const configuration_tree_t tree;
   platform_values_t values;
   ASSERT_TRUE(platform_values_init(&values));
-  test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values)); });
+  test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values, nullptr)); });
   EXPECT_TRUE(platform_values_destroy(&values));
   std::vector<u32> sizes;
   for (const auto &call : tree.calls()) {
@@ -204,7 +206,8 @@ TEST(ConfigurationLog, FinalValueIsTracedAndUnsignedNumbersAsSignedOnes) {
   tree.set("year", 1985);
   platform_values_t values;
   ASSERT_TRUE(platform_values_init(&values));
-  const std::string output = test_support::traced_output_of([&] { EXPECT_TRUE(_read_platform_values(&values)); });
+  const std::string output =
+      test_support::traced_output_of([&] { EXPECT_TRUE(_read_platform_values(&values, nullptr)); });
   const std::string expected =
       trace("get_pc_uint", "Platform config read. Path:" + domain + "serial val:-1") +
       trace("get_pc_uint", "Platform config read. Path:" + domain + "week val:100") +

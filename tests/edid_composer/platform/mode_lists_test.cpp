@@ -159,7 +159,7 @@ TEST_P(VideoListReader, ReadsTheListOfItsType) {
     tree_.add(key, std::string(key == std::string(GetParam().key) ? "16 FP" : "1"));
   }
   const std::string node = std::string("Node:Name of node is:");
-  EXPECT_EQ(traced_output_of([&] { _get_platform_list(GetParam().type, list_.get()); }),
+  EXPECT_EQ(traced_output_of([&] { _get_platform_list(GetParam().type, list_.get(), nullptr); }),
             trace("_get_platform_list", std::string("Reading ") + GetParam().reading + " list from platform config.") +
                 trace("print_platform_node", "\tRoot " + node + GetParam().key) +
                 trace("print_platform_node", "\tFirst Child " + node + "entry_0") +
@@ -172,18 +172,19 @@ TEST_P(VideoListReader, ReadsTheListOfItsType) {
 
 TEST_P(VideoListReader, ReportsAnEmptyListByItsType) {
   tree_.add_list(GetParam().key);
-  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get()); }),
+  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get(), nullptr); }),
             empty_list(std::to_string(GetParam().type)));
 }
 
 TEST_P(VideoListReader, ReportsAMissingNodeAndThenTheEmptyList) {
-  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get()); }),
+  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get(), nullptr); }),
             unabled(domain + GetParam().key) + empty_list(std::to_string(GetParam().type)));
 }
 
 TEST_P(VideoListReader, KeepsWhatTheDestinationHeldAndCallsItNotEmpty) {
   test_support::append_modes(*list_, {{4, 0}});
-  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get()); }), unabled(domain + GetParam().key));
+  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get(), nullptr); }),
+            unabled(domain + GetParam().key));
   EXPECT_EQ(ll_size(list_.get()), 1);
 }
 
@@ -202,7 +203,7 @@ TEST(PlatformModeLists, MissingListsLeaveTheirDestinationsAlone) {
   EXPECT_EQ(output_of([&] {
               _get_4k_x_2k_modes("4k_x_2k_priority_list", modes);
               _get_est_timing_list("established_timings_1", &mask);
-              _get_std_timing_list(timings.get());
+              _get_std_timing_list(timings.get(), nullptr);
             }),
             unabled(domain + "4k_x_2k_priority_list") + unabled(domain + "established_timings_1") +
                 unabled(domain + "standard_timings"));

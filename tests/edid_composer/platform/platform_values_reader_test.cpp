@@ -33,7 +33,7 @@ class PlatformValuesReader : public testing::Test {
   ~PlatformValuesReader() override { EXPECT_TRUE(platform_values_destroy(&values_)); }
 
   std::string read() {
-    return output_of([&] { EXPECT_TRUE(_read_platform_values(&values_)); });
+    return output_of([&] { EXPECT_TRUE(_read_platform_values(&values_, nullptr)); });
   }
 
   configuration_tree_t tree_;
@@ -315,7 +315,7 @@ TEST_F(PlatformValuesReader, AudioEntriesAreTakenInLetterOrderWithGaps) {
 
 TEST_F(PlatformValuesReader, AudioEntriesAreTracedByNobody) {
   tree_.fill_completely();
-  const std::string output = traced_output_of([&] { EXPECT_TRUE(_read_platform_values(&values_)); });
+  const std::string output = traced_output_of([&] { EXPECT_TRUE(_read_platform_values(&values_, nullptr)); });
   EXPECT_EQ(output.find("audio.entry"), std::string::npos);
 }
 
@@ -335,7 +335,7 @@ TEST_F(PlatformValuesReader, AudioEntryThatIsNotAcceptedEndsTheReadingAtOnce) {
   ASSERT_TRUE(ll_delete_list(&values_.audio_list));
   ASSERT_TRUE(ll_init(&values_.audio_list, "std_timing_t"));
   bool result = true;
-  const std::string output = output_of([&] { result = _read_platform_values(&values_); });
+  const std::string output = output_of([&] { result = _read_platform_values(&values_, nullptr); });
   EXPECT_FALSE(result);
   EXPECT_EQ(test_support::count_of(output, "\n"), 2) << output;
   EXPECT_NE(
@@ -358,7 +358,7 @@ TEST_F(PlatformValuesReader, AudioEntryWithoutMemoryEndsTheReadingAtOnce) {
     bool result = true;
     const std::string output = output_of([&, nth = nth] {
       const test_support::failing_allocation_t failing(nth);
-      result = _read_platform_values(&values_);
+      result = _read_platform_values(&values_, nullptr);
     });
     EXPECT_FALSE(result);
     EXPECT_EQ(output,

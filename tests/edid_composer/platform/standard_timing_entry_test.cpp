@@ -57,7 +57,7 @@ class StandardTimingEntry : public testing::Test {
     tree_.clear();
     for (const std::string &entry : entries)
       tree_.add("standard_timings", entry);
-    return output_of([&] { _get_std_timing_list(list_.get()); });
+    return output_of([&] { _get_std_timing_list(list_.get(), nullptr); });
   }
   timings_t timings() { return test_support::std_timings_of(*list_); }
 
@@ -161,13 +161,13 @@ TEST_F(StandardTimingEntry, NumbersThatFillTheBufferLeaveNoneBehindIt) {
   // The third number ends at the last byte, so the fraction would begin behind the buffer.
   const edid_composer::configuration_entry_t entry{"standard_timings", "node", -1, "00000000008 0000000008 000061"};
   ASSERT_EQ(std::strlen(entry.text), sizeof entry.text - 1);
-  EXPECT_EQ(output_of([&] { EXPECT_TRUE(_get_std_timing_callback(entry, list_.get())); }), "");
+  EXPECT_EQ(output_of([&] { EXPECT_TRUE(_get_std_timing_callback(entry, list_.get(), nullptr)); }), "");
   EXPECT_EQ(timings(), (timings_t{{8, 0, 61}}));
 }
 
 TEST_F(StandardTimingEntry, RatioThatIsNoneIsTracedByTheConversion) {
   tree_.add("standard_timings", std::string("1280 1000 60"), "node");
-  EXPECT_EQ(test_support::traced_output_of([&] { _get_std_timing_list(list_.get()); }),
+  EXPECT_EQ(test_support::traced_output_of([&] { _get_std_timing_list(list_.get(), nullptr); }),
             composer_lines::trace("print_platform_node", "\tRoot Node:Name of node is:standard_timings") +
                 composer_lines::trace("print_platform_node", "\tFirst Child Node:Name of node is:node") +
                 composer_lines::trace("print_platform_node", "\tNext Node:Name of node is:node") +
@@ -189,7 +189,7 @@ TEST_F(StandardTimingEntry, WithoutMemoryIsReportedAndTheWalkGoesOn) {
   tree_.add("standard_timings", std::string("1920 1080 60"));
   EXPECT_EQ(output_of([&] {
               const test_support::failing_allocation_t failing(2);
-              _get_std_timing_list(list_.get());
+              _get_std_timing_list(list_.get(), nullptr);
             }),
             test_support::bug_line("linked_list", "ll_create_entry",
                                    "calloc failed to allocate memory for the data storage. ptr:PTR") +

@@ -3,10 +3,12 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <string>
 #include <vector>
 
 #include "edid_composer/composer_lines.h"
+#include "edid_composer/stage_fixture.h"
 #include "support/failing_allocation.h"
 #include "support/output_capture.h"
 #include "support/records.h"
@@ -45,7 +47,7 @@ constexpr short_audio_desc_t sink_pcm_6ch{1, 6, 0x07, 0x7, 0, 0, 0};
 constexpr short_audio_desc_t sink_ac3{2, 8, 0x07, 0, 448, 0, 0};
 constexpr short_audio_desc_t sink_eac3{10, 8, 0x04, 0, 0, 1, 0};
 
-class AudioFormatFilter : public testing::Test {
+class AudioFormatFilter : public composer_fixtures::Stage {
  protected:
   void platform(const std::vector<i32> &entries) {
     for (const i32 entry : entries)
@@ -58,7 +60,7 @@ class AudioFormatFilter : public testing::Test {
   bool run(u32 mask, u32 sink_filter, ll_list_t *formats) {
     cfg_.audio_mask = mask;
     cfg_.audio_sink_filter = sink_filter;
-    return _filter_audio_formats({*sink_.get(), *values_.get(), cfg_}, formats, &journal_);
+    return _filter_audio_formats(inputs(), formats, &journal_);
   }
   bool run(u32 mask, u32 sink_filter) { return run(mask, sink_filter, formats_.get()); }
   /// The selection, by a run that succeeds and prints nothing.
@@ -67,11 +69,7 @@ class AudioFormatFilter : public testing::Test {
     return test_support::audio_of(*formats_);
   }
 
-  test_support::scoped_edid_t sink_;
-  test_support::scoped_values_t values_;
-  test_support::scoped_list_t<short_audio_desc_t> formats_;
-  compose_cfg_t cfg_ = test_support::plain_settings();
-  edid_composer::journal_t journal_{false};
+  composer_fixtures::arena_list_t<short_audio_desc_t> formats_{&arena_};
 };
 
 TEST_F(AudioFormatFilter, OffersBasicAudioWhenThereIsNothingElse) {
@@ -245,7 +243,7 @@ TEST_F(AudioFormatFilter, ListOfAnotherTypeIsReportedAndGoneThrough) {
 }
 
 TEST_F(AudioFormatFilter, OutputListThatRefusesAFormatFailsTheFilter) {
-  test_support::scoped_list_t<i32> wrong;
+  composer_fixtures::arena_list_t<i32> wrong(&arena_);
   const auto refusal = [&] { return output_of([&] { EXPECT_FALSE(run(everything, 0, wrong.get())); }); };
   // Basic audio, added to the front, says "back" as well.
   std::string output = refusal();
@@ -258,28 +256,26 @@ TEST_F(AudioFormatFilter, OutputListThatRefusesAFormatFailsTheFilter) {
   EXPECT_EQ(test_support::count_of(output, error(filter, "Failed adding entry to the back of the list.")), 1);
 }
 
-TEST_F(AudioFormatFilter, EveryFailedAllocationFailsTheFilterAndKeepsWhatStood) {
+TEST_F(AudioFormatFilter, EveryFormatThatThereIsNoMemoryForFailsTheFilterAndKeepsWhatStood) {
   values_->audio_pass_through = 1;
   platform({ac3_6ch});
   sink({sink_eac3});
-  for (int nth = 1; nth <= 7; ++nth) {
+  bool failed = true;
+  for (u32 room = 0; failed; room += 8) {
+    edid_composer::entry_arena_t arena;
+    composer_fixtures::leave_room(&arena, room);
     test_support::scoped_list_t<short_audio_desc_t> formats;
-    bool result = false;
     const std::string output = output_of([&] {
-      const test_support::failing_allocation_t failing(nth);
-      result = run(everything, 0, formats.get());
+      const test_support::failing_allocation_t failing(1);
+      EXPECT_EQ(_filter_audio_formats(inputs(&arena), formats.get(), &journal_), !failing.happened());
+      failed = failing.happened();
     });
-    if (nth == 7) {  // Three formats, of two allocations each.
-      EXPECT_TRUE(result);
-      EXPECT_EQ(output, "");
-      continue;
-    }
-    EXPECT_FALSE(result);
-    EXPECT_EQ(output, test_support::bug_line("linked_list", "ll_create_entry",
-                                             std::string("calloc failed to allocate memory for the ") +
-                                                 (nth % 2 == 1 ? "entry" : "data storage") + ". ptr:PTR") +
-                          error(filter, "Failed creating entry."));
-    EXPECT_EQ(ll_size(formats.get()), (nth - 1) / 2);
+    EXPECT_EQ(output, failed ? test_support::bug_line("linked_list", "ll_create_entry",
+                                                      "calloc failed to allocate memory for the entry. ptr:PTR") +
+                                   error(filter, "Failed creating entry.")
+                             : "");
+    EXPECT_EQ(ll_size(formats.get()), std::min(3U, room / 64)) << room;
+    *formats = {};
   }
 }
 

@@ -1,28 +1,19 @@
-// Comparing audio formats with those of a list and of a sink, and masks of audio types.
+// Comparing audio formats with those of a list and of a sink.
 #include "edid_composer/selection/audio_matching.h"
 
 #include <gtest/gtest.h>
 
 #include <optional>
-#include <vector>
 
-#include "edid_composer/composer_lines.h"
-#include "edid_composer/selection/audio_formats.h"
-#include "support/output_capture.h"
 #include "support/records.h"
 
 namespace {
 
-using composer_lines::trace;
 using edid_composer::_audio_format_in_downstream_sink;
 using edid_composer::_audio_format_in_list;
-using edid_composer::_audio_type_to_audio_mask;
-using edid_composer::_create_audio_mask;
-using edid_composer::_filter_audio_list_with_mask;
 using edid_composer::is_basic_audio;
 using test_support::append;
 using test_support::audio_words_t;
-using test_support::output_of;
 using test_support::words_of;
 
 short_audio_desc_t pcm(u32 channels, u32 frequencies = 7, u32 bits = 5) {
@@ -33,31 +24,12 @@ short_audio_desc_t of_type(u32 type, u32 frequencies = 7) {
   return {type, 6, frequencies, 0, 0, 0, 0};
 }
 
-TEST(AudioMask, HasABitForEachTypeBut15) {
-  EXPECT_EQ(_audio_type_to_audio_mask(0), 0U);
-  for (u32 type = 1; type <= 14; ++type)
-    EXPECT_EQ(_audio_type_to_audio_mask(type), 1U << (type - 1)) << type;
-  EXPECT_EQ(_audio_type_to_audio_mask(15), 0U);
-  EXPECT_EQ(_audio_type_to_audio_mask(16), 0x4000U);
-  EXPECT_EQ(_audio_type_to_audio_mask(17), 0x8000U);
-  EXPECT_EQ(_audio_type_to_audio_mask(18), 0x10000U);
-  for (const u32 type : {19U, 32U, 33U, 0x7FFFFFFFU, 0xFFFFFFFFU})
-    EXPECT_EQ(_audio_type_to_audio_mask(type), 0U) << type;
-}
-
 class AudioList : public testing::Test {
  protected:
   std::optional<i32> place_of(const short_audio_desc_t &audio) { return _audio_format_in_list(list_.get(), audio); }
 
   test_support::scoped_list_t<short_audio_desc_t> list_;
 };
-
-TEST_F(AudioList, MaskIsThatOfAllItsTypes) {
-  EXPECT_EQ(_create_audio_mask(list_.get()), 0U);
-  for (const u32 type : {1U, 1U, 7U, 18U, 0U, 15U, 40U})
-    append(*list_, of_type(type));
-  EXPECT_EQ(_create_audio_mask(list_.get()), 0x10041U);
-}
 
 TEST_F(AudioList, HoldsNothingWhenEmpty) {
   EXPECT_EQ(place_of(pcm(2)), std::nullopt);
@@ -161,52 +133,6 @@ TEST_F(AudioInSink, MonoPcmMatchesNothing) {
 TEST_F(AudioInSink, SampleSizesOfOtherTypesAreNotCompared) {
   sink_has({2, 2, 7, 0x2, 0, 0, 0});
   EXPECT_EQ(left_of({2, 6, 7, 0x5, 0, 0, 0}), (audio_words_t{2, 2, 7, 0x5, 0, 0, 0}));
-}
-
-class AudioListMask : public AudioList {
- protected:
-  std::vector<u32> types_after(u32 mask) {
-    EXPECT_EQ(output_of([&] { _filter_audio_list_with_mask(list_.get(), mask, &journal_); }), "");
-    std::vector<u32> types;
-    for (const auto &audio : test_support::elements_of<short_audio_desc_t>(*list_))
-      types.push_back(audio.type);
-    return types;
-  }
-
-  edid_composer::journal_t journal_{false};
-};
-
-TEST_F(AudioListMask, RemovesTheTypesItLacksButNeverTheFirstEntry) {
-  for (const u32 type : {2U, 1U, 7U})
-    append(*list_, of_type(type));
-  EXPECT_EQ(types_after(0x1), (std::vector<u32>{2, 1}));
-}
-
-TEST_F(AudioListMask, OfNothingLeavesTheFirstEntry) {
-  for (const u32 type : {7U, 1U, 7U, 18U})
-    append(*list_, of_type(type));
-  EXPECT_EQ(types_after(0), (std::vector<u32>{7}));
-}
-
-TEST_F(AudioListMask, OfEverythingRemovesTypesWithoutBit) {
-  for (const u32 type : {0U, 15U, 16U, 0U, 19U, 18U, 14U})
-    append(*list_, of_type(type));
-  EXPECT_EQ(types_after(0xFFFFFFFF), (std::vector<u32>{0, 16, 18, 14}));
-}
-
-TEST_F(AudioListMask, LeavesAnEmptyListEmpty) {
-  EXPECT_EQ(types_after(0), std::vector<u32>{});
-}
-
-TEST_F(AudioListMask, IsTracedBackwardsWithoutTheFirstEntry) {
-  append(*list_, of_type(2));
-  append(*list_, pcm(2));
-  append(*list_, of_type(16, 0));
-  const auto line = [](const char *message) { return trace("_filter_audio_list_with_mask", message); };
-  EXPECT_EQ(test_support::traced_output_of([&] { _filter_audio_list_with_mask(list_.get(), 0x1, &journal_); }),
-            line("\tMask:0x00000001") + line("_filter_audio_list_with_mask() - Printing reverse formats\n") +
-                line("\t\tFormat:") + "Code: 16:HE AAC Channels:6 Freq: NoFreqSpecified\n" + line("\t\tFormat:") +
-                "Code: 1:PCM Channels:2 Freq:32kHz 44.1kHz 48kHz  Bits:16bits 24bits \n");
 }
 
 }  // namespace

@@ -43,7 +43,8 @@ class Candidates : public testing::Test {
     return modes;
   }
 
-  candidates_t candidates_{true};
+  edid_composer::entry_arena_t arena_;
+  candidates_t candidates_{true, &arena_};
   test_support::scoped_list_t<short_video_desc_t> extra_;
 };
 
@@ -66,7 +67,7 @@ TEST_F(Candidates, AreTheSinksWhenOneOfThemIs) {
 }
 
 TEST_F(Candidates, MatchTheSameWhetherTheyAreKeptInOrderOrNot) {
-  candidates_t unordered(false);
+  candidates_t unordered(false, &arena_);
   for (u32 i = 0; i < 400; ++i) {
     // VICs on both sides of the largest that a short video descriptor can hold.
     const candidate_t candidate{100 + i * 7 % 50, 1U << i % 8, i % 5 == 0};

@@ -8,6 +8,7 @@
 
 #include "edid_composer/composer_lines.h"
 #include "edid_composer/selection/video_modes.h"
+#include "edid_composer/stage_fixture.h"
 #include "support/output_capture.h"
 #include "support/records.h"
 
@@ -25,25 +26,19 @@ using modes_t = std::vector<test_support::mode_pair_t>;
 
 constexpr const char *filter = "_filter_video_modes";
 
-class CurrentMode : public testing::Test {
+class CurrentMode : public composer_fixtures::Stage {
  protected:
   CurrentMode() {
     values_->current_mode_set_to_priority = 1;
     append_modes(values_->video_60_priority, {{4, 1}, {16, 5}, {2, 0}, {16, 4}});
     append_modes(values_->video_60_additional, {{16, 5}, {2, 0}, {4, 5}});
   }
-  bool run(ll_list_t *selected) {
-    return _filter_video_modes({*sink_.get(), *values_.get(), cfg_}, selected, &journal_).complete;
-  }
+  bool run(ll_list_t *selected) { return _filter_video_modes(inputs(), selected, &journal_).complete; }
   bool run() { return run(selected_.get()); }
   modes_t selected() { return test_support::modes_of(*selected_); }
 
   const modes_t unchanged_{{4, 1}, {16, 5}, {2, 0}, {16, 4}};
-  test_support::scoped_edid_t sink_;
-  test_support::scoped_values_t values_;
-  test_support::scoped_list_t<short_video_desc_t> selected_;
-  compose_cfg_t cfg_ = test_support::plain_settings();
-  edid_composer::journal_t journal_{false};
+  composer_fixtures::arena_list_t<short_video_desc_t> selected_{&arena_};
 };
 
 TEST_F(CurrentMode, MovesToTheFrontAndLosesIts3dStructures) {
@@ -92,7 +87,7 @@ TEST_F(CurrentMode, IsTracedBetweenTheSelectionAndItsReport) {
 }
 
 TEST_F(CurrentMode, ThatTheOutputListRefusesFailsTheFilter) {
-  test_support::scoped_list_t<std_timing_t> wrong;
+  composer_fixtures::arena_list_t<std_timing_t> wrong(&arena_);
   ASSERT_TRUE(ll_delete_list(&values_->video_60_priority));
   ASSERT_TRUE(ll_init(&values_->video_60_priority, "short_video_desc_t"));
   cfg_.hdmi_current_mode = {1920, 1080, 0, 60};

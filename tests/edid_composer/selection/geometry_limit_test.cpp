@@ -44,8 +44,9 @@ class GeometryLimit : public testing::Test {
   }
 
   test_support::scoped_list_t<short_video_desc_t> list_;
-  edid_composer::candidates_t candidates_{true};
-  edid_composer::journal_t journal_{false};
+  edid_composer::entry_arena_t arena_;
+  edid_composer::candidates_t candidates_{true, &arena_};
+  edid_composer::journal_t journal_{false, &arena_};
 };
 
 TEST_F(GeometryLimit, TallestModeIsThatOfTheFrame) {

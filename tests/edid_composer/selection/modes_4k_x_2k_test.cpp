@@ -41,7 +41,9 @@ class Modes4kX2k : public testing::Test {
               "");
     return codes;
   }
-  edid_composer::hdmi_vics_t select() { return _filter_4k_modes({*sink_.get(), *values_.get(), cfg_}).selected; }
+  edid_composer::hdmi_vics_t select() {
+    return _filter_4k_modes({*sink_.get(), *values_.get(), cfg_, nullptr}).selected;
+  }
 
   test_support::scoped_edid_t sink_;
   test_support::scoped_values_t values_;

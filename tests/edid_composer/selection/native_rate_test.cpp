@@ -57,7 +57,7 @@ class NativeRefreshRate : public testing::Test {
     return traced_output_of([&] { EXPECT_EQ(rate_of(sink_), expected); });
   }
   i32 rate_of(test_support::scoped_edid_t &sink) {
-    return _determine_tv_native_refresh_rate({*sink.get(), *values_.get(), cfg_}).hz;
+    return _determine_tv_native_refresh_rate({*sink.get(), *values_.get(), cfg_, nullptr}).hz;
   }
 
   test_support::scoped_edid_t sink_;

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "edid_composer/composer_lines.h"
+#include "edid_composer/stage_fixture.h"
 #include "support/edid_builder.h"
 #include "support/failing_allocation.h"
 #include "support/output_capture.h"
@@ -27,11 +28,12 @@ using modes_t = std::vector<test_support::mode_pair_t>;
 
 constexpr const char *filter = "_filter_video_modes";
 
-class VideoModeFilter : public testing::Test {
+const std::string no_memory =
+    test_support::bug_line("linked_list", "ll_create_entry", "calloc failed to allocate memory for the entry. ptr:PTR");
+
+class VideoModeFilter : public composer_fixtures::Stage {
  protected:
-  bool run(ll_list_t *selected) {
-    return _filter_video_modes({*sink_.get(), *values_.get(), cfg_}, selected, &journal_).complete;
-  }
+  bool run(ll_list_t *selected) { return _filter_video_modes(inputs(), selected, &journal_).complete; }
   bool run() { return run(selected_.get()); }
 
   /// The selection, by a run that prints nothing and succeeds.
@@ -40,11 +42,7 @@ class VideoModeFilter : public testing::Test {
     return test_support::modes_of(*selected_);
   }
 
-  test_support::scoped_edid_t sink_;
-  test_support::scoped_values_t values_;
-  test_support::scoped_list_t<short_video_desc_t> selected_;
-  compose_cfg_t cfg_ = test_support::plain_settings();
-  edid_composer::journal_t journal_{false};
+  composer_fixtures::arena_list_t<short_video_desc_t> selected_{&arena_};
 };
 
 TEST_F(VideoModeFilter, WithoutSinkOffersWhatPriorityAndAdditionListBothName) {
@@ -137,7 +135,7 @@ TEST_F(VideoModeFilter, SelectionIsNeverNative) {
 }
 
 TEST_F(VideoModeFilter, IsAppendedToWhatTheListHolds) {
-  append_modes(*selected_, {{1, 0}});
+  selected_.append({0, 1, 0});
   append_modes(values_->video_60_priority, {{16, 0}});
   append_modes(values_->video_60_additional, {{16, 0}});
   EXPECT_EQ(selection(), (modes_t{{1, 0}, {16, 0}}));
@@ -238,7 +236,7 @@ TEST_F(VideoModeFilter, ListThatWasNeverInitialisedFailsTheCombination) {
 }
 
 TEST_F(VideoModeFilter, OutputListOfAnotherTypeFailsTheFilter) {
-  test_support::scoped_list_t<std_timing_t> wrong;
+  composer_fixtures::arena_list_t<std_timing_t> wrong(&arena_);
   append_modes(values_->video_60_priority, {{16, 0}});
   append_modes(values_->video_60_additional, {{16, 0}});
   const std::string output = output_of([&] { EXPECT_FALSE(run(wrong.get())); });
@@ -247,35 +245,29 @@ TEST_F(VideoModeFilter, OutputListOfAnotherTypeFailsTheFilter) {
   EXPECT_NE(output.find(error(filter, "Failed adding entry to the back of the list.")), std::string::npos);
 }
 
-TEST_F(VideoModeFilter, EveryFailedAllocationFailsTheFilterAndLeaksNothing) {
+TEST_F(VideoModeFilter, EveryFailedAllocationFailsTheFilter) {
   append(sink_->dtd_list, timing_of_vic(16));
   append_modes(sink_->video_list, {{4, 0}, {5, 0}});
   append_modes(values_->video_60_priority, {{16, 0}, {1, 0}, {4, 0}});
-  values_->geometry_limit = 1;
   values_->current_mode_set_to_priority = 1;
   cfg_.hdmi_current_mode = {1280, 720, 0, 60};
 
-  std::vector<std::string> ends;
   bool failed = true;
-  for (int nth = 1; failed; ++nth) {
-    test_support::scoped_list_t<short_video_desc_t> selected;
-    bool result = false;
-    std::vector<std::string> lines = test_support::lines_of([&] {
-      const test_support::failing_allocation_t failing(nth);
-      result = run(selected.get());
+  u32 room = 0;
+  for (; failed; room += 8) {
+    edid_composer::entry_arena_t arena;
+    composer_fixtures::leave_room(&arena, room);
+    composer_fixtures::arena_list_t<short_video_desc_t> selected(&arena);
+    const std::string output = output_of([&] {
+      const test_support::failing_allocation_t failing(1);
+      EXPECT_EQ(_filter_video_modes(inputs(&arena), selected.get(), &journal_).complete, !failing.happened());
       failed = failing.happened();
     });
-    EXPECT_EQ(result, !failed);
-    if (failed) ends.push_back(lines.at(lines.size() - 1));
-    EXPECT_EQ(lines.empty(), !failed);
+    EXPECT_EQ(output, failed ? no_memory + error(filter, "Failed creating entry.") : "");
     EXPECT_TRUE(ll_verify_integrity(selected.get()));
   }
-  const auto line = [](const char *message) {
-    const std::string text = error(filter, message);
-    return text.substr(0, text.size() - 1);
-  };
-  // Two allocations each: the candidates, two priority entries that match, the current mode.
-  EXPECT_EQ(ends, std::vector<std::string>(8, line("Failed creating entry.")));
+  // Two priority entries that match, and the current mode.
+  EXPECT_GT(room, 3 * sizeof(ll_entry_t));
 }
 
 TEST_F(VideoModeFilter, WithoutMemoryForCandidatesNamesTheListThatTheyAreOf) {
@@ -285,14 +277,12 @@ TEST_F(VideoModeFilter, WithoutMemoryForCandidatesNamesTheListThatTheyAreOf) {
       EXPECT_FALSE(run());
     });
   };
-  const std::string no_memory = test_support::bug_line("linked_list", "ll_create_entry",
-                                                       "calloc failed to allocate memory for the entry. ptr:PTR") +
-                                error("_combine_lists", "Failed creating entry.");
+  const std::string no_candidate = no_memory + error("_combine_lists", "Failed creating entry.");
   values_->geometry_limit = 1;
   append_modes(values_->video_60_additional, {{5, 0}});
-  EXPECT_EQ(failure(), no_memory + error(filter, "Failed combining 60Hz lists."));
+  EXPECT_EQ(failure(), no_candidate + error(filter, "Failed combining 60Hz lists."));
   append_modes(sink_->video_list, {{4, 0}});
-  EXPECT_EQ(failure(), no_memory + error(filter, "Failed combining short video lists."));
+  EXPECT_EQ(failure(), no_candidate + error(filter, "Failed combining short video lists."));
 }
 
 }  // namespace
