@@ -2,7 +2,7 @@
 #include <cstdint>
 #include <string>
 
-#include "edid_composer/platform_values_reader.h"
+#include "edid_composer/platform/platform_values_reader.h"
 #include "measured.h"
 #include "platforms.h"
 #include "registration.h"

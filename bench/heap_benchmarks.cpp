@@ -23,8 +23,8 @@ void run_entries(benchmark::State &state) {
   std::vector<void *> blocks(2 * entries);
   measure(state, [&] {
     for (std::size_t i = 0; i < blocks.size(); i += 2) {
-      blocks[i] = std::calloc(1, entry_size);
-      blocks[i + 1] = std::calloc(1, payload_size);
+      blocks[i] = std::malloc(entry_size);
+      blocks[i + 1] = std::malloc(payload_size);
     }
     for (std::size_t i = 0; i < blocks.size(); i += 2) {
       free_hidden(blocks[i + 1]);
@@ -38,9 +38,6 @@ void run_entries(benchmark::State &state) {
 void register_heap_benchmarks() {
   benchmark::RegisterBenchmark("heap/malloc_pair", [](benchmark::State &state) {
     measure(state, [] { free_hidden(std::malloc(entry_size)); });
-  });
-  benchmark::RegisterBenchmark("heap/calloc_pair", [](benchmark::State &state) {
-    measure(state, [] { free_hidden(std::calloc(1, entry_size)); });
   });
   benchmark::RegisterBenchmark("heap/entries", run_entries)->Arg(5)->Arg(10)->Arg(20)->Arg(40)->Arg(80)->Arg(160);
 }

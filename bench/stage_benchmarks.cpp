@@ -2,11 +2,11 @@
 #include <array>
 #include <string>
 
-#include "edid_composer/audio_formats.h"
-#include "edid_composer/modes_4k_x_2k.h"
-#include "edid_composer/platform_values_reader.h"
-#include "edid_composer/population.h"
-#include "edid_composer/video_modes.h"
+#include "edid_composer/new_edid/population.h"
+#include "edid_composer/platform/platform_values_reader.h"
+#include "edid_composer/selection/audio_formats.h"
+#include "edid_composer/selection/modes_4k_x_2k.h"
+#include "edid_composer/selection/video_modes.h"
 #include "measured.h"
 #include "platforms.h"
 #include "registration.h"
@@ -16,7 +16,6 @@ namespace bench {
 namespace {
 
 constexpr u32 block_size = 128;
-constexpr u8 first_port = 1;
 using namespace edid_composer;  // NOLINT(google-build-using-namespace): the stages are what is measured here
 
 /// What the stages of one composition hand on, up to the new record.
@@ -28,32 +27,30 @@ class situation_t {
     edid_prepare(&downstream);
     decode_edid_block_0(sink.data(), &downstream);
     if (sink.size() > block_size) decode_edid_extensions(sink.data() + block_size, block_size, &downstream);
-    ll_init(&modes, "short_video_desc_t");
     edid_prepare(&new_edid);
-    select_video(&modes);
-    _filter_4k_modes(&downstream, &new_edid, values.get());
-    select_audio(&new_edid.audio_list);
-    populate(&new_edid);
+    select_and_populate(&new_edid);
   }
   ~situation_t() {
     edid_destroy(&downstream);
     edid_destroy(&new_edid);
-    ll_delete_list(&modes);
   }
   situation_t(const situation_t &) = delete;
   situation_t &operator=(const situation_t &) = delete;
 
-  void select_video(ll_list_t *list) { _filter_video_modes(&downstream, &cfg, list, values.get()); }
-  void select_audio(ll_list_t *list) { _filter_audio_formats(&downstream, cfg.audio_mask, 0, list, values.get()); }
-  void populate(edid_t *edid) {
-    _populate_new_edid(edid, &modes, &downstream, first_port, cfg.hdmi_3d_mode, cfg.edid_latency, values.get());
+  inputs_t inputs() { return {downstream, *values.get(), cfg}; }
+  void select_video(ll_list_t *list) { _filter_video_modes(inputs(), list, &journal); }
+  void select_audio(ll_list_t *list) { _filter_audio_formats(inputs(), list, &journal); }
+  void select_and_populate(edid_t *edid) {
+    select_video(&edid->video_list);
+    select_audio(&edid->audio_list);
+    _populate_new_edid(inputs(), _filter_4k_modes(inputs()).selected, edid);
   }
 
   compose_cfg_t cfg = sample_settings();
   values_t values;
+  journal_t journal{false};
   edid_t downstream;
   edid_t new_edid;
-  ll_list_t modes{};
 };
 
 template <typename operation_t>
@@ -78,16 +75,15 @@ void add_stages(const sink_t &sink) {
   add("select_video_modes", sink, [](situation_t *situation) {
     with_list("short_video_desc_t", [&](ll_list_t *list) { situation->select_video(list); });
   });
-  add("select_4k_modes", sink, [](situation_t *situation) {
-    _filter_4k_modes(&situation->downstream, &situation->new_edid, situation->values.get());
-  });
+  add("select_4k_modes", sink,
+      [](situation_t *situation) { benchmark::DoNotOptimize(_filter_4k_modes(situation->inputs())); });
   add("select_audio_formats", sink, [](situation_t *situation) {
     with_list("short_audio_desc_t", [&](ll_list_t *list) { situation->select_audio(list); });
   });
-  add("populate", sink, [](situation_t *situation) {
+  add("select_and_populate", sink, [](situation_t *situation) {
     edid_t edid;
     edid_prepare(&edid);
-    situation->populate(&edid);
+    situation->select_and_populate(&edid);
     edid_destroy(&edid);
   });
   add("encode", sink, [](situation_t *situation) {

@@ -75,7 +75,7 @@ def targets(run, library_size):
     pair = run.time("heap/malloc_pair")
     yield Target("Decoding and destroying a sink of 256 bytes, in pairs of malloc and free", 60,
                  *_swap(worst({sink: decode_time(run, sink) / pair for sink in full_sinks(run)}), "pairs"))
-    yield Target("Heap calls of that other than one calloc and one free for an entry and for its payload", 0,
+    yield Target("Heap calls of that other than one malloc and one free for an entry and for its payload", 0,
                  *_swap(worst(entries_without_two_calls(run)), "calls"))
     yield Target("`compose_edid_internal` against decoding and destroying its sink (256 bytes)", 4,
                  *_swap(worst({sink: run.time(f"compose/with_values/{sink}") / decode_time(run, sink)

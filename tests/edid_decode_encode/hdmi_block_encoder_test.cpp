@@ -304,4 +304,29 @@ TEST(Hdmi3dEncoder, WrapsLengthsThatTheirBitsDoNotHold) {
   EXPECT_EQ(encoding.length_byte, 36 & 31);
 }
 
+TEST(LatencyEncoder, EncodesUpTo500MillisecondsInStepsOf2) {
+  EXPECT_EQ(traced_output_of([] {
+              for (u32 latency = 0; latency <= 500; ++latency) {
+                EXPECT_EQ(encode_edid_latency_value(static_cast<u16>(latency)), latency / 2 + 1) << latency;
+              }
+            }),
+            "");
+  EXPECT_EQ(encode_edid_latency_value(0), 1);
+  EXPECT_EQ(encode_edid_latency_value(20), 11);
+  EXPECT_EQ(encode_edid_latency_value(21), 11);
+  EXPECT_EQ(encode_edid_latency_value(500), 251);
+}
+
+TEST(LatencyEncoder, TakesLongerOnesAs500MillisecondsAndTracesThem) {
+  for (const u32 latency : {501u, 600u, 65534u}) {
+    EXPECT_EQ(traced_output_of([&] { EXPECT_EQ(encode_edid_latency_value(static_cast<u16>(latency)), 251); }),
+              trace_line("encode_edid_latency_value", "latency = " + std::to_string(latency) + " exceed 500ms"));
+    EXPECT_EQ(output_of([&] { EXPECT_EQ(encode_edid_latency_value(static_cast<u16>(latency)), 251); }), "");
+  }
+}
+
+TEST(LatencyEncoder, TakesTheLargestAsNotSupported) {
+  EXPECT_EQ(traced_output_of([] { EXPECT_EQ(encode_edid_latency_value(65535), 255); }), "");
+}
+
 }  // namespace codec_test

@@ -1,6 +1,5 @@
 // The video part of the HDMI vendor-specific data block: 4Kx2K codes and 3D structures.
-#include "codec_fixture.h"
-#include "edid_decode_encode/hdmi_vendor_block_decoder.h"
+#include "vendor_block_decoding.h"
 
 namespace codec_test {
 namespace {
@@ -9,11 +8,6 @@ using test_support::hdmi_block;
 using test_support::mode_pair_t;
 
 constexpr const char *function = "_decode_edid_vendor_block";
-
-u8 decode(const bytes_t &block, edid_t *edid) {
-  const exact_bytes_t bytes(block);
-  return edid_composer::_decode_edid_vendor_block(edid_composer::byte_view_t(bytes.data(), bytes.size()), edid);
-}
 
 // An HDMI block without latencies, with @p video from byte 9 on.
 bytes_t video_part(const bytes_t &video) {
@@ -40,7 +34,7 @@ outcome_t outcome_of(u32 entries, const bytes_t &video) {
   scoped_edid_t edid;
   fill(edid.get(), entries);
   outcome_t outcome;
-  outcome.output = output_of([&] { EXPECT_EQ(decode(video_part(video), edid.get()), 1); });
+  outcome.output = output_of([&] { EXPECT_TRUE(decode_vendor_block(video_part(video), edid.get())); });
   u32 vic = 16;
   for (const mode_pair_t &mode : test_support::modes_of(edid->video_list)) {
     EXPECT_EQ(mode.first, vic++);
@@ -78,7 +72,7 @@ TEST(HdmiVideoDecoder, DecodesTheFlagsAndTracesAllOfThem) {
     SCOPED_TRACE(u32{each.flags});
     scoped_edid_t edid;
     EXPECT_EQ(traced_output_of([&] {
-                EXPECT_EQ(decode(video_part({each.flags, 0x00}), edid.get()), 1);
+                EXPECT_TRUE(decode_vendor_block(video_part({each.flags, 0x00}), edid.get()));
               }),
               trace_line(function, " start parsing 3D and 4Kx2K stuff true") +
                   trace_line(function, std::string(" 3D_present ") + each.present) +
@@ -98,7 +92,7 @@ TEST(HdmiVideoDecoder, DecodesTheLengthsOfBothParts) {
       // The codes lie behind the block.
       const bytes_t block =
           test_support::join(video_part({0x00, byte_of(vics << 5 | structures)}), {1, 2, 3, 4, 5, 6, 7});
-      EXPECT_EQ(traced_output_of([&] { EXPECT_EQ(decode(block, edid.get()), 1); }),
+      EXPECT_EQ(traced_output_of([&] { EXPECT_TRUE(decode_vendor_block(block, edid.get())); }),
                 trace_line(function, " start parsing 3D and 4Kx2K stuff true") + trace_line(function, " 3D_present 0") +
                     trace_line(function, " 3D_multi_present 0") + trace_line(function, " image_size 0") +
                     trace_line(function, " 3D_len " + std::to_string(structures)) +
@@ -114,14 +108,14 @@ TEST(HdmiVideoDecoder, DecodesTheLengthsOfBothParts) {
 
 TEST(HdmiVideoDecoder, DropsTheTopBitOfTheCodes) {
   scoped_edid_t edid;
-  EXPECT_EQ(decode(video_part({0x00, 0x60, 0x81, 0x7F, 0xFF}), edid.get()), 1);
+  EXPECT_TRUE(decode_vendor_block(video_part({0x00, 0x60, 0x81, 0x7F, 0xFF}), edid.get()));
   EXPECT_EQ(codes_of(*edid.get()), (std::vector<u32>{1, 127, 127, 0, 0, 0, 0}));
 }
 
 TEST(HdmiVideoDecoder, IsNotReadWithoutTheVideoFlag) {
   scoped_edid_t edid;
   EXPECT_EQ(traced_output_of([&] {
-              EXPECT_EQ(decode(hdmi_block({0, 0, 0, 0, 0x1F, 0x98, 0x60, 1, 2, 3}), edid.get()), 1);
+              EXPECT_TRUE(decode_vendor_block(hdmi_block({0, 0, 0, 0, 0x1F, 0x98, 0x60, 1, 2, 3}), edid.get()));
             }),
             "");
   EXPECT_EQ(edid->hdmi_3d_present, 0);
@@ -145,7 +139,7 @@ TEST(HdmiVideoDecoder, IsReadFromTheByteBehindTheLatencies) {
       bytes_t block = hdmi_block(payload);
       block.insert(block.end(), video.begin() + bytes_of_video, video.end());
       scoped_edid_t edid;
-      EXPECT_EQ(decode(block, edid.get()), 1);
+      EXPECT_TRUE(decode_vendor_block(block, edid.get()));
       EXPECT_EQ(edid->hdmi_video_present, 1);
       EXPECT_EQ(edid->hdmi_3d_present, bytes_of_video == 0 ? 0 : 1);
       EXPECT_EQ(edid->image_size, bytes_of_video == 0 ? 0 : 2);
@@ -289,7 +283,7 @@ TEST(Hdmi3dDecoder, IsBoundedByIts3dLengthAloneNotByTheBlock) {
 TEST(Hdmi3dDecoder, ReadsMissingBytesAsFramePackingOfEntry0) {
   scoped_edid_t edid;
   fill(edid.get(), 2);
-  EXPECT_EQ(output_of([&] { EXPECT_EQ(decode(video_part({0x80, 0x1F}), edid.get()), 1); }), "");
+  EXPECT_EQ(output_of([&] { EXPECT_TRUE(decode_vendor_block(video_part({0x80, 0x1F}), edid.get())); }), "");
   EXPECT_EQ(test_support::modes_of(edid->video_list), (std::vector<mode_pair_t>{{16, 1}, {17, 0}}));
 }
 

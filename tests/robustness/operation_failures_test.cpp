@@ -6,7 +6,7 @@
 #include <cstring>
 #include <numeric>
 
-#include "edid_composer/platform_values_reader.h"
+#include "edid_composer/platform/platform_values_reader.h"
 #include "edid_decode_encode/record_fields.h"
 #include "failure_table.h"
 #include "sample.h"
@@ -235,7 +235,7 @@ std::string words_of(bool done, const platform_values_t &values) {
 std::string read_from_tree() {
   platform_values_t values{};
   EXPECT_TRUE(platform_values_init(&values));
-  const bool done = edid_composer::_read_platform_values(&values);
+  const bool done = edid_composer::_read_platform_values(&values, nullptr);
   const std::string words = words_of(done, values);
   EXPECT_TRUE(platform_values_destroy(&values));
   return words;

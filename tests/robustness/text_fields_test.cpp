@@ -1,11 +1,9 @@
 // Texts of platform values that fill their fields to the last byte, so that no NUL ends them.
 #include <gtest/gtest.h>
 
-#include <cstddef>
 #include <cstring>
 #include <string>
 
-#include "edid_composer/population.h"
 #include "support/composition.h"
 #include "support/output_capture.h"
 #include "support/records.h"
@@ -28,42 +26,12 @@ class FullTextFields : public testing::Test {
     test_support::append_modes(values_->video_60_additional, {{16, 0}, {4, 0}, {5, 0}, {2, 0}});
   }
 
-  // Populates the new record with the values' four modes.
-  void populate(test_support::scoped_edid_t &edid) {
-    const compose_cfg_t cfg = test_support::plain_settings();
-    test_support::scoped_list_t<short_video_desc_t> modes;
-    test_support::append_modes(*modes, {{16, 0}, {4, 0}, {5, 0}, {2, 0}});
-    test_support::scoped_edid_t sink;
-    EXPECT_EQ(
-        edid_composer::_populate_new_edid(edid.get(), modes.get(), sink.get(), 1, 0, cfg.edid_latency, values_.get()),
-        1U);
-  }
-
   test_support::scoped_values_t values_;
 };
 
-TEST_F(FullTextFields, AreCopiedIntoTheRecordAndNotBehindItsFields) {
-  test_support::scoped_edid_t edid;
-  populate(edid);
-  EXPECT_EQ(std::string(edid->manufacturer, 4), "ABCD");
-  EXPECT_EQ(std::string(edid->monitor_name, 14), "Name of 14 byt");
-  EXPECT_EQ(std::string(edid->serial_string, 14), "Serial numbers");
-  // What stands behind them in the record, as far as populating sets it before or not at all.
-  EXPECT_EQ(edid->product_code, 0x1234U);
-  EXPECT_EQ(edid->serial_number, 0x01020304U);
-  EXPECT_EQ(std::string(edid->data_string, 14), std::string(14, '\0'));
-  EXPECT_EQ(edid->extension_count, 0);
-  EXPECT_EQ(edid->checksum, 0);
-}
-
 TEST_F(FullTextFields, AreTracedToTheirEnd) {
-  test_support::scoped_edid_t edid;
-  // No byte behind the two fields ends a text by chance: neither the padding nor the next member.
-  constexpr std::size_t behind_manufacturer = offsetof(edid_t, manufacturer) + sizeof edid->manufacturer;
-  std::memset(reinterpret_cast<char *>(edid.get()) + behind_manufacturer, 'X',
-              offsetof(edid_t, product_code) - behind_manufacturer);
-  edid->min_v_rate = 'X';
-  const std::string output = test_support::traced_output_of([&] { populate(edid); });
+  const std::string output =
+      test_support::traced_output_of([&] { test_support::compose({}, test_support::plain_settings(), values_.get()); });
   const std::string expected = test_support::trace_line("_populate_new_edid", "\tManufacturer ID = ABCD") +
                                test_support::trace_line("_populate_new_edid", "\tMonitor Name    = Name of 14 byt");
   EXPECT_EQ(test_support::count_of(output, expected), 1) << output;

@@ -2,9 +2,9 @@
 
 #include <cstddef>
 
-// The linker sends calls of calloc() here: see the options of test_support.
-extern "C" void *__real_calloc(std::size_t count, std::size_t size);
-extern "C" void *__wrap_calloc(std::size_t count, std::size_t size);
+// The linker sends calls of malloc() here: see the options of test_support.
+extern "C" void *__real_malloc(std::size_t size);
+extern "C" void *__wrap_malloc(std::size_t size);
 
 namespace {
 
@@ -40,9 +40,9 @@ bool failing_allocation_t::happened() const {
 
 }  // namespace test_support
 
-void *__wrap_calloc(std::size_t count, std::size_t size) {
+void *__wrap_malloc(std::size_t size) {
   if (fails_now()) return nullptr;
-  void *const block = __real_calloc(count, size);
+  void *const block = __real_malloc(size);
   if (test_support::allocation_listener != nullptr) test_support::allocation_listener(block);
   return block;
 }

@@ -6,7 +6,7 @@ namespace test_support {
 /// How many allocations fail, from the one that a test names on.
 enum class failing_t { only_that_one, all_from_there_on };
 
-/// While it lives, the @p nth calloc() from its construction on (counted from 1) fails. Works on code that is linked
+/// While it lives, the @p nth malloc() from its construction on (counted from 1) fails. Works on code that is linked
 /// statically, such as the library in unit_tests; calls from within shared libraries are not seen.
 class failing_allocation_t {
  public:
@@ -19,7 +19,7 @@ class failing_allocation_t {
   bool happened() const;
 };
 
-/// Hears of each block that such a calloc() gave; null when nobody listens.
+/// Hears of each block that such a malloc() gave; null when nobody listens.
 extern void (*allocation_listener)(void *block);
 
 }  // namespace test_support

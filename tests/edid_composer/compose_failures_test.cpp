@@ -1,0 +1,157 @@
+// Stages that fail: what is said, and that everything is cleaned up.
+#include <gtest/gtest.h>
+
+#include <string>
+#include <tuple>
+#include <vector>
+
+#include "edid_composer/composer_lines.h"
+#include "support/configuration_tree.h"
+#include "support/edid_builder.h"
+#include "support/failing_allocation.h"
+#include "support/output_capture.h"
+#include "support/records.h"
+
+namespace {
+
+using composer_lines::bug;
+using composer_lines::error;
+using test_support::append_modes;
+using test_support::bytes_t;
+using test_support::error_line;
+using test_support::output_of;
+
+constexpr const char *compose = "compose_edid_internal";
+
+class FailingComposition : public testing::Test {
+ protected:
+  std::string failure() {
+    return output_of([&] { EXPECT_FALSE(compose_edid_internal(nullptr, 0, new_.data(), 256, &cfg_, values_.get())); });
+  }
+
+  test_support::scoped_values_t values_;
+  compose_cfg_t cfg_ = test_support::plain_settings();
+  bytes_t new_ = bytes_t(256, 0xA5);
+};
+
+TEST_F(FailingComposition, VideoModes) {
+  values_->video_60_additional.magic ^= 1;
+  const std::string output = failure();
+  values_->video_60_additional.magic ^= 1;
+  EXPECT_EQ(output, error("_combine_lists", "extra_list has not been initialized. ptr=PTR") +
+                        error("_filter_video_modes", "Failed combining 60Hz lists.") +
+                        error(compose, "Failed filtering the video modes."));
+  EXPECT_EQ(new_, bytes_t(256, 0xA5));
+}
+
+TEST_F(FailingComposition, AudioFormats) {
+  // The only allocations before are those of the four selected modes.
+  append_modes(values_->video_60_priority, {{16, 0}, {4, 0}, {2, 0}, {1, 0}});
+  append_modes(values_->video_60_additional, {{16, 0}, {4, 0}, {2, 0}, {1, 0}});
+  const std::string output = output_of([&] {
+    const test_support::failing_allocation_t failing(2 * 4 + 1);
+    EXPECT_FALSE(compose_edid_internal(nullptr, 0, new_.data(), 256, &cfg_, values_.get()));
+  });
+  EXPECT_EQ(output, test_support::bug_line("linked_list", "ll_create_entry",
+                                           "calloc failed to allocate memory for the entry. ptr:PTR") +
+                        error("_filter_audio_formats", "Failed creating entry.") +
+                        error(compose, "Failed filtering the audio formats."));
+  EXPECT_EQ(new_, bytes_t(256, 0xA5));
+}
+
+TEST_F(FailingComposition, Population) {
+  // A VIC that nobody knows, configured and confirmed by the caller's own lists.
+  append_modes(values_->video_60_priority, {{100, 0}, {4, 0}, {2, 0}, {1, 0}});
+  append_modes(values_->video_60_additional, {{100, 0}, {4, 0}, {2, 0}, {1, 0}});
+  const std::string unknown = test_support::warning_line(
+      "utility", "convert_vic_to_dtd", "Invalid vic requested for conversion to a DTD. Requested VIC:100 Range:0-64");
+  EXPECT_EQ(failure(), unknown + bug("_maximum_pixel_clock", "\tFailed converting VIC:100 to a DTD.") + unknown +
+                           error("_populate_new_edid", "Error converting vic to dtd. Vic:100:Unknown Value") +
+                           error(compose, "Failed populating the new edid."));
+  EXPECT_EQ(new_, bytes_t(256, 0xA5));
+}
+
+TEST_F(FailingComposition, Encoding) {
+  append_modes(values_->video_60_priority, {{16, 0}, {4, 0}, {2, 0}, {1, 0}});
+  append_modes(values_->video_60_additional, {{16, 0}, {4, 0}, {2, 0}, {1, 0}});
+  // An audio format of type 0 cannot be encoded; the sink's first one is never filtered out.
+  values_->audio_pass_through = 2;
+  const bytes_t extension = test_support::extension_builder_t()
+                                .block(test_support::audio_block({0x79, 0x07, 0x20, 0x09, 0x07, 0x05}))
+                                .build();
+  const bytes_t sink = test_support::join(test_support::base_block_builder_t().extensions(1).build(), extension);
+  EXPECT_EQ(
+      output_of([&] { EXPECT_FALSE(compose_edid_internal(sink.data(), 256, new_.data(), 256, &cfg_, values_.get())); }),
+      error_line("edid_decode_encode", "_encode_edid_short_audio", "Audio type is not recognied. Type:0") +
+          error_line("edid_decode_encode", "encode_edid", "Failed encoding short audio. Index:0 Type:0") +
+          error(compose, "Failed encoding the new edid."));
+}
+
+TEST_F(FailingComposition, ConfigurationIsCleanedUpBeforeTheOtherRecordsWerePrepared) {
+  test_support::configuration_tree_t tree;
+  tree.fill_completely();
+  bool result = true;
+  const std::string output = output_of([&] {
+    const test_support::failing_allocation_t failing(1);
+    result = compose_edid(nullptr, 0, new_.data(), 256, &cfg_);
+  });
+  EXPECT_FALSE(result);
+  const std::string unprepared =
+      error_line("edid_decode_encode", "edid_destroy", "List is not initialized. List:standard_timing_list.");
+  EXPECT_EQ(output, test_support::bug_line("linked_list", "ll_create_entry",
+                                           "calloc failed to allocate memory for the entry. ptr:PTR") +
+                        error("_read_platform_values", "Failed creating entry.") +
+                        error(compose, "Failed trying to read the platform config file.") + unprepared +
+                        error(compose, "Failed cleaning up edid.") + unprepared +
+                        error(compose, "Failed cleaning up new_edid."));
+  EXPECT_EQ(new_, bytes_t(256, 0xA5));
+}
+
+TEST_F(FailingComposition, EveryAllocationThatFailsIsReportedAndLeaksNothing) {
+  test_support::configuration_tree_t tree;
+  tree.fill_completely();
+  tree.set("current_mode_set_to_priority", 1);
+  cfg_.hdmi_current_mode = {1920, 1080, 0, 60};
+  const bytes_t sink =
+      test_support::join(test_support::base_block_builder_t()
+                             .descriptor(0, test_support::timing_descriptor(test_support::timing_of_vic(16)))
+                             .standard_timing(0, 0x81, 0x80)
+                             .extensions(1)
+                             .build(),
+                         test_support::extension_builder_t()
+                             .block(test_support::video_block({16, 4, 5, 2}))
+                             .block(test_support::audio_block({0x15, 0x07, 0x50}))
+                             .block(test_support::hdmi_block({0x10, 0x00}))
+                             .timing(test_support::timing_descriptor(test_support::timing_of_vic(4)))
+                             .build());
+  ASSERT_EQ(output_of([&] { EXPECT_TRUE(compose_edid(sink.data(), 256, new_.data(), 256, &cfg_)); }), "");
+  const bytes_t composed = new_;
+
+  int failed_compositions = 0;
+  int nth = 1;
+  for (bool happened = true; happened; ++nth) {
+    new_.assign(256, 0xA5);
+    bool result = false;
+    const std::string output = output_of([&] {
+      const test_support::failing_allocation_t failing(nth);
+      result = compose_edid(sink.data(), 256, new_.data(), 256, &cfg_);
+      happened = failing.happened();
+    });
+    EXPECT_EQ(test_support::count_of(output, "calloc failed to allocate memory"), happened ? 1 : 0) << nth;
+    if (!happened) {
+      EXPECT_TRUE(result);
+      EXPECT_EQ(new_, composed);
+    }
+    if (result) {  // An entry of the configuration or of the sink is missing, no more.
+      EXPECT_EQ(test_support::block_sum(new_.data()), 0) << nth;
+      EXPECT_EQ(test_support::block_sum(new_.data() + 128), 0) << nth;
+    } else {
+      ++failed_compositions;
+      EXPECT_NE(output.find("compose_edid_internal() ERROR: Failed "), std::string::npos) << nth << "\n" << output;
+    }
+  }
+  EXPECT_GT(failed_compositions, 20);
+  EXPECT_GT(nth, 60);
+}
+
+}  // namespace
