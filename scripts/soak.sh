@@ -1,15 +1,17 @@
 #!/bin/sh
-# The long runs: each fuzz target for a while (default 30 minutes), more random properties, and the tests under valgrind.
-# usage: scripts/soak.sh [SECONDS PER FUZZ TARGET] [TARGET...]
+# The long runs: each fuzz target for a while (default 30 minutes), more random properties and texts, and the tests of the
+# library under valgrind.
+# usage: scripts/soak.sh [--no-install] [SECONDS PER FUZZ TARGET] [TARGET...]
 set -eu
 cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 
 seconds=${1:-1800}
 [ $# -gt 0 ] && shift
-targets=${*:-base_block extension print compose encode}
-echo "Fuzzing ($targets) for $seconds seconds each, then random properties and valgrind; takes the sum and 20 minutes."
-install_packages build-essential cmake ninja-build clang libclang-rt-14-dev libgtest-dev libgmock-dev valgrind
+targets=${*:-base_block extension print compose encode store hex_text explain}
+echo "Fuzzing ($targets) for $seconds seconds each, then random properties and valgrind."
+install_packages build-essential cmake ninja-build clang libclang-rt-14-dev python3 libgtest-dev libgmock-dev \
+  libtomlplusplus-dev libcli11-dev nlohmann-json3-dev libutfcpp-dev valgrind
 
 cmake --preset fuzz
 for target in $targets; do
@@ -28,11 +30,14 @@ for target in $targets; do
   grep -E 'DONE|number_of_executed_units|average_exec' "$corpus/$target.log"
 done
 
+suites='unit_tests limits_without_assertions_tests end_to_end_tests robustness_tests'
 cmake --preset release
-cmake --build --preset release
+# shellcheck disable=SC2086 # one word each
+cmake --build --preset release --target $suites property_tests
 EDID_COMPOSER_PROPERTY_RUNS=20000 build/release/bin/property_tests --gtest_brief=1
-for suite in unit_tests end_to_end_tests; do
+EDID_COMPOSER_LONG_LOOPS=1 build/release/bin/unit_tests --gtest_brief=1
+for suite in $suites; do
   valgrind --quiet --error-exitcode=1 --leak-check=full --errors-for-leak-kinds=definite,indirect \
-    build/release/bin/$suite --gtest_brief=1 --gtest_filter='-*DeathTest*'
+    build/release/bin/"$suite" --gtest_brief=1 --gtest_filter='-*DeathTest*'
 done
 echo 'Soaked without a finding.'

@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Breaks the library in the ways that mutations.toml lists, one at a time, and tells whether the tests notice.
+"""Breaks the library and the program in the ways that mutations.toml lists, one at a time, and tells whether the tests notice.
 
 The work is done in a copy of the tree, so that the tree itself is never broken. Exit status 0: each mutation ended as it
 was expected to.
@@ -15,7 +15,12 @@ import tomllib
 
 HERE = pathlib.Path(__file__).resolve().parent
 TREE = HERE.parent.parent
-SUITES = ("unit_tests", "end_to_end_tests", "limits_without_assertions_tests", "robustness_tests")
+# By the folder that a mutation is in, the programs of tests that are to notice it.
+SUITES = {
+    "src": ("unit_tests_sanitized", "end_to_end_tests_sanitized", "limits_without_assertions_tests",
+            "robustness_tests_sanitized"),
+    "host": ("config_store_tests", "explain_tests", "cli_tests"),
+}
 
 
 def run(command, log, timeout):
@@ -39,40 +44,29 @@ class Workshop:
         shutil.rmtree(self.tree, ignore_errors=True)
         # Files as new as the copy: what a run that was broken off compiled of a broken file is compiled again.
         shutil.copytree(TREE, self.tree, ignore=shutil.ignore_patterns("build", ".git"), copy_function=shutil.copy)
-        configure = ["cmake", "-S", self.tree, "-B", self.build, "-G", "Ninja", "-DCMAKE_BUILD_TYPE=Debug",
-                     "-DEDID_COMPOSER_SANITIZE=ON", "-DEDID_COMPOSER_HOST=OFF"]
+        configure = ["cmake", "-S", self.tree, "-B", self.build, "-G", "Ninja", "-DCMAKE_BUILD_TYPE=RelWithDebInfo",
+                     "-DEDID_COMPOSER_SANITIZED_TESTS=ON"]
         if run(configure, self.log, 300) != 0:
             sys.exit(f"mutate: configuring failed, see {self.log}")
 
-    def suites(self):
-        """The programs of tests that this tree has."""
-        return [suite for suite in SUITES if self.has(suite)]
+    def compile(self, suites):
+        return run(["cmake", "--build", self.build, "-j", str(self.jobs), "--target", *suites], self.log, 1200) == 0
 
-    def has(self, suite):
-        listed = subprocess.run(["ninja", "-C", self.build, "-t", "query", f"bin/{suite}"], capture_output=True, check=False)
-        return listed.returncode == 0
-
-    def compile(self):
-        return run(["cmake", "--build", self.build, "-j", str(self.jobs), "--target", *self.suites()], self.log, 1200) == 0
-
-    def verdict(self):
+    def verdict(self, folder):
         """What the tests say of the tree as it is."""
-        if not self.compile():
+        if not self.compile(SUITES[folder]):
             return "does not compile"
-        for suite in self.suites():
+        for suite in SUITES[folder]:
             if run([self.build / "bin" / suite, "--gtest_brief=1", "--gtest_fail_fast"], self.log, 600) != 0:
                 return f"killed by {suite}"
         return "survives"
 
 
-def original(mutation, tree):
-    """The file that a mutation changes, and its text."""
+def applicable(mutation, tree):
+    """What keeps a mutation from being applied; empty: nothing."""
     path = tree / mutation["file"]
-    text = path.read_text()
-    found = text.count(mutation["before"])
-    if found != 1:
-        sys.exit(f"mutate: \"{mutation['name']}\": its text stands {found} times in {mutation['file']}")
-    return path, text
+    found = path.read_text().count(mutation["before"]) if path.exists() else 0
+    return "" if found == 1 else f"\"{mutation['name']}\": its text stands {found} times in {mutation['file']}"
 
 
 def main():
@@ -84,19 +78,22 @@ def main():
     with open(HERE / "mutations.toml", "rb") as file:
         mutations = [m for m in tomllib.load(file)["mutation"] if arguments.only in m["name"]]
     if arguments.check:
-        for mutation in mutations:
-            original(mutation, TREE)
-        print(f"{len(mutations)} mutations can be applied")
-        return 0
+        stale = [problem for problem in (applicable(mutation, TREE) for mutation in mutations) if problem]
+        print("\n".join(stale) or f"{len(mutations)} mutations can be applied")
+        return 1 if stale else 0
 
     workshop = Workshop(TREE / "build" / "mutation", arguments.jobs)
-    if workshop.verdict() != "survives":
+    if any(workshop.verdict(folder) != "survives" for folder in SUITES):
         sys.exit(f"mutate: the tests fail on the unbroken tree, see {workshop.log}")
     unexpected = 0
     for mutation in mutations:
-        path, text = original(mutation, workshop.tree)
+        problem = applicable(mutation, workshop.tree)
+        if problem:
+            sys.exit(f"mutate: {problem}")
+        path = workshop.tree / mutation["file"]
+        text = path.read_text()
         path.write_text(text.replace(mutation["before"], mutation["after"]))
-        verdict = workshop.verdict()
+        verdict = workshop.verdict(pathlib.PurePath(mutation["file"]).parts[0])
         path.write_text(text)
         expected = mutation.get("expect", "killed")
         as_expected = verdict.startswith(expected)

@@ -11,8 +11,8 @@ namespace properties {
 /// first one that a check fails with. Failures name its seed.
 void for_each_run(u32 runs, const std::function<void(random_source_t &)> &property);
 
-/// Checks that the inputs held what the property is about: at least @p least times. Passes when the environment asks
-/// for another number of runs, or when the property failed.
+/// Checks that the inputs held what the property is about: at least @p least times in the usual number of runs, and in
+/// proportion in another number. Passes when the property failed.
 void expect_at_least(u32 least, u32 actual, const char *what);
 
 }  // namespace properties

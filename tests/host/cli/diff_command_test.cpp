@@ -83,11 +83,22 @@ TEST_F(DiffCommand, AlignsListsSoThatOneMissingEntryIsOneDifference) {
   EXPECT_THAT(result.output, ContainsRegex("\n\\*  video mode +31 1920x1080p50Hz16x9.* +21 720\\(1440\\)x576i50Hz4x3"));
 }
 
+TEST_F(DiffCommand, AlignsListsThatHaveTheSameEntriesInOtherPlaces) {
+  // Three modes: the first goes, the others move up, another follows.
+  const std::size_t mode = tv_.find("\x1F\x05\x14", 128);
+  ASSERT_NE(mode, std::string::npos);
+  const process_result_t result =
+      diff(tv_, changed(changed(changed(tv_, mode, 0x05), mode + 1, 0x14), mode + 2, 21), {"--only-changes"});
+  EXPECT_THAT(result.output, ContainsRegex("\n\\*  video mode +31 1920x1080p50Hz16x9 +-\n"));
+  EXPECT_THAT(result.output, ContainsRegex("\n\\*  video mode +- +21 720\\(1440\\)x576i50Hz4x3\n"));
+}
+
 TEST_F(DiffCommand, EntriesThatOneSideLacksStandAlone) {
   const process_result_t result = diff(sample_bytes("monitor_base_block"), tv_);
   EXPECT_EQ(result.status, 1);
   EXPECT_THAT(result.output, ContainsRegex("\n\\*  4Kx2K mode +- +1 3840x2160p30Hz\n"));
   EXPECT_THAT(result.output, ContainsRegex("\n\\*  HDMI +no +yes\n"));
+  EXPECT_THAT(diff(tv_, sample_bytes("av_receiver")).output, ContainsRegex("\n\\*  video latency +[0-9]+ ms +"));
   EXPECT_THAT(result.output, ContainsRegex("\n\\*  physical address +- +2\\.0\\.0\\.0\n"));
 }
 
