@@ -1,6 +1,9 @@
 #include "diagnostics.h"
 
+#include <cinttypes>
 #include <cstdarg>
+#include <cstdio>
+#include <cstring>
 
 #include "output.h"
 
@@ -34,6 +37,16 @@ void log_trace(const site_t &site, int line, const char *format, ...) {
   va_start(arguments, format);
   write_line(COMPOSE_LOG_TRACE, site, line, format, arguments);
   va_end(arguments);
+}
+
+address_t address(const void *pointer) {
+  address_t address;
+  if (pointer == nullptr) {
+    std::strcpy(address.text, "(nil)");
+  } else {
+    std::snprintf(address.text, sizeof address.text, "0x%" PRIxPTR, reinterpret_cast<std::uintptr_t>(pointer));
+  }
+  return address;
 }
 
 }  // namespace edid_composer

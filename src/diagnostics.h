@@ -1,7 +1,7 @@
 // The four kinds of diagnostic line.
 //
-// A line names the operation that reports and the module that holds it, also where a helper does the work. The operation
-// is declared once, for a file or for a function, and every line below reports in its name:
+// A line names the operation that reports and the module that holds it, also where a helper does the work. The
+// operation is declared once, for a file or for a function, and every line below reports in its name:
 //
 //   REPORTS_AS(decode_edid_block_0);
 //   ...
@@ -9,6 +9,7 @@
 #pragma once
 
 #include <atomic>
+#include <cstdint>
 
 #include "edid_composer.h"
 
@@ -42,10 +43,11 @@ constexpr const char *operation_name(operation_t *, const char *name) {
   return name;
 }
 
-/// For "%p", which takes pointers to void only.
-inline const void *address(const void *pointer) {
-  return pointer;
-}
+/// A pointer as text: "(nil)" or hexadecimal digits, with every C library.
+struct address_t {
+  char text[sizeof "0x" + 2 * sizeof(std::uintptr_t)];
+};
+address_t address(const void *pointer);
 
 /// A C boolean as text.
 inline const char *true_or_false(bool value) {
@@ -54,13 +56,15 @@ inline const char *true_or_false(bool value) {
 
 }  // namespace edid_composer
 
-/// Declares `site`, in whose name the lines of the enclosing scope report. The build gives each module's folder its name.
-#define REPORTS_AS(operation)                    \
-  static constexpr ::edid_composer::site_t site { \
+/// Declares `site`, in whose name the lines of the enclosing scope report. The build gives each module's folder its
+/// name.
+#define REPORTS_AS(operation)                                                     \
+  static constexpr ::edid_composer::site_t site {                                 \
     EDID_COMPOSER_MODULE, ::edid_composer::operation_name(&operation, #operation) \
   }
 
 #define LOG_ERROR(...) ::edid_composer::log_error(site, __LINE__, __VA_ARGS__)
 #define LOG_WARNING(...) ::edid_composer::log_warning(site, __LINE__, __VA_ARGS__)
 #define LOG_BUG(...) ::edid_composer::log_bug(site, __LINE__, __VA_ARGS__)
-#define LOG_TRACE(...) (::edid_composer::is_tracing() ? ::edid_composer::log_trace(site, __LINE__, __VA_ARGS__) : void())
+#define LOG_TRACE(...) \
+  (::edid_composer::is_tracing() ? ::edid_composer::log_trace(site, __LINE__, __VA_ARGS__) : void())

@@ -35,8 +35,8 @@ compose_sink_status look_at_sink(const compose_request_t &request) {
     status = COMPOSE_SINK_NONE;
     LOG_TRACE(
         "\"edid_block\" memory block parameter is NULL. Skipping edid reading and proceeding with creation. "
-        "edid_block:%p",
-        address(request.sink));
+        "edid_block:%s",
+        address(request.sink).text);
   }
   if (request.sink_bytes == 0 || request.sink_bytes % block_size != 0) {
     if (status == COMPOSE_SINK_READ) {
@@ -51,8 +51,8 @@ compose_sink_status look_at_sink(const compose_request_t &request) {
 
 bool is_output_valid(const compose_request_t &request) {
   if (request.new_edid == nullptr) {
-    LOG_ERROR("\"new_edid_block\" memory block parameter is NULL. Unable to proceed. new_edid_block:%p",
-              address(request.new_edid));
+    LOG_ERROR("\"new_edid_block\" memory block parameter is NULL. Unable to proceed. new_edid_block:%s",
+              address(request.new_edid).text);
     return false;
   }
   if (request.new_edid_bytes < smallest_size || request.new_edid_bytes > largest_size) {
@@ -61,7 +61,7 @@ bool is_output_valid(const compose_request_t &request) {
     return false;
   }
   if (request.settings == nullptr) {
-    LOG_ERROR("cfg is NULL. Unable to proceed. cfg : %p.", address(request.settings));
+    LOG_ERROR("cfg is NULL. Unable to proceed. cfg : %s.", address(request.settings).text);
     return false;
   }
   return true;
@@ -116,8 +116,8 @@ void read_sink_into(workspace_t *work, const compose_request_t &request, compose
   if (status == COMPOSE_SINK_READ) {
     reading = read_sink(request.sink, request.sink_bytes, &work->sink, &work->arena);
   } else {
-    LOG_TRACE("Valid edid not available. Continuing composing edid. Passed in edid:%p size:%d bytes",
-              address(request.sink), request.sink_bytes);
+    LOG_TRACE("Valid edid not available. Continuing composing edid. Passed in edid:%s size:%d bytes",
+              address(request.sink).text, request.sink_bytes);
   }
   result->sink_status = reading.status;
   result->sink_extension_status = reading.extension_status;

@@ -12,7 +12,7 @@ REPORTS_AS(compose_edid_request);
 template <typename record_t>
 bool has_members(const char *name, const record_t *record) {
   if (record == nullptr) {
-    LOG_ERROR("\"%s\" parameter is NULL. %s:%p", name, name, address(record));
+    LOG_ERROR("\"%s\" parameter is NULL. %s:%s", name, name, address(record).text);
     return false;
   }
   if (record->size >= sizeof *record) return true;

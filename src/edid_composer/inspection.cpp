@@ -36,7 +36,7 @@ using namespace edid_composer;  // NOLINT(google-build-using-namespace): the ope
 
 void print_edid(const u8 *edid_block, u32 size, u8 brief, const char *title) {
   if (edid_block == nullptr) {
-    LOG_ERROR("\"edid_block\" memory block parameter is NULL. Exiting. edid_block:%p", address(edid_block));
+    LOG_ERROR("\"edid_block\" memory block parameter is NULL. Exiting. edid_block:%s", address(edid_block).text);
     return;
   }
   if (size % block_size != 0) {

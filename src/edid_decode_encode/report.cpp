@@ -226,7 +226,7 @@ using namespace edid_composer;  // NOLINT(google-build-using-namespace): the ope
 
 u8 print_edid_struct(const edid_t *edid, u8 brief, const char *title) {
   if (edid == nullptr) {
-    LOG_ERROR("\"edid\" parameter is NULL. edid:%p", address(edid));
+    LOG_ERROR("\"edid\" parameter is NULL. edid:%s", address(edid).text);
     return 0;
   }
   const char *const heading = title == nullptr ? "" : title;

@@ -84,7 +84,7 @@ using namespace edid_composer;  // NOLINT(google-build-using-namespace): the ope
 u8 decode_edid_short_audio(u8 byte1, u8 byte2, u8 byte3, short_audio_desc_t *audio) {
   REPORTS_AS(decode_edid_short_audio);
   if (audio == nullptr) {
-    LOG_ERROR("Function called with \"audio\" parameter set to NULL. audio=%p", address(audio));
+    LOG_ERROR("Function called with \"audio\" parameter set to NULL. audio=%s", address(audio).text);
     return 0;
   }
   const u32 format = u32{byte1} >> format_shift & format_mask;

@@ -24,7 +24,7 @@ bool init_list(ll_list_t *list, u32 tag) {
   REPORTS_AS(ll_init);
   const u32 magic = _get_magic_number(list);
   if (list->magic == magic) {
-    LOG_ERROR("List Corruption: This list has already been initialized. Ptr:%p MagicNum:%d", address(list), magic);
+    LOG_ERROR("List Corruption: This list has already been initialized. Ptr:%s MagicNum:%d", address(list).text, magic);
     return false;
   }
   *list = {.magic = magic, .type = tag, .size = 0, .head = nullptr};
@@ -38,12 +38,12 @@ inline ll_entry_t *entry_of_heap(u32 size, u32 tag, const void *entry_output, co
   REPORTS_AS(ll_create_entry);
   auto *const entry = static_cast<ll_entry_t *>(std::malloc(sizeof(ll_entry_t)));
   if (entry == nullptr) {
-    LOG_BUG("calloc failed to allocate memory for the entry. ptr:%p", address(entry_output));
+    LOG_BUG("calloc failed to allocate memory for the entry. ptr:%s", address(entry_output).text);
     return nullptr;
   }
   void *const data = std::malloc(size);
   if (data == nullptr) {
-    LOG_BUG("calloc failed to allocate memory for the data storage. ptr:%p", address(data_output));
+    LOG_BUG("calloc failed to allocate memory for the data storage. ptr:%s", address(data_output).text);
     std::free(entry);
     return nullptr;
   }
@@ -77,7 +77,7 @@ bool verify_entries(const ll_list_t &list) {
   const ll_entry_t *entry = list.head;
   do {
     if (entry->list == nullptr) {
-      LOG_BUG("Corrupt List: An entry's list attribute is set to NULL. Ptr:%p", address(entry->list));
+      LOG_BUG("Corrupt List: An entry's list attribute is set to NULL. Ptr:%s", address(entry->list).text);
       return false;
     }
     if (entry->type != list.type) {
@@ -90,8 +90,8 @@ bool verify_entries(const ll_list_t &list) {
 
   if (entry != nullptr) {
     LOG_ERROR(
-        "Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d NextPtr=%p",
-        counter, size, address(entry));
+        "Corrupt List: Either the list is the wrong size or the final entry is not NULL. Counted=%d Len=%d NextPtr=%s",
+        counter, size, address(entry).text);
     return false;
   }
   if (counter != size) {
@@ -106,13 +106,13 @@ bool verify_entries(const ll_list_t &list) {
 bool verify_integrity(const ll_list_t *list) {
   REPORTS_AS(ll_verify_integrity);
   if (list == nullptr) {
-    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
+    LOG_ERROR("\"list\" parameter is NULL. list:%s", address(list).text);
     return false;
   }
   if (const u32 magic = _get_magic_number(list); list->magic != magic) {
     // kept: the stored magic stands under the label ExpectedMagic.
-    LOG_ERROR("Corrupt List: List not initialized. Ptr:%p ExpectedMagic:%d Magic:%d Size:%d Head:%p ", address(list),
-              list->magic, magic, list->size, address(list->head));
+    LOG_ERROR("Corrupt List: List not initialized. Ptr:%s ExpectedMagic:%d Magic:%d Size:%d Head:%s ",
+              address(list).text, list->magic, magic, list->size, address(list->head).text);
     return false;
   }
   if (list->head == nullptr) {
@@ -121,7 +121,7 @@ bool verify_integrity(const ll_list_t *list) {
     return false;
   }
   if (list->size == 0) {
-    LOG_ERROR("Corrupt List: The list's size is zero, but the head isn't NULL. HeadPtr:%p", address(list->head));
+    LOG_ERROR("Corrupt List: The list's size is zero, but the head isn't NULL. HeadPtr:%s", address(list->head).text);
     return false;
   }
   return verify_entries(*list);
@@ -140,7 +140,7 @@ ll_entry_t **link_at(ll_list_t *list, u32 index) {
 template <const site_t &site>
 bool is_sound(const ll_list_t *list) {
   if (list == nullptr) {
-    LOG_ERROR("\"list\" parameter is NULL. list:%p", address(list));
+    LOG_ERROR("\"list\" parameter is NULL. list:%s", address(list).text);
     return false;
   }
   if (verify_integrity(list)) return true;
@@ -152,7 +152,7 @@ template <const site_t &site>
 bool accepts_entries(const ll_list_t *list, const ll_entry_t *new_entry) {
   if (!is_sound<site>(list)) return false;
   if (new_entry != nullptr) return true;
-  LOG_ERROR("\"new_entry\" parameter is NULL. new_entry:%p", address(new_entry));
+  LOG_ERROR("\"new_entry\" parameter is NULL. new_entry:%s", address(new_entry).text);
   return false;
 }
 
@@ -183,11 +183,11 @@ ll_entry_t *copy_of(const ll_entry_t &source, u32 size, entry_arena_t *arena) {
 bool copy_list(const ll_list_t *src_list, ll_list_t *dst_list, u32 size, entry_arena_t *arena) {
   REPORTS_AS(ll_copy_list);
   if (src_list == nullptr) {
-    LOG_ERROR("\"src_list\" parameter is NULL. src_list:%p", address(src_list));
+    LOG_ERROR("\"src_list\" parameter is NULL. src_list:%s", address(src_list).text);
     return false;
   }
   if (dst_list == nullptr) {
-    LOG_ERROR("\"dst_list\" parameter is NULL. dst_list:%p", address(dst_list));
+    LOG_ERROR("\"dst_list\" parameter is NULL. dst_list:%s", address(dst_list).text);
     return false;
   }
   if (!verify_integrity(src_list)) {
@@ -226,7 +226,7 @@ bool ll_init(ll_list_t *list, const char *type) {
     return false;
   }
   if (type == nullptr) {
-    LOG_ERROR("\"type\" ptr is NULL. type=%p", address(type));
+    LOG_ERROR("\"type\" ptr is NULL. type=%s", address(type).text);
     return false;
   }
   return init_list(list, _calculate_str_checksum(type));
@@ -248,7 +248,7 @@ bool ll_verify_list_type(const ll_list_t *list, const char *type) {
     return false;
   }
   if (type == nullptr) {
-    LOG_ERROR("\"type\" ptr is NULL. type=%p", address(type));
+    LOG_ERROR("\"type\" ptr is NULL. type=%s", address(type).text);
     return false;
   }
   return list->type == _calculate_str_checksum(type);
@@ -265,7 +265,7 @@ i32 ll_size(const ll_list_t *list) {
     return 0;
   }
   if (!verify_integrity(list)) {
-    LOG_BUG("Failed integrity test. list:%p", address(list));
+    LOG_BUG("Failed integrity test. list:%s", address(list).text);
     return 0;
   }
   return static_cast<i32>(list->size);
@@ -278,15 +278,15 @@ bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type
     return false;
   }
   if (entry == nullptr) {
-    LOG_ERROR("\"entry\" pointer is NULL. entry:%p", address(entry));
+    LOG_ERROR("\"entry\" pointer is NULL. entry:%s", address(entry).text);
     return false;
   }
   if (data == nullptr) {
-    LOG_ERROR("\"data\" pointer is NULL. data:%p", address(data));
+    LOG_ERROR("\"data\" pointer is NULL. data:%s", address(data).text);
     return false;
   }
   if (type == nullptr) {
-    LOG_ERROR("\"type\" pointer is NULL. type:%p", address(type));
+    LOG_ERROR("\"type\" pointer is NULL. type:%s", address(type).text);
     return false;
   }
   const auto bytes = static_cast<u32>(size);
@@ -299,7 +299,7 @@ bool ll_create_entry(i32 size, ll_entry_t **entry, void **data, const char *type
 bool ll_delete_entry(ll_entry_t *delete_entry) {
   REPORTS_AS(ll_delete_entry);
   if (delete_entry == nullptr) {
-    LOG_ERROR("\"delete_entry\" parameter is NULL. delete_entry:%p", address(delete_entry));
+    LOG_ERROR("\"delete_entry\" parameter is NULL. delete_entry:%s", address(delete_entry).text);
     return false;
   }
   std::free(delete_entry->data);
@@ -355,7 +355,7 @@ bool ll_add_entry_to_front(ll_list_t *list, ll_entry_t *new_entry) {
 bool ll_entry_at(const ll_list_t *list, i32 index, void **entry_data) {
   REPORTS_AS(ll_entry_at);
   if (entry_data == nullptr) {
-    LOG_ERROR("\"entry_data\" parameter is NULL. entry_data:%p", address(entry_data));
+    LOG_ERROR("\"entry_data\" parameter is NULL. entry_data:%s", address(entry_data).text);
     return false;
   }
   *entry_data = nullptr;
@@ -374,7 +374,7 @@ bool ll_delete_list(ll_list_t *list) {
     return false;
   }
   if (!verify_integrity(list)) {
-    LOG_BUG("Failed verifying integrity of the list. list:%p", address(list));
+    LOG_BUG("Failed verifying integrity of the list. list:%s", address(list).text);
     return false;
   }
   for (ll_entry_t *entry = list->head; entry != nullptr;) {

@@ -43,11 +43,11 @@ using namespace edid_composer;  // NOLINT(google-build-using-namespace): the ope
 u8 mode_to_vic(const video_mode_t *mode, u32 *vic) {
   REPORTS_AS(mode_to_vic);
   if (mode == nullptr) {
-    LOG_ERROR("Parameter \"mode\" is NULL. mode:%p", address(mode));
+    LOG_ERROR("Parameter \"mode\" is NULL. mode:%s", address(mode).text);
     return 0;
   }
   if (vic == nullptr) {
-    LOG_ERROR("Parameter \"vic\" is NULL. vic:%p", address(vic));
+    LOG_ERROR("Parameter \"vic\" is NULL. vic:%s", address(vic).text);
     return 0;
   }
   LOG_TRACE("\tMode is %dx%d%s%u. Attempting to find a match.", mode->width, mode->height,

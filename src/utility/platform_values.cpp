@@ -16,12 +16,10 @@ struct platform_list_t {
 
 constexpr platform_list_t platform_lists[] = {
     {&platform_values_t::audio_list, element_tag<i32>, "audio_list", "audio_list"},
-    {&platform_values_t::video_50_priority, element_tag<short_video_desc_t>, "video_50_priority",
-     "video_50_priority"},
+    {&platform_values_t::video_50_priority, element_tag<short_video_desc_t>, "video_50_priority", "video_50_priority"},
     {&platform_values_t::video_50_additional, element_tag<short_video_desc_t>, "video_50_additional",
      "video_50_additional"},
-    {&platform_values_t::video_60_priority, element_tag<short_video_desc_t>, "video_60_priority",
-     "video_60_priority"},
+    {&platform_values_t::video_60_priority, element_tag<short_video_desc_t>, "video_60_priority", "video_60_priority"},
     {&platform_values_t::video_60_additional, element_tag<short_video_desc_t>, "video_60_additional",
      "video_60_additional"},
     {&platform_values_t::std_timings, element_tag<std_timing_t>, "standard timings", "values standard timings"},
@@ -35,7 +33,7 @@ using namespace edid_composer;  // NOLINT(google-build-using-namespace): the ope
 bool platform_values_init(platform_values_t *values) {
   REPORTS_AS(platform_values_init);
   if (values == nullptr) {
-    LOG_ERROR("\"values\" parameter is NULL. values:%p", address(values));
+    LOG_ERROR("\"values\" parameter is NULL. values:%s", address(values).text);
     return false;
   }
   std::memset(values, 0, sizeof *values);
@@ -51,7 +49,7 @@ bool platform_values_init(platform_values_t *values) {
 bool platform_values_destroy(platform_values_t *values) {
   REPORTS_AS(platform_values_destroy);
   if (values == nullptr) {
-    LOG_ERROR("\"values\" parameter is NULL. values:%p", address(values));
+    LOG_ERROR("\"values\" parameter is NULL. values:%s", address(values).text);
     return false;
   }
   for (const auto &row : platform_lists) {

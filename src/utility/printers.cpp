@@ -51,7 +51,7 @@ template <const site_t &site, std::size_t count>
 int mask_string(const bit_name_t (&names)[count], const char *unspecified, u32 mask, char *string, u32 string_len) {
   constexpr u32 minimum = 17;
   if (string == nullptr) {
-    LOG_ERROR("\"string\" parameter is NULL. string:%p", address(string));
+    LOG_ERROR("\"string\" parameter is NULL. string:%s", address(string).text);
     return 0;
   }
   std::memset(string, 0, string_len);
@@ -88,7 +88,7 @@ void print_speaker(u8 byte1, u8 byte2, u8 byte3) {
 void print_audio_structure(const short_audio_desc_t *audio) {
   REPORTS_AS(print_audio_structure);
   if (audio == nullptr) {
-    LOG_ERROR("\"audio\" parameter is NULL. str:%p", address(audio));
+    LOG_ERROR("\"audio\" parameter is NULL. str:%s", address(audio).text);
     return;
   }
   char rates[100];
@@ -131,11 +131,11 @@ void print_stereo_type(u32 stereo_mask) {
 void print_est_man_type(u32 bits, const char *(*string_func)(u32), const char *str) {
   REPORTS_AS(print_est_man_type);
   if (string_func == nullptr) {
-    LOG_BUG("string_func is:%p", address(nullptr));
+    LOG_BUG("string_func is:%s", address(nullptr).text);
     return;
   }
   if (str == nullptr || *str == '\0') {
-    LOG_BUG("str ptr is NULL or 0 length:%p", address(str));
+    LOG_BUG("str ptr is NULL or 0 length:%s", address(str).text);
     return;
   }
   if (bits == 0) return;

@@ -7,7 +7,7 @@ using namespace edid_composer;  // NOLINT(google-build-using-namespace): the ope
 u8 convert_geo_to_ratio(u32 width, u32 height, u32 *ratio) {
   REPORTS_AS(convert_geo_to_ratio);
   if (ratio == nullptr) {
-    LOG_ERROR("\"ratio\" parameter is NULL. ratio=%p", address(ratio));
+    LOG_ERROR("\"ratio\" parameter is NULL. ratio=%s", address(ratio).text);
     return 0;
   }
   for (u32 code = 0; code < std::size(aspect_ratios); ++code) {

@@ -118,7 +118,7 @@ using namespace edid_composer;  // NOLINT(google-build-using-namespace): the ope
 u8 convert_vic_to_dtd(u32 vic, detailed_timing_t *timing) {
   REPORTS_AS(convert_vic_to_dtd);
   if (timing == nullptr) {
-    LOG_ERROR("\"timing\" parameter is NULL. timing:%p", address(timing));
+    LOG_ERROR("\"timing\" parameter is NULL. timing:%s", address(timing).text);
     return 0;
   }
   if (vic < 1 || vic > g_vic_dtd_size) {

@@ -57,7 +57,7 @@ tmds_clock_t declare_tmds_clock(const inputs_t &inputs, const ll_list_t &modes, 
 u32 _maximum_pixel_clock(const ll_list_t *vic_list) {
   REPORTS_AS(_maximum_pixel_clock);
   if (vic_list->size == 0) {
-    LOG_BUG("\tReceived a list that contains no entries. List:%p", address(vic_list));
+    LOG_BUG("\tReceived a list that contains no entries. List:%s", address(vic_list).text);
     return 0;
   }
   u32 maximum = 0;

@@ -100,7 +100,7 @@ bool _combine_lists(candidates_t *candidates, const ll_list_t *extra_list, bool 
   REPORTS_AS(_combine_lists);
   if (!ll_is_initialized(extra_list)) {
     // kept: the address is that of the list that is added to.
-    LOG_ERROR("extra_list has not been initialized. ptr=%p", address(candidates));
+    LOG_ERROR("extra_list has not been initialized. ptr=%s", address(candidates).text);
     return false;
   }
   LOG_TRACE("Combine Lists:");
