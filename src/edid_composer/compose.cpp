@@ -75,6 +75,14 @@ const platform_values_t *platform_of(const compose_request_t &request, workspace
   return nullptr;
 }
 
+/// kept: without a configuration the other records are destroyed although they were never prepared, which is reported.
+void destroy_unprepared(workspace_t *work) {
+  ll_list_t modes{};
+  if (edid_destroy(&work->sink) != 1) LOG_ERROR("Failed cleaning up edid.");
+  if (edid_destroy(&work->new_edid) != 1) LOG_ERROR("Failed cleaning up new_edid.");
+  if (!ll_delete_list(&modes)) LOG_ERROR("Failed cleaning up video list.");
+}
+
 /// The stages, each from its inputs to its outcome or into the new record. False when one can't go on.
 bool run_stages(const inputs_t &inputs, edid_t *new_edid, journal_t *journal, outcomes_t *outcomes) {
   outcomes->video = _filter_video_modes(inputs, &new_edid->video_list, journal);
@@ -145,10 +153,13 @@ bool compose(const compose_request_t &request, compose_result_t *result) {
   }
   workspace_t work;
   platform_values_init(&work.platform);
+  const platform_values_t *const platform = platform_of(request, &work);
+  if (platform == nullptr) {
+    destroy_unprepared(&work);
+    return false;
+  }
   edid_prepare(&work.sink);
   edid_prepare(&work.new_edid);
-  const platform_values_t *const platform = platform_of(request, &work);
-  if (platform == nullptr) return false;
   read_sink_into(&work, request, status, result);
 
   const inputs_t inputs{work.sink, *platform, *request.settings, &work.arena};

@@ -106,11 +106,6 @@ bool _decode_edid_dtd(const byte_view_t &dtd, appender_t<detailed_timing_t> *tim
 }
 
 void _replace_all_chars(u8 *string, i32 length, u8 from, u8 to) {
-  REPORTS_AS(_replace_all_chars);
-  if (string == nullptr) {
-    LOG_ERROR("String parameter is NULL.");
-    return;
-  }
   for (i32 i = 0; i < length; ++i) {
     if (string[i] == from) string[i] = to;
   }
@@ -119,15 +114,6 @@ void _replace_all_chars(u8 *string, i32 length, u8 from, u8 to) {
 bool _encode_edid_dtd(u8 *dtd_block, const detailed_timing_t *timing) {
   REPORTS_AS(_encode_edid_dtd);
   namespace layout = detailed_timing;
-  if (dtd_block == nullptr) {
-    LOG_ERROR("Function called with dtd_block set to NULL.");
-    return false;
-  }
-  if (timing == nullptr) {
-    // kept: the words for the other parameter.
-    LOG_ERROR("Function called with dtd_block set to NULL.");
-    return false;
-  }
   if (timing->valid != 1) {
     LOG_ERROR("Called encode DTD with an invalid timing structure.");
     return false;

@@ -41,14 +41,6 @@ u32 short_audio_type(u8 byte1, u8 byte3) {
 
 bool _encode_edid_short_audio(u8 *cea_block, short_audio_desc_t *audio) {
   REPORTS_AS(_encode_edid_short_audio);
-  if (cea_block == nullptr) {
-    LOG_ERROR("Function called with cea_block set to NULL.");
-    return false;
-  }
-  if (audio == nullptr) {
-    LOG_ERROR("Function called with audio set to NULL.");
-    return false;
-  }
   if (audio->type == 0 || audio->type == extension_escape) {
     LOG_ERROR("Audio type is not recognied. Type:%d", audio->type);
     return false;

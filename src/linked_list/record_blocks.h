@@ -13,7 +13,7 @@ struct record_block_t {
   record_t records[capacity];
 };
 
-/// Grows at its end and frees all when it goes. Addresses of records stay valid.
+/// As many as a block of an arena has room for.
 template <typename record_t>
 inline constexpr u32 records_per_block = 960 / sizeof(record_t);
 
