@@ -28,27 +28,23 @@ class situation_t {
     decode_edid_block_0(sink.data(), &downstream);
     if (sink.size() > block_size) decode_edid_extensions(sink.data() + block_size, block_size, &downstream);
     edid_prepare(&new_edid);
-    select_and_populate(&new_edid);
+    select_and_populate(&new_edid, &arena);
   }
-  ~situation_t() {
-    edid_destroy(&downstream);
-    edid_destroy(&new_edid);
-  }
+  ~situation_t() { edid_destroy(&downstream); }
   situation_t(const situation_t &) = delete;
   situation_t &operator=(const situation_t &) = delete;
 
-  inputs_t inputs() { return {downstream, *values.get(), cfg}; }
-  void select_video(ll_list_t *list) { _filter_video_modes(inputs(), list, &journal); }
-  void select_audio(ll_list_t *list) { _filter_audio_formats(inputs(), list, &journal); }
-  void select_and_populate(edid_t *edid) {
-    select_video(&edid->video_list);
-    select_audio(&edid->audio_list);
-    _populate_new_edid(inputs(), _filter_4k_modes(inputs()).selected, edid);
+  inputs_t inputs(entry_arena_t *entries) { return {downstream, *values.get(), cfg, entries}; }
+  void select_and_populate(edid_t *edid, entry_arena_t *entries) {
+    journal_t journal(false, entries);
+    _filter_video_modes(inputs(entries), &edid->video_list, &journal);
+    _filter_audio_formats(inputs(entries), &edid->audio_list, &journal);
+    _populate_new_edid(inputs(entries), _filter_4k_modes(inputs(entries)).selected, edid);
   }
 
   compose_cfg_t cfg = sample_settings();
   values_t values;
-  journal_t journal{false};
+  entry_arena_t arena;
   edid_t downstream;
   edid_t new_edid;
 };
@@ -62,29 +58,28 @@ void add(const std::string &name, const sink_t &sink, operation_t operation) {
                                });
 }
 
-/// A list that lasts as long as the stage's output does.
-template <typename operation_t>
-void with_list(const char *type, operation_t operation) {
+/// Runs a stage that fills a list, which goes with its arena.
+template <typename record_t, typename stage_t>
+void run_stage(situation_t *situation, stage_t stage) {
+  entry_arena_t arena;
+  journal_t journal(false, &arena);
   ll_list_t list{};
-  ll_init(&list, type);
-  operation(&list);
-  ll_delete_list(&list);
+  static_cast<void>(init_list<record_t>(&list));
+  stage(situation->inputs(&arena), &list, &journal);
 }
 
 void add_stages(const sink_t &sink) {
-  add("select_video_modes", sink, [](situation_t *situation) {
-    with_list("short_video_desc_t", [&](ll_list_t *list) { situation->select_video(list); });
-  });
+  add("select_video_modes", sink,
+      [](situation_t *situation) { run_stage<short_video_desc_t>(situation, _filter_video_modes); });
   add("select_4k_modes", sink,
-      [](situation_t *situation) { benchmark::DoNotOptimize(_filter_4k_modes(situation->inputs())); });
-  add("select_audio_formats", sink, [](situation_t *situation) {
-    with_list("short_audio_desc_t", [&](ll_list_t *list) { situation->select_audio(list); });
-  });
+      [](situation_t *situation) { benchmark::DoNotOptimize(_filter_4k_modes(situation->inputs(nullptr))); });
+  add("select_audio_formats", sink,
+      [](situation_t *situation) { run_stage<short_audio_desc_t>(situation, _filter_audio_formats); });
   add("select_and_populate", sink, [](situation_t *situation) {
-    edid_t edid;
+    entry_arena_t arena;
+    edid_t edid{};
     edid_prepare(&edid);
-    situation->select_and_populate(&edid);
-    edid_destroy(&edid);
+    situation->select_and_populate(&edid, &arena);
   });
   add("encode", sink, [](situation_t *situation) {
     std::array<u8, 2 * block_size> bytes;

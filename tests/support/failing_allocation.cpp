@@ -2,9 +2,12 @@
 
 #include <cstddef>
 
-// The linker sends calls of malloc() here: see the options of test_support.
+// The linker sends calls of malloc() and calloc() here; the compiler makes the second of the first where a memset()
+// follows.
 extern "C" void *__real_malloc(std::size_t size);
 extern "C" void *__wrap_malloc(std::size_t size);
+extern "C" void *__real_calloc(std::size_t count, std::size_t size);
+extern "C" void *__wrap_calloc(std::size_t count, std::size_t size);
 
 namespace {
 
@@ -16,6 +19,11 @@ bool fails_now() {
   if (countdown == 0) return fails_for_good;
   if (--countdown > 0) return false;
   return true;
+}
+
+void *announced(void *block) {
+  if (test_support::allocation_listener != nullptr) test_support::allocation_listener(block);
+  return block;
 }
 
 }  // namespace
@@ -41,8 +49,9 @@ bool failing_allocation_t::happened() const {
 }  // namespace test_support
 
 void *__wrap_malloc(std::size_t size) {
-  if (fails_now()) return nullptr;
-  void *const block = __real_malloc(size);
-  if (test_support::allocation_listener != nullptr) test_support::allocation_listener(block);
-  return block;
+  return fails_now() ? nullptr : announced(__real_malloc(size));
+}
+
+void *__wrap_calloc(std::size_t count, std::size_t size) {
+  return fails_now() ? nullptr : announced(__real_calloc(count, size));
 }

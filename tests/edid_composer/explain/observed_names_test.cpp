@@ -72,10 +72,10 @@ TEST(ObservedNames, OfReasons) {
                                           {19, "a format before it covers it"},
                                           {20, "the caller's audio mask excludes it"},
                                           {21, "no audio mask has a bit for its type"},
-                                          {22, "a detailed timing of the sink tells it"},
-                                          {23, "a standard timing of the sink tells it"},
-                                          {24, "a short video descriptor of the sink tells it"},
-                                          {25, "the platform's, as no mode of the sink tells it"},
+                                          {22, "that of the sink's first detailed timing at 50 or 60 Hz"},
+                                          {23, "that of the sink's first standard timing at 60 Hz"},
+                                          {24, "that of the sink's first short video descriptor at 50 or 60 Hz"},
+                                          {25, "the platform's, as no timing of the sink is at 50 or 60 Hz"},
                                           {26, "the platform's rate is neither 50 nor 60"},
                                           {27, "the tallest short video descriptor of the sink"},
                                           {28, "the platform sets no limit"},
@@ -107,7 +107,7 @@ TEST(ObservedNames, OfReasons) {
                                           {54, "enough modes were chosen"},
                                           {55, "every byte fits"},
                                           {56, "the extension is full: what comes last is left out"},
-                                          {57, "a data block is longer than its length field can tell"},
+                                          {57, "a data block is too long for its length field"},
                                           {58, "without a monitor name the extension is not announced"},
                                       });
 }

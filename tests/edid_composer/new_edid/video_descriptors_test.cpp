@@ -94,8 +94,9 @@ TEST_F(PopulationModes, EveryFailedAllocationOfAModeFailsThePopulation) {
     composer_fixtures::leave_room(&arena, room);
     const std::string output = test_support::output_of([&] {
       const test_support::failing_allocation_t failing(1);
-      EXPECT_EQ(populate(&arena), !failing.happened());
+      const bool complete = populate(&arena);
       failed = failing.happened();
+      EXPECT_EQ(complete, !failed);
     });
     const std::string failure = test_support::bug_line("linked_list", "ll_create_entry",
                                                        "calloc failed to allocate memory for the entry. ptr:PTR") +

@@ -267,8 +267,9 @@ TEST_F(AudioFormatFilter, EveryFormatThatThereIsNoMemoryForFailsTheFilterAndKeep
     test_support::scoped_list_t<short_audio_desc_t> formats;
     const std::string output = output_of([&] {
       const test_support::failing_allocation_t failing(1);
-      EXPECT_EQ(_filter_audio_formats(inputs(&arena), formats.get(), &journal_), !failing.happened());
+      const bool complete = _filter_audio_formats(inputs(&arena), formats.get(), &journal_);
       failed = failing.happened();
+      EXPECT_EQ(complete, !failed);
     });
     EXPECT_EQ(output, failed ? test_support::bug_line("linked_list", "ll_create_entry",
                                                       "calloc failed to allocate memory for the entry. ptr:PTR") +

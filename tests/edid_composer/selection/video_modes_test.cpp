@@ -260,8 +260,9 @@ TEST_F(VideoModeFilter, EveryFailedAllocationFailsTheFilter) {
     composer_fixtures::arena_list_t<short_video_desc_t> selected(&arena);
     const std::string output = output_of([&] {
       const test_support::failing_allocation_t failing(1);
-      EXPECT_EQ(_filter_video_modes(inputs(&arena), selected.get(), &journal_).complete, !failing.happened());
+      const bool complete = _filter_video_modes(inputs(&arena), selected.get(), &journal_).complete;
       failed = failing.happened();
+      EXPECT_EQ(complete, !failed);
     });
     EXPECT_EQ(output, failed ? no_memory + error(filter, "Failed creating entry.") : "");
     EXPECT_TRUE(ll_verify_integrity(selected.get()));
