@@ -10,8 +10,7 @@ namespace edid_composer {
 class configuration_readings_t {
  public:
   configuration_readings_t() = default;
-  configuration_readings_t(configuration_observer_t observer, void *context)
-      : observer_(observer), context_(context) {}
+  configuration_readings_t(configuration_observer_t observer, void *context) : observer_(observer), context_(context) {}
 
   /// A key with its number, or with its text.
   void note(const configuration_key_t &key, const configuration_outcome_t &outcome, const char *text = "") const;

@@ -38,16 +38,17 @@ void read_list(const configuration_key_t &key, const configuration_readings_t &r
   i32 entries = 0;
   i32 counting = 0;
   for (const configuration_entry_t &entry : list) {
-    const configuration_outcome_t outcome = entry.kind == entry_kind_t::other
-                                                ? configuration_outcome_t{.reason = CONFIGURATION_WRONG_KIND}
-                                                : parse(entry);
+    const configuration_outcome_t outcome =
+        entry.kind == entry_kind_t::other ? configuration_outcome_t{.reason = CONFIGURATION_WRONG_KIND} : parse(entry);
     readings.note_entry(entry, outcome, is_taken(outcome.reason) ? counting++ : -1);
     ++entries;
   }
   const bool is_empty = key.kind == CONFIGURATION_VIDEO_MODES && counting == 0;
-  readings.note_list(
-      key, !list.is_there() ? CONFIGURATION_ABSENT : is_empty ? CONFIGURATION_EMPTY : CONFIGURATION_TAKEN, entries,
-      counting);
+  readings.note_list(key,
+                     !list.is_there() ? CONFIGURATION_ABSENT
+                     : is_empty       ? CONFIGURATION_EMPTY
+                                      : CONFIGURATION_TAKEN,
+                     entries, counting);
 }
 
 bool is_within_limits(const configuration_entry_t &entry) {
@@ -113,8 +114,7 @@ void _get_est_timing_list(const configuration_key_t &key, u32 *mask, const confi
 
 void _get_std_timing_list(const configuration_key_t &key, ll_list_t *list, entry_arena_t *arena,
                           const configuration_readings_t &readings) {
-  read_list(key, readings,
-            [list, arena](const auto &entry) { return _get_std_timing_callback(entry, list, arena); });
+  read_list(key, readings, [list, arena](const auto &entry) { return _get_std_timing_callback(entry, list, arena); });
 }
 
 }  // namespace edid_composer

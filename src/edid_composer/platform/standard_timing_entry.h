@@ -9,6 +9,7 @@
 namespace edid_composer {
 
 /// Appends the standard timing of an entry; one that is none is reported.
-configuration_outcome_t _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *timings, entry_arena_t *arena);
+configuration_outcome_t _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *timings,
+                                                 entry_arena_t *arena);
 
 }  // namespace edid_composer

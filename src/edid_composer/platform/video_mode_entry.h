@@ -20,7 +20,8 @@ struct video_mode_words_t {
 int _scan_video_mode(const char *text, video_mode_words_t *words);
 
 /// Appends the mode of an entry; one that is none is reported. The number of the outcome is the VIC.
-configuration_outcome_t _get_vic_list_callback(const configuration_entry_t &entry, appender_t<short_video_desc_t> *modes);
+configuration_outcome_t _get_vic_list_callback(const configuration_entry_t &entry,
+                                               appender_t<short_video_desc_t> *modes);
 
 appender_t<short_video_desc_t> video_mode_appender(ll_list_t *modes, entry_arena_t *arena);
 
