@@ -70,7 +70,8 @@ bool is_output_valid(const compose_request_t &request) {
 /// The caller's platform values, else those of the configuration; null when that can't be read.
 const platform_values_t *platform_of(const compose_request_t &request, workspace_t *work) {
   if (request.platform_values != nullptr) return request.platform_values;
-  if (_read_platform_values(&work->platform, &work->arena)) return &work->platform;
+  const configuration_readings_t readings(request.configuration_observer, request.configuration_observer_context);
+  if (_read_platform_values(&work->platform, &work->arena, readings)) return &work->platform;
   LOG_ERROR("Failed trying to read the platform config file.");
   return nullptr;
 }

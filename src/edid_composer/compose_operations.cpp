@@ -1,4 +1,8 @@
 // The operations that compose: three ways to hand over one request.
+#include <algorithm>
+#include <cstddef>
+#include <cstring>
+
 #include "diagnostics.h"
 #include "edid_composer/compose.h"
 #include "output.h"
@@ -8,17 +12,29 @@ namespace {
 
 REPORTS_AS(compose_edid_request);
 
-/// True when a record is there and has the members of this version.
+/// The size of a record's first version, which callers were compiled with that know none of the members after it.
+template <typename record_t>
+constexpr u32 first_size = sizeof(record_t);
+template <>
+constexpr u32 first_size<compose_request_t> = offsetof(compose_request_t, configuration_observer);
+
+/// True when a record is there and has the members of its first version.
 template <typename record_t>
 bool has_members(const char *name, const record_t *record) {
   if (record == nullptr) {
     LOG_ERROR("\"%s\" parameter is NULL. %s:%s", name, name, address(record).text);
     return false;
   }
-  if (record->size >= sizeof *record) return true;
-  LOG_ERROR("The size of the %s is too small. Expected at least:%u Received:%u", name, static_cast<u32>(sizeof *record),
+  if (record->size >= first_size<record_t>) return true;
+  LOG_ERROR("The size of the %s is too small. Expected at least:%u Received:%u", name, first_size<record_t>,
             record->size);
   return false;
+}
+
+/// Copies the members that both sides know.
+template <typename record_t>
+void copy_members(record_t *target, const record_t &source, u32 size) {
+  std::memcpy(target, &source, std::min<std::size_t>(size, sizeof source));
 }
 
 // A frame of its own for the redirection's line.
@@ -53,9 +69,12 @@ bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_bl
 
 bool compose_edid_request(const compose_request_t *request, compose_result_t *result) {
   if (!has_members("request", request) || !has_members("result", result)) return false;
-  *result = {};
-  result->size = sizeof *result;
-  const bool composed = request->log == nullptr ? compose(*request, result) : compose_redirected(*request, result);
-  if (!composed) result->bytes_written = result->physical_address_offset = 0;
+  compose_request_t known{};
+  copy_members(&known, *request, request->size);
+  compose_result_t filled{};
+  filled.size = static_cast<u32>(std::min<std::size_t>(result->size, sizeof filled));
+  const bool composed = known.log == nullptr ? compose(known, &filled) : compose_redirected(known, &filled);
+  if (!composed) filled.bytes_written = filled.physical_address_offset = 0;
+  copy_members(result, filled, filled.size);
   return composed;
 }

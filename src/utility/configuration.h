@@ -1,31 +1,26 @@
-// Where the library's keys stand in the host's configuration tree.
+// Single values of the host's configuration tree, under the domain of the library's keys.
 #pragma once
 
-#include <cstddef>
-#include <cstring>
+#include "edid_composer.h"
 
 #define CONFIGURATION_DOMAIN "platform.software.drivers.vorex.edid."
 
 namespace edid_composer {
 
-/// The full path of a key, cut to @p size - 1 characters. Copied, not printed: a composition makes some fifty of them.
-template <std::size_t size>
-class configuration_path_t {
- public:
-  explicit configuration_path_t(const char *key) {
-    if (key == nullptr) key = "(null)";  // as printf has it
-    const std::size_t length = strnlen(key, size - domain_length - 1);
-    std::memcpy(text_, CONFIGURATION_DOMAIN, domain_length);
-    std::memcpy(text_ + domain_length, key, length);
-    text_[domain_length + length] = '\0';
-  }
-  const char *text() const { return text_; }
-
- private:
-  static constexpr std::size_t domain_length = sizeof CONFIGURATION_DOMAIN - 1;
-  static_assert(size > domain_length);
-
-  char text_[size];
+/// What became of a value of the configuration. Numbers that are read unsigned keep their bits.
+struct configuration_outcome_t {
+  configuration_reason reason = CONFIGURATION_TAKEN;
+  i32 found = 0;  ///< What stands there; 0 where nothing does.
+  i32 used = 0;   ///< What counts instead, or the same.
 };
+
+// The rules of the public getters, for a whole path and with their outcome. They report in the getters' names.
+
+configuration_outcome_t read_configuration_int(const char *path, i32 min, i32 max, i32 default_val,
+                                               bool print_warnings);
+configuration_outcome_t read_configuration_uint(const char *path, u32 min, u32 max, u32 default_val,
+                                                bool print_warnings);
+configuration_outcome_t read_configuration_str(const char *path, char *dst, u32 size, const char *default_val,
+                                               bool print_warnings);
 
 }  // namespace edid_composer

@@ -1,7 +1,6 @@
 #include "edid_composer/platform/configuration_list.h"
 
 #include "diagnostics.h"
-#include "utility/configuration.h"
 
 namespace edid_composer {
 namespace {
@@ -10,57 +9,68 @@ REPORTS_AS(_get_generic_platform_list);
 
 constexpr int not_found = 2;
 
-}  // namespace
-
-configuration_list_t _get_generic_platform_list(const char *list_name, entry_kind_t kind) {
-  return {list_name, kind};
+constexpr bool holds_numbers(const configuration_key_t &key) {
+  return key.kind == CONFIGURATION_HDMI_VICS || key.kind == CONFIGURATION_TIMING_BITS;
 }
 
-configuration_list_t::configuration_list_t(const char *list_name, entry_kind_t kind) : kind_(kind) {
-  find(list_name);
+}  // namespace
+
+configuration_list_t _get_generic_platform_list(const configuration_key_t &key) {
+  return configuration_list_t(key);
+}
+
+configuration_list_t::configuration_list_t(const configuration_key_t &key) {
+  entry_.key = &key;
+  find(key.path);
   if (ended_) return;
-  entry_.list_name = list_name;
+  entry_.index = 0;
   for (char &character : entry_.text)
     character = '\0';
   print_platform_node(node_, "\tFirst Child Node");
-  if (!read_entry()) move_to_next();
+  read_entry();
 }
 
 /// Moves to the first node of the list.
-void configuration_list_t::find(const char *list_name) {
-  const configuration_path_t<128> path(list_name);
+void configuration_list_t::find(const char *path) {
   u32 list = 0;
-  if (config_node_find(0, path.text(), &list) == not_found) {
-    LOG_ERROR("Unabled to find the platform node:%s.\n", path.text());
+  if (config_node_find(0, path, &list) == not_found) {
+    LOG_ERROR("Unabled to find the platform node:%s.\n", path);
     return;
   }
+  is_there_ = true;
   print_platform_node(list, "\tRoot Node");
   ended_ = config_node_first_child(list, &node_) == not_found;
 }
 
 void configuration_list_t::move_to_next() {
-  do {
-    u32 next = node_;
-    ended_ = config_node_next_sibling(node_, &next) != 0;
-    node_ = next;
-  } while (!ended_ && !read_entry());
+  u32 next = node_;
+  ended_ = config_node_next_sibling(node_, &next) != 0;
+  node_ = next;
+  ++entry_.index;
+  if (!ended_) read_entry();
 }
 
-/// Reads the node; false, with a report, when it is of another kind.
-bool configuration_list_t::read_entry() {
+/// Reads the node; one of another kind is reported.
+void configuration_list_t::read_entry() {
   print_platform_node(node_, "\tNext Node");
   entry_.node_name[0] = '\0';
   config_node_get_name(node_, entry_.node_name, sizeof entry_.node_name);
   entry_.number = -1;
-  if (kind_ == entry_kind_t::number) {
-    if (config_node_get_int(node_, &entry_.number) == 0) return true;
-    LOG_ERROR("Invalid platform configuration entry. Expected an integer. Entry name:%s", entry_.node_name);
+  entry_.kind = entry_kind_t::other;
+  if (holds_numbers(*entry_.key)) {
+    if (config_node_get_int(node_, &entry_.number) == 0) {
+      entry_.kind = entry_kind_t::number;
+    } else {
+      LOG_ERROR("Invalid platform configuration entry. Expected an integer. Entry name:%s", entry_.node_name);
+    }
   } else {
     // The last byte stays 0, whatever the host writes.
-    if (config_node_get_str(node_, entry_.text, sizeof entry_.text - 1) == 0) return true;
-    LOG_ERROR("Invalid platform configuration entry. Expected a string. Entry name:%s\n", entry_.node_name);
+    if (config_node_get_str(node_, entry_.text, sizeof entry_.text - 1) == 0) {
+      entry_.kind = entry_kind_t::text;
+    } else {
+      LOG_ERROR("Invalid platform configuration entry. Expected a string. Entry name:%s\n", entry_.node_name);
+    }
   }
-  return false;
 }
 
 }  // namespace edid_composer

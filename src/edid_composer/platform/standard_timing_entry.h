@@ -4,10 +4,12 @@
 
 #include "edid_composer/platform/configuration_list.h"
 #include "linked_list/entry_arena.h"
+#include "utility/configuration.h"
 
 namespace edid_composer {
 
-/// Appends the standard timing of an entry; false, with a report, when it is none.
-bool _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *timings, entry_arena_t *arena);
+/// Appends the standard timing of an entry; one that is none is reported.
+configuration_outcome_t _get_std_timing_callback(const configuration_entry_t &entry, ll_list_t *timings,
+                                                 entry_arena_t *arena);
 
 }  // namespace edid_composer

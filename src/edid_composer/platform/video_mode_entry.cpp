@@ -44,40 +44,42 @@ int _scan_video_mode(const char *text, video_mode_words_t *words) {
   return fields;
 }
 
-bool _get_vic_list_callback(const configuration_entry_t &entry, appender_t<short_video_desc_t> *modes) {
+configuration_outcome_t _get_vic_list_callback(const configuration_entry_t &entry,
+                                               appender_t<short_video_desc_t> *modes) {
   REPORTS_AS(_get_vic_list_callback);
-  constexpr i32 first_vic = 1;
-  constexpr i32 last_vic = 64;
-  LOG_TRACE("Reading from list:%s Node:%s => %s", entry.list_name, entry.node_name, entry.text);
+  const configuration_key_t &key = *entry.key;
+  LOG_TRACE("Reading from list:%s Node:%s => %s", key.name, entry.node_name, entry.text);
 
   video_mode_words_t words{};
   const int fields = _scan_video_mode(entry.text, &words);
   const auto &flags = words.flags;
   const i32 vic = low_32_bits(words.number);
   if (fields <= 0) {
-    LOG_WARNING("Invalid string \"%s\" in %s", entry.text, entry.list_name);
-    return false;
+    LOG_WARNING("Invalid string \"%s\" in %s", entry.text, key.name);
+    return {.reason = CONFIGURATION_NOT_A_NUMBER};
   }
-  if (vic < first_vic || vic > last_vic) {
+  if (vic < static_cast<i32>(key.minimum) || vic > static_cast<i32>(key.maximum)) {
     LOG_WARNING(
         "Read a vic value from the platform config file that has an unexpected value:%d. Range:(%d-%d) Ignoring and "
         "continuing.",
-        vic, first_vic, last_vic);
-    return false;
+        vic, key.minimum, key.maximum);
+    return {.reason = CONFIGURATION_OUT_OF_RANGE, .found = vic};
   }
   u32 stereo = 0;
   for (int i = fields - 2; i >= 0; --i) {
     const u32 bit = stereo_of_flag(flags[i]);
     if (bit == 0) {
-      LOG_WARNING("Invalid 3D flag \"%s\" in %s", flags[i], entry.list_name);
-      LOG_WARNING("Invalid string \"%s\" in %s", entry.text, entry.list_name);
-      return false;
+      LOG_WARNING("Invalid 3D flag \"%s\" in %s", flags[i], key.name);
+      LOG_WARNING("Invalid string \"%s\" in %s", entry.text, key.name);
+      return {.reason = CONFIGURATION_3D_UNKNOWN, .found = vic};
     }
     stereo |= bit;
   }
-  if (!modes->append({.native = 0, .vic = static_cast<u32>(vic), .stereo = stereo})) return false;
+  if (!modes->append({.native = 0, .vic = static_cast<u32>(vic), .stereo = stereo})) {
+    return {.reason = CONFIGURATION_OUT_OF_MEMORY, .found = vic};
+  }
   LOG_TRACE("\tFound list entry: %s = \"%d %s %s %s\"", entry.node_name, vic, flags[0], flags[1], flags[2]);
-  return true;
+  return {.found = vic, .used = vic};
 }
 
 appender_t<short_video_desc_t> video_mode_appender(ll_list_t *modes, entry_arena_t *arena) {

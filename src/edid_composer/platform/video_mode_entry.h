@@ -5,6 +5,7 @@
 
 #include "edid_composer/platform/configuration_list.h"
 #include "linked_list/typed_list.h"
+#include "utility/configuration.h"
 
 namespace edid_composer {
 
@@ -18,8 +19,9 @@ struct video_mode_words_t {
 /// words that aren't there stay as they are.
 int _scan_video_mode(const char *text, video_mode_words_t *words);
 
-/// Appends the mode of an entry; false, with a report, when it is none.
-bool _get_vic_list_callback(const configuration_entry_t &entry, appender_t<short_video_desc_t> *modes);
+/// Appends the mode of an entry; one that is none is reported. The number of the outcome is the VIC.
+configuration_outcome_t _get_vic_list_callback(const configuration_entry_t &entry,
+                                               appender_t<short_video_desc_t> *modes);
 
 appender_t<short_video_desc_t> video_mode_appender(ll_list_t *modes, entry_arena_t *arena);
 

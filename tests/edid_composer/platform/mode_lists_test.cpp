@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "edid_composer/composer_lines.h"
+#include "edid_composer/platform/key_rows.h"
 #include "support/configuration_tree.h"
 #include "support/output_capture.h"
 #include "support/records.h"
@@ -23,6 +24,8 @@ using edid_composer::_get_4k_x_2k_modes;
 using edid_composer::_get_est_timing_list;
 using edid_composer::_get_platform_list;
 using edid_composer::_get_std_timing_list;
+using key_rows::key;
+using key_rows::row;
 using test_support::configuration_tree_t;
 using test_support::output_of;
 using test_support::traced_output_of;
@@ -47,7 +50,7 @@ class Mode4kEntry : public testing::Test {
   std::string read(const slots_t &entries) {
     for (const i32 entry : entries)
       tree_.add("4k_x_2k_priority_list", entry);
-    return output_of([&] { _get_4k_x_2k_modes("4k_x_2k_priority_list", modes_); });
+    return output_of([&] { _get_4k_x_2k_modes(key("4k_x_2k_priority_list"), modes_, {}); });
   }
   slots_t slots() const { return {std::begin(modes_), std::end(modes_)}; }
 
@@ -80,7 +83,7 @@ TEST_F(Mode4kEntry, SlotsAreCountedFromTheFirstForEachList) {
   tree_.add("4k_x_2k_addition_list", 4);
   EXPECT_EQ(read({1, 2}), "");
   i32 addition[7]{};
-  _get_4k_x_2k_modes("4k_x_2k_addition_list", addition);
+  _get_4k_x_2k_modes(key("4k_x_2k_addition_list"), addition, {});
   EXPECT_EQ(addition[0], 4);
   EXPECT_EQ(addition[1], 0);
 }
@@ -88,7 +91,7 @@ TEST_F(Mode4kEntry, SlotsAreCountedFromTheFirstForEachList) {
 TEST_F(Mode4kEntry, FirstSevenAreKeptAndTheOthersLeaveNoTrace) {
   EXPECT_EQ(read({1, 2, 3, 4, 3, 2, 1, 4, 3}), "");
   EXPECT_EQ(slots(), (slots_t{1, 2, 3, 4, 3, 2, 1}));
-  const std::string traced = traced_output_of([&] { _get_4k_x_2k_modes("4k_x_2k_priority_list", modes_); });
+  const std::string traced = traced_output_of([&] { _get_4k_x_2k_modes(key("4k_x_2k_priority_list"), modes_, {}); });
   EXPECT_EQ(test_support::count_of(traced, trace("_get_4k_x_2k_mode_callback", "Read 4k x 2k mode:2")), 2);
   EXPECT_EQ(test_support::count_of(traced, "Read 4k x 2k mode:"), 7);
 }
@@ -98,7 +101,7 @@ class TimingBitEntry : public testing::Test {
   std::string read(const char *list, const slots_t &entries) {
     for (const i32 entry : entries)
       tree_.add(list, entry);
-    return output_of([&] { _get_est_timing_list(list, &mask_); });
+    return output_of([&] { _get_est_timing_list(key(list), &mask_, {}); });
   }
 
   configuration_tree_t tree_;
@@ -133,13 +136,13 @@ TEST_F(TimingBitEntry, IsAddedToWhatTheMaskHolds) {
 
 TEST_F(TimingBitEntry, IsTracedWithItsList) {
   tree_.add("established_timings_1", 3);
-  const std::string traced = traced_output_of([&] { _get_est_timing_list("established_timings_1", &mask_); });
+  const std::string traced = traced_output_of([&] { _get_est_timing_list(key("established_timings_1"), &mask_, {}); });
   EXPECT_NE(traced.find(trace("_get_est_timing_callback", "Added timing val:3 for list:established_timings_1")),
             std::string::npos);
 }
 
 struct video_list_t {
-  edid_composer::platform_list_type type;
+  u32 number;
   const char *key;
   const char *reading;
 };
@@ -159,7 +162,7 @@ TEST_P(VideoListReader, ReadsTheListOfItsType) {
     tree_.add(key, std::string(key == std::string(GetParam().key) ? "16 FP" : "1"));
   }
   const std::string node = std::string("Node:Name of node is:");
-  EXPECT_EQ(traced_output_of([&] { _get_platform_list(GetParam().type, list_.get(), nullptr); }),
+  EXPECT_EQ(traced_output_of([&] { _get_platform_list(row(GetParam().key), list_.get(), nullptr, {}); }),
             trace("_get_platform_list", std::string("Reading ") + GetParam().reading + " list from platform config.") +
                 trace("print_platform_node", "\tRoot " + node + GetParam().key) +
                 trace("print_platform_node", "\tFirst Child " + node + "entry_0") +
@@ -172,28 +175,27 @@ TEST_P(VideoListReader, ReadsTheListOfItsType) {
 
 TEST_P(VideoListReader, ReportsAnEmptyListByItsType) {
   tree_.add_list(GetParam().key);
-  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get(), nullptr); }),
-            empty_list(std::to_string(GetParam().type)));
+  EXPECT_EQ(output_of([&] { _get_platform_list(row(GetParam().key), list_.get(), nullptr, {}); }),
+            empty_list(std::to_string(GetParam().number)));
 }
 
 TEST_P(VideoListReader, ReportsAMissingNodeAndThenTheEmptyList) {
-  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get(), nullptr); }),
-            unabled(domain + GetParam().key) + empty_list(std::to_string(GetParam().type)));
+  EXPECT_EQ(output_of([&] { _get_platform_list(row(GetParam().key), list_.get(), nullptr, {}); }),
+            unabled(domain + GetParam().key) + empty_list(std::to_string(GetParam().number)));
 }
 
 TEST_P(VideoListReader, KeepsWhatTheDestinationHeldAndCallsItNotEmpty) {
   test_support::append_modes(*list_, {{4, 0}});
-  EXPECT_EQ(output_of([&] { _get_platform_list(GetParam().type, list_.get(), nullptr); }),
+  EXPECT_EQ(output_of([&] { _get_platform_list(row(GetParam().key), list_.get(), nullptr, {}); }),
             unabled(domain + GetParam().key));
   EXPECT_EQ(ll_size(list_.get()), 1);
 }
 
-INSTANTIATE_TEST_SUITE_P(
-    PlatformModeLists, VideoListReader,
-    testing::Values(video_list_t{edid_composer::list_50_priority, "50_hz_priority_list", "50Hz priority"},
-                    video_list_t{edid_composer::list_60_priority, "60_hz_priority_list", "60Hz priority"},
-                    video_list_t{edid_composer::list_50_additional, "50_hz_addition_list", "50Hz additional"},
-                    video_list_t{edid_composer::list_60_additional, "60_hz_addition_list", "60Hz additional"}));
+INSTANTIATE_TEST_SUITE_P(PlatformModeLists, VideoListReader,
+                         testing::Values(video_list_t{0, "50_hz_priority_list", "50Hz priority"},
+                                         video_list_t{1, "60_hz_priority_list", "60Hz priority"},
+                                         video_list_t{2, "50_hz_addition_list", "50Hz additional"},
+                                         video_list_t{3, "60_hz_addition_list", "60Hz additional"}));
 
 TEST(PlatformModeLists, MissingListsLeaveTheirDestinationsAlone) {
   const configuration_tree_t tree;
@@ -201,9 +203,9 @@ TEST(PlatformModeLists, MissingListsLeaveTheirDestinationsAlone) {
   u32 mask = 0x40;
   test_support::scoped_list_t<std_timing_t> timings;
   EXPECT_EQ(output_of([&] {
-              _get_4k_x_2k_modes("4k_x_2k_priority_list", modes);
-              _get_est_timing_list("established_timings_1", &mask);
-              _get_std_timing_list(timings.get(), nullptr);
+              _get_4k_x_2k_modes(key("4k_x_2k_priority_list"), modes, {});
+              _get_est_timing_list(key("established_timings_1"), &mask, {});
+              _get_std_timing_list(key("standard_timings"), timings.get(), nullptr, {});
             }),
             unabled(domain + "4k_x_2k_priority_list") + unabled(domain + "established_timings_1") +
                 unabled(domain + "standard_timings"));

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "edid_composer/composer_lines.h"
+#include "edid_composer/platform/key_rows.h"
 #include "edid_composer/platform/mode_lists.h"
 #include "support/configuration_tree.h"
 #include "support/failing_allocation.h"
@@ -20,6 +21,7 @@ using composer_lines::error;
 using composer_lines::warning;
 using edid_composer::_get_std_timing_callback;
 using edid_composer::_get_std_timing_list;
+using key_rows::key;
 using test_support::output_of;
 
 using timings_t = std::vector<test_support::std_timing_words_t>;
@@ -57,7 +59,7 @@ class StandardTimingEntry : public testing::Test {
     tree_.clear();
     for (const std::string &entry : entries)
       tree_.add("standard_timings", entry);
-    return output_of([&] { _get_std_timing_list(list_.get(), nullptr); });
+    return output_of([&] { _get_std_timing_list(key("standard_timings"), list_.get(), nullptr, {}); });
   }
   timings_t timings() { return test_support::std_timings_of(*list_); }
 
@@ -159,21 +161,27 @@ TEST_F(StandardTimingEntry, IncrementedRateWraps) {
 
 TEST_F(StandardTimingEntry, NumbersThatFillTheBufferLeaveNoneBehindIt) {
   // The third number ends at the last byte, so the fraction would begin behind the buffer.
-  const edid_composer::configuration_entry_t entry{"standard_timings", "node", -1, "00000000008 0000000008 000061"};
+  const edid_composer::configuration_entry_t entry{
+      &key("standard_timings"), 0, edid_composer::entry_kind_t::text, "node", -1, "00000000008 0000000008 000061"};
   ASSERT_EQ(std::strlen(entry.text), sizeof entry.text - 1);
-  EXPECT_EQ(output_of([&] { EXPECT_TRUE(_get_std_timing_callback(entry, list_.get(), nullptr)); }), "");
+  EXPECT_EQ(output_of([&] {
+              EXPECT_EQ(_get_std_timing_callback(entry, list_.get(), nullptr).reason,
+                        CONFIGURATION_WIDTH_NOT_ENCODABLE);
+            }),
+            "");
   EXPECT_EQ(timings(), (timings_t{{8, 0, 61}}));
 }
 
 TEST_F(StandardTimingEntry, RatioThatIsNoneIsTracedByTheConversion) {
   tree_.add("standard_timings", std::string("1280 1000 60"), "node");
-  EXPECT_EQ(test_support::traced_output_of([&] { _get_std_timing_list(list_.get(), nullptr); }),
-            composer_lines::trace("print_platform_node", "\tRoot Node:Name of node is:standard_timings") +
-                composer_lines::trace("print_platform_node", "\tFirst Child Node:Name of node is:node") +
-                composer_lines::trace("print_platform_node", "\tNext Node:Name of node is:node") +
-                composer_lines::trace("convert_geo_to_ratio",
-                                      "Got a set of values that didn't match an aspect ratio. width=1280 height=1000") +
-                bad_ratio("1000", "1280", "1:1=>1280 4:3=>960 5:4=>1600 16:9=>2275", "1280 1000 60"));
+  EXPECT_EQ(
+      test_support::traced_output_of([&] { _get_std_timing_list(key("standard_timings"), list_.get(), nullptr, {}); }),
+      composer_lines::trace("print_platform_node", "\tRoot Node:Name of node is:standard_timings") +
+          composer_lines::trace("print_platform_node", "\tFirst Child Node:Name of node is:node") +
+          composer_lines::trace("print_platform_node", "\tNext Node:Name of node is:node") +
+          composer_lines::trace("convert_geo_to_ratio",
+                                "Got a set of values that didn't match an aspect ratio. width=1280 height=1000") +
+          bad_ratio("1000", "1280", "1:1=>1280 4:3=>960 5:4=>1600 16:9=>2275", "1280 1000 60"));
 }
 
 TEST_F(StandardTimingEntry, ThatTheListRefusesIsReportedAndTheWalkGoesOn) {
@@ -189,7 +197,7 @@ TEST_F(StandardTimingEntry, WithoutMemoryIsReportedAndTheWalkGoesOn) {
   tree_.add("standard_timings", std::string("1920 1080 60"));
   EXPECT_EQ(output_of([&] {
               const test_support::failing_allocation_t failing(2);
-              _get_std_timing_list(list_.get(), nullptr);
+              _get_std_timing_list(key("standard_timings"), list_.get(), nullptr, {});
             }),
             test_support::bug_line("linked_list", "ll_create_entry",
                                    "calloc failed to allocate memory for the data storage. ptr:PTR") +

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "edid_composer/composer_lines.h"
+#include "edid_composer/platform/key_rows.h"
 #include "edid_composer/platform/mode_lists.h"
 #include "support/configuration_tree.h"
 #include "support/failing_allocation.h"
@@ -19,7 +20,7 @@ using composer_lines::error;
 using composer_lines::trace;
 using composer_lines::warning;
 using edid_composer::_get_platform_list;
-using edid_composer::list_60_priority;
+using key_rows::row;
 using test_support::output_of;
 
 using modes_t = std::vector<test_support::mode_pair_t>;
@@ -47,7 +48,7 @@ class VideoModeEntry : public testing::Test {
     for (const std::string &entry : entries)
       tree_.add(list_key, entry);
     tree_.add(list_key, std::string("1"));
-    return output_of([&] { _get_platform_list(list_60_priority, list_.get(), nullptr); });
+    return output_of([&] { _get_platform_list(row(list_key), list_.get(), nullptr, {}); });
   }
 
   /// The modes that were read from the entries.
@@ -131,7 +132,10 @@ TEST_F(VideoModeEntry, NumberOfAnySizeKeepsItsLow32Bits) {
 TEST_F(VideoModeEntry, ThatIsSkippedIsTracedAsReadOnly) {
   EXPECT_EQ(test_support::traced_output_of([&] {
               auto modes = edid_composer::video_mode_appender(list_.get(), nullptr);
-              EXPECT_FALSE(edid_composer::_get_vic_list_callback({list_key, "node", -1, "16 XYZ"}, &modes));
+              EXPECT_EQ(edid_composer::_get_vic_list_callback(
+                            {&row(list_key).key, 0, edid_composer::entry_kind_t::text, "node", -1, "16 XYZ"}, &modes)
+                            .reason,
+                        CONFIGURATION_3D_UNKNOWN);
             }),
             trace(parser, "Reading from list:60_hz_priority_list Node:node => 16 XYZ") + invalid_flag("XYZ") +
                 invalid_string("16 XYZ"));
@@ -142,7 +146,7 @@ TEST_F(VideoModeEntry, ThatTheListRefusesIsReportedAndTheWalkGoesOn) {
   ASSERT_TRUE(ll_init(list_.get(), "int"));
   tree_.add(list_key, std::string("16"));
   tree_.add(list_key, std::string("4"));
-  const std::string output = output_of([&] { _get_platform_list(list_60_priority, list_.get(), nullptr); });
+  const std::string output = output_of([&] { _get_platform_list(row(list_key), list_.get(), nullptr, {}); });
   EXPECT_EQ(test_support::count_of(output, error(parser, "Failed adding entry to the back of the list.")), 2);
   EXPECT_EQ(test_support::count_of(output, "ll_add_entry_to_back() BUG: This entry represents a different type"), 2);
   EXPECT_EQ(test_support::count_of(output, "Found list entry"), 0);
@@ -154,7 +158,7 @@ TEST_F(VideoModeEntry, WithoutMemoryIsReportedAndTheWalkGoesOn) {
   tree_.add(list_key, std::string("4"));
   const std::string output = output_of([&] {
     const test_support::failing_allocation_t failing(1);
-    _get_platform_list(list_60_priority, list_.get(), nullptr);
+    _get_platform_list(row(list_key), list_.get(), nullptr, {});
   });
   EXPECT_EQ(output, test_support::bug_line("linked_list", "ll_create_entry",
                                            "calloc failed to allocate memory for the entry. ptr:PTR") +
