@@ -5,8 +5,9 @@
 #include <sstream>
 #include <stdexcept>
 
-#include "annotation.h"
 #include "config_store.h"
+#include "explain/byte_names.h"
+#include "explain/explanation_text.h"
 #include "support/hex_text.h"
 #include "support/observation.h"
 #include "support/output_capture.h"
@@ -33,14 +34,55 @@ compose_cfg_t settings_of(const golden_case_t &golden_case, u8 *address_offset) 
   return settings;
 }
 
+std::vector<u8> sink_of(const golden_case_t &golden_case) {
+  return test_support::bytes_of_hex_file((sinks_directory() / (golden_case.sink + ".txt")).string());
+}
+
 std::string report_of(const golden_case_t &golden_case, const std::vector<u8> &edid, bool brief) {
   return test_support::output_of(
       [&] { print_edid(edid.data(), static_cast<u32>(edid.size()), brief ? 1 : 0, golden_case.name().c_str()); });
 }
 
+/// The bytes as the program names them, each field on a line of its own, or on several; the name stands on the first.
+std::string named_bytes(const std::vector<u8> &edid) {
+  constexpr std::size_t bytes_in_a_line = 18;  // As many as a descriptor has.
+  std::string text;
+  for (const edid_cli::byte_field_t &field : edid_cli::name_bytes(edid)) {
+    std::string line;
+    for (std::size_t i = 0; i < field.size; ++i) {
+      line += format("%02X ", edid[field.offset + i]);
+      if (i == std::min(field.size, bytes_in_a_line) - 1) {
+        line.resize(3 * bytes_in_a_line, ' ');
+        line += "# " + field.name + ": " + field.meaning + "\n";
+      } else if (i % bytes_in_a_line == bytes_in_a_line - 1 || i == field.size - 1) {
+        line += "\n";
+      }
+    }
+    text += line;
+  }
+  return text;
+}
+
+/// What the program says of the decisions.
+std::string explanation_of(const golden_case_t &golden_case) {
+  edid_cli::composition_options_t options;
+  u8 address_offset = 0;
+  options.settings = settings_of(golden_case, &address_offset);
+  const std::vector<u8> sink = sink_of(golden_case);
+  const edid_cli::composition_t composition = edid_cli::compose(
+      options, golden_case.port, sink, [](const compose_log_line_t &) {}, edid_cli::decisions_t::kept);
+  std::string text;
+  test_support::output_of([&] {
+    const edid_cli::decoded_edid_t decoded(sink);
+    const edid_cli::platform_places_t places(golden_case.platform);
+    text = edid_cli::explanation_text({composition, sink, decoded.record(), golden_case.sink, places, options});
+  });
+  return text;
+}
+
 std::string hex_of(const golden_case_t &golden_case, const composition_t &composition) {
   return golden_case.heading() + format("# The physical address stands at byte %u.\n\n", composition.address_offset) +
-         annotated(composition.edid);
+         named_bytes(composition.edid);
 }
 
 }  // namespace
@@ -66,8 +108,7 @@ using composer_t = bool (*)(const std::vector<u8> &sink, std::vector<u8> *edid, 
 composition_t composed_by(composer_t composer, void *context, const golden_case_t &golden_case, bool tracing) {
   constexpr u32 edid_size = 256;
   load_platform(golden_case.platform);
-  const std::vector<u8> sink =
-      test_support::bytes_of_hex_file((sinks_directory() / (golden_case.sink + ".txt")).string());
+  const std::vector<u8> sink = sink_of(golden_case);
   composition_t composition;
   composition.edid.resize(edid_size);
   const compose_cfg_t settings = settings_of(golden_case, &composition.address_offset);
@@ -107,6 +148,7 @@ std::map<std::string, std::string> golden_texts(const golden_case_t &golden_case
   const composition_t composition = composed(golden_case, true);
   return {{golden_case.name() + ".hex", hex_of(golden_case, composition)},
           {golden_case.name() + ".brief.txt", report_of(golden_case, composition.edid, true)},
+          {golden_case.name() + ".explain.txt", explanation_of(golden_case)},
           {golden_case.name() + ".report.txt", report_of(golden_case, composition.edid, false)},
           {golden_case.name() + ".trace.txt", composition.log}};
 }

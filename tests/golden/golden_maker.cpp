@@ -17,7 +17,7 @@ namespace fs = std::filesystem;
 
 bool is_golden(const fs::path &file) {
   const std::string name = file.filename().string();
-  for (const char *ending : {".hex", ".brief.txt", ".report.txt", ".trace.txt"}) {
+  for (const char *ending : {".hex", ".brief.txt", ".explain.txt", ".report.txt", ".trace.txt"}) {
     if (name.ends_with(ending)) return true;
   }
   return false;

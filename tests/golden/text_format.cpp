@@ -17,19 +17,4 @@ std::string format(const char *pattern, ...) {
   return text.data();
 }
 
-std::string listed(const std::vector<std::string> &texts, const std::string &otherwise) {
-  std::string list;
-  for (const std::string &text : texts)
-    list += (list.empty() ? "" : ", ") + text;
-  return list.empty() ? otherwise : list;
-}
-
-std::vector<std::string> set_bits(unsigned value, const std::vector<bit_name_t> &names) {
-  std::vector<std::string> set;
-  for (const bit_name_t &bit : names) {
-    if ((value & bit.mask) != 0) set.emplace_back(bit.name);
-  }
-  return set;
-}
-
 }  // namespace golden

@@ -19,7 +19,7 @@ TREE = HERE.parent.parent
 SUITES = {
     "src": ("unit_tests_sanitized", "end_to_end_tests_sanitized", "limits_without_assertions_tests",
             "robustness_tests_sanitized"),
-    "host": ("config_store_tests", "explain_tests", "cli_tests"),
+    "host": ("config_store_tests", "explain_tests", "golden_tests", "cli_tests"),
 }
 
 
