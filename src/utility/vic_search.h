@@ -9,16 +9,16 @@ namespace edid_composer {
 template <const site_t &site>
 bool begin_search(const edid_t *edid, const void *timing, u32 *vic) {
   if (vic == nullptr) {
-    LOG_ERROR("\"vic\" parameter is NULL. vic:%p", address(vic));
+    LOG_ERROR("\"vic\" parameter is NULL. vic:%s", address(vic).text);
     return false;
   }
   *vic = 0;
   if (edid == nullptr) {
-    LOG_ERROR("\"edid\" parameter is NULL. edid:%p", address(edid));
+    LOG_ERROR("\"edid\" parameter is NULL. edid:%s", address(edid).text);
     return false;
   }
   if (timing == nullptr) {
-    LOG_ERROR("\"timing\" parameter is NULL. timing:%p", address(timing));
+    LOG_ERROR("\"timing\" parameter is NULL. timing:%s", address(timing).text);
     return false;
   }
   return true;

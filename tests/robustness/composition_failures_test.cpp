@@ -99,6 +99,10 @@ const std::map<std::string, outcome_t> &outcomes() {
   };
   const std::string of_composer = "edid_composer:N:";
   const std::string of_codec = "edid_decode_encode:N:";
+  const auto unprepared = [&](const std::string &record) {
+    return of_codec + "edid_destroy() ERROR: List is not initialized. List:standard_timing_list.\n" +
+           of_composing("ERROR: Failed cleaning up " + record + ".");
+  };
   const std::string standard_timing =
       error(of_codec + "_decode_edid_standard_timing") + of_codec +
       "decode_edid_block_#() ERROR: Failed decoding ## standard timing. Val#:# Val#:#\n";
@@ -118,7 +122,12 @@ const std::map<std::string, outcome_t> &outcomes() {
   const std::string new_extension_failed = of_composing("WARNING: Failed decoding the new edid extension.");
   static const std::map<std::string, outcome_t> table{
       {error(of_composer + "_read_platform_values") +
-           of_composing("ERROR: Failed trying to read the platform config file."),
+           of_composing("ERROR: Failed trying to read the platform config file.") + unprepared("edid") +
+           unprepared("new_edid") +
+           "linked_list:N:ll_verify_integrity() ERROR: Corrupt List: List not initialized. Ptr:PTR ExpectedMagic:# "
+           "Magic:# Size:# Head:(nil) \n"
+           "linked_list:N:ll_delete_list() BUG: Failed verifying integrity of the list. list:PTR\n" +
+           of_composing("ERROR: Failed cleaning up video list."),
        outcome_t::refused},
       {error(of_composer + "_get_vic_list_callback"), outcome_t::composed_from_less},
       {error(of_composer + "_get_vic_list_callback") + of_composer +
