@@ -56,11 +56,17 @@ log_redirection_t::~log_redirection_t() {
 }
 
 void log_redirection_t::add_text(const char *format, std::va_list arguments) {
-  const auto room = static_cast<u32>(sizeof text_) - length_;
+  const u32 room = longest_line + 1 - length_;
   const int wanted = std::vsnprintf(text_ + length_, room, format, arguments);
   if (wanted < 0) return;
-  const bool cut = static_cast<u32>(wanted) >= room;
-  length_ = cut ? static_cast<u32>(sizeof text_) - 1 : length_ + static_cast<u32>(wanted);
+  if (static_cast<u32>(wanted) < room) {
+    length_ += static_cast<u32>(wanted);
+  } else {
+    // The rest is cut, but for the newline that every line's last piece ends in.
+    length_ = longest_line;
+    if (format[std::strlen(format) - 1] == '\n') text_[length_++] = '\n';
+    text_[length_] = '\0';
+  }
 
   char *begin = text_;
   for (char *end = nullptr; (end = std::strchr(begin, '\n')) != nullptr; begin = end + 1) {
@@ -71,9 +77,10 @@ void log_redirection_t::add_text(const char *format, std::va_list arguments) {
   std::memmove(text_, begin, length_ + 1);
 }
 
-void log_redirection_t::add_line(compose_log_kind kind, const site_t &site, int line, const char *format, std::va_list arguments) {
+void log_redirection_t::add_line(compose_log_kind kind, const site_t &site, int line, const char *format,
+                                 std::va_list arguments) {
   flush();
-  std::vsnprintf(text_, sizeof text_, format, arguments);
+  std::vsnprintf(text_, longest_line + 1, format, arguments);
   deliver(kind, site, line, text_);
 }
 

@@ -35,8 +35,9 @@ class log_redirection_t {
   void *context_;
   log_redirection_t *outer_;
   u32 length_ = 0;  ///< Of the line that is being written in pieces.
-  /// The longest line of a composition, a trace with a node name of 255 bytes, has some 400 bytes.
-  char text_[1024];
+  /// That of a composition, a trace with a node name of 255 bytes, has some 400 bytes.
+  static constexpr u32 longest_line = 1023;
+  char text_[longest_line + 2];  ///< With its newline and a NUL.
 };
 
 }  // namespace edid_composer

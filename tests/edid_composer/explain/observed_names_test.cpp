@@ -1,4 +1,4 @@
-// The words for subjects, verdicts and reasons, to the letter: programs compare them.
+// The words for subjects, verdicts, reasons and statuses, to the letter: programs compare them.
 #include <gtest/gtest.h>
 
 #include <set>
@@ -124,5 +124,31 @@ static_assert(COMPOSE_REASON_SINK_HAS_IT == 1 && COMPOSE_REASON_NO_ROOM == 9 && 
               COMPOSE_REASON_ROOM_ENOUGH == 55 && COMPOSE_REASON_NOT_ANNOUNCED == 58);
 static_assert(COMPOSE_ORIGIN_DETAILED_TIMING == 0x1 && COMPOSE_ORIGIN_SINK_AUDIO == 0x10 &&
               COMPOSE_ORIGIN_PRIORITY_LIST == 0x20 && COMPOSE_ORIGIN_LIBRARY == 0x800);
+
+TEST(ResultNames, OfSinkStatuses) {
+  expect_names(compose_sink_status_string,
+               {{COMPOSE_SINK_NONE, "none given"},
+                {COMPOSE_SINK_READ, "read"},
+                {COMPOSE_SINK_LENGTH_INVALID, "not read: the length is no multiple of 128 bytes"},
+                {COMPOSE_SINK_HEADER_INVALID, "base block refused: header"},
+                {COMPOSE_SINK_CHECKSUM_INVALID, "base block refused: checksum"},
+                {COMPOSE_SINK_VERSION_UNSUPPORTED, "base block refused: version below 1.3"},
+                {COMPOSE_SINK_DESCRIPTOR_INVALID, "base block read up to a malformed descriptor"},
+                {COMPOSE_SINK_OUT_OF_MEMORY, "base block not read to its end: out of memory"}});
+}
+
+TEST(ResultNames, OfExtensionStatuses) {
+  expect_names(compose_extension_status_string,
+               {{COMPOSE_EXTENSION_NOT_LOOKED_AT, "not looked at"},
+                {COMPOSE_EXTENSION_NOT_ANNOUNCED, "none announced"},
+                {COMPOSE_EXTENSION_READ, "read"},
+                {COMPOSE_EXTENSION_MISSING, "announced but missing"},
+                {COMPOSE_EXTENSION_NOT_CEA, "refused: not a CEA-861 extension"},
+                {COMPOSE_EXTENSION_REVISION_UNSUPPORTED, "refused: revision other than 3"},
+                {COMPOSE_EXTENSION_CHECKSUM_INVALID, "refused: checksum"},
+                {COMPOSE_EXTENSION_OFFSET_UNSUPPORTED, "refused: detailed timings after byte 110"},
+                {COMPOSE_EXTENSION_MALFORMED, "read up to a data block that overruns its collection"},
+                {COMPOSE_EXTENSION_OUT_OF_MEMORY, "not read to its end: out of memory"}});
+}
 
 }  // namespace
