@@ -60,7 +60,8 @@ TEST_F(RecordBlocks, WithoutMemoryKeepWhatTheyHaveAndGoOnLater) {
   i32 kept = 0;
   EXPECT_EQ(output_of([&] {
               const failing_allocation_t failing(3);
-              while (records_.add(kept, reporter) != nullptr) ASSERT_LT(++kept, several_blocks);
+              while (records_.add(kept, reporter) != nullptr)
+                ASSERT_LT(++kept, several_blocks);
               EXPECT_TRUE(failing.happened());
             }),
             bug("ll_create_entry", "calloc failed to allocate memory for the entry. ptr:PTR") +

@@ -9,6 +9,8 @@
 
 #include "sample.h"
 #include "support/output_capture.h"
+#include "support/patterns.h"
+#include "support/request.h"
 
 namespace robustness {
 namespace {
@@ -16,6 +18,7 @@ namespace {
 using test_support::bytes_t;
 using test_support::compose;
 using test_support::composition_t;
+using test_support::request_t;
 
 constexpr std::size_t thread_count = 8;
 constexpr int compositions_of_each = 200;
@@ -66,6 +69,20 @@ int deviations(const job_t &job, const platform_values_t *values, const composit
   return count;
 }
 
+// Lets each thread do @p work, which is told its number.
+void run_on_threads(const std::function<void(std::size_t)> &work) {
+  std::vector<std::thread> threads;
+  for (std::size_t i = 0; i < thread_count; ++i)
+    threads.emplace_back([&, i] { work(i); });
+  for (std::thread &thread : threads)
+    thread.join();
+}
+
+// The stacks of two threads are not at the same place.
+std::string without_addresses(const std::string &lines) {
+  return test_support::replaced(lines, "0x[0-9a-f]{9,16}\\b", "PTR");
+}
+
 // Lets all threads compose at once, and another one do @p meanwhile over and over until they are through.
 void expect_the_same_of_all_threads(const platform_values_t *values, const std::function<void()> &meanwhile) {
   const std::vector<job_t> all = jobs();
@@ -81,11 +98,7 @@ void expect_the_same_of_all_threads(const platform_values_t *values, const std::
     while (running.load())
       meanwhile();
   });
-  std::vector<std::thread> threads;
-  for (std::size_t i = 0; i < thread_count; ++i)
-    threads.emplace_back([&, i] { deviating += deviations(all[i], values, expected[i]); });
-  for (std::thread &thread : threads)
-    thread.join();
+  run_on_threads([&](std::size_t i) { deviating += deviations(all[i], values, expected[i]); });
   running = false;
   other.join();
   EXPECT_EQ(deviating.load(), 0);
@@ -115,16 +128,35 @@ TEST_F(Threads, ReadingTheConfigurationGiveWhatOneThreadGives) {
   EXPECT_EQ(test_support::raw_output_of([&] { expect_the_same_of_all_threads(nullptr, keep_tracing_off); }), "");
 }
 
+TEST_F(Threads, ReceiveTheLinesOfTheirOwnCompositions) {
+  const std::vector<job_t> all = jobs();
+  debug_enable(true);
+  std::atomic<int> deviating{0};
+  const std::string output = test_support::raw_output_of([&] {
+    std::vector<std::string> expected;
+    for (const job_t &job : all) {
+      request_t request(job.sink, job.cfg, nullptr);
+      ASSERT_TRUE(request.compose_logged());
+      expected.push_back(without_addresses(request.lines));
+    }
+    run_on_threads([&](std::size_t i) {
+      request_t request(all[i].sink, all[i].cfg, nullptr);
+      for (int k = 0; k < 10; ++k) {
+        request.compose_logged();
+        if (without_addresses(request.lines) != expected[i]) ++deviating;
+      }
+    });
+  });
+  debug_enable(false);
+  EXPECT_EQ(deviating.load(), 0);
+  EXPECT_EQ(output, "");
+}
+
 TEST_F(Threads, DecodeAndPrintAtOnce) {
   const bytes_t sink = rich_sink().build();
   const std::string report = test_support::raw_output_of([&] { print_edid(sink.data(), 256, 1, "Sample"); });
-  const std::string all = test_support::raw_output_of([&] {
-    std::vector<std::thread> threads;
-    for (std::size_t i = 0; i < thread_count; ++i)
-      threads.emplace_back([&] { print_edid(sink.data(), 256, 1, "Sample"); });
-    for (std::thread &thread : threads)
-      thread.join();
-  });
+  const std::string all = test_support::raw_output_of(
+      [&] { run_on_threads([&](std::size_t) { print_edid(sink.data(), 256, 1, "Sample"); }); });
   // Lines of several threads may interleave, but none is lost.
   EXPECT_EQ(all.size(), thread_count * report.size());
 }
@@ -134,17 +166,12 @@ TEST_F(Threads, ComposeTheSameWhileTracingIsSwitchedOnAndOff) {
   const std::vector<composition_t> expected = composed_alone(values_.get());
   std::atomic<int> deviating{0};
   const std::string output = test_support::raw_output_of([&] {
-    std::vector<std::thread> threads;
-    for (std::size_t i = 0; i < thread_count; ++i) {
-      threads.emplace_back([&, i] {
-        for (int k = 0; k < 25; ++k) {
-          debug_enable(k % 2 == 0);
-          if (compose(all[i].sink, all[i].cfg, values_.get()).bytes != expected[i].bytes) ++deviating;
-        }
-      });
-    }
-    for (std::thread &thread : threads)
-      thread.join();
+    run_on_threads([&](std::size_t i) {
+      for (int k = 0; k < 25; ++k) {
+        debug_enable(k % 2 == 0);
+        if (compose(all[i].sink, all[i].cfg, values_.get()).bytes != expected[i].bytes) ++deviating;
+      }
+    });
     debug_enable(false);
   });
   EXPECT_EQ(deviating.load(), 0);

@@ -40,14 +40,19 @@ request_t::request_t(const bytes_t &sink_bytes, const compose_cfg_t &cfg, const 
   result.size = sizeof result;
 }
 
-bool request_t::compose_logged() {
-  lines.clear();
-  request.log_context = this;
-  request.log = [](const compose_log_line_t *line, void *context) {
-    static_cast<request_t *>(context)->lines += rendered(*line);
+bool request_t::compose_logged(const std::function<void(const compose_log_line_t &)> &also) {
+  struct context_t {
+    std::string lines;
+    const std::function<void(const compose_log_line_t &)> &also;
+  } context{"", also};
+  request.log_context = &context;
+  request.log = [](const compose_log_line_t *line, void *to) {
+    static_cast<context_t *>(to)->lines += rendered(*line);
+    if (static_cast<context_t *>(to)->also) static_cast<context_t *>(to)->also(*line);
   };
   const bool composed = compose();
   request.log = nullptr;
+  lines = context.lines;
   return composed;
 }
 

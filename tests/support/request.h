@@ -1,6 +1,7 @@
 // A composition as one request, and its lines as the callback receives them.
 #pragma once
 
+#include <functional>
 #include <string>
 
 #include "support/edid_builder.h"
@@ -14,8 +15,8 @@ struct request_t {
   request_t &operator=(const request_t &) = delete;
 
   bool compose() { return compose_edid_request(&request, &result); }
-  /// Composes with a callback; its lines are in @ref lines.
-  bool compose_logged();
+  /// Composes with a callback, which keeps each line in @ref lines and then calls @p also.
+  bool compose_logged(const std::function<void(const compose_log_line_t &)> &also = nullptr);
 
   bytes_t sink;
   compose_cfg_t settings;
