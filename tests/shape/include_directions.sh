@@ -1,12 +1,15 @@
 #!/bin/bash
-# Modules include downward only, the program's rooms likewise, no two files include each other, and internal headers stay inside the library and the
-# tests of its private functions: tests through the public operations and what tests share see the public header only.
+# Modules include downward only, the rooms of the composer and of the program likewise, no two files include each other,
+# and internal headers stay inside the library and the tests of its private functions: tests through the public
+# operations and what tests share see the public header only. A file of src/ has a header of its own, or holds public
+# operations.
 # Usage: include_directions.sh PROJECT
 . "$(dirname "$0")/reporting.sh"
 cd "$1" || fail "no such directory: $1"
 violations=""
 edges=""
 count=0
+arrows=0
 
 # How far up a file of src/ stands, by its path within src/.
 rank() {
@@ -21,8 +24,33 @@ rank() {
   esac
 }
 
+# The rooms that a room of the composer may include besides itself; compose, above them, all.
+allowed_rooms() {
+  case $1 in
+    inputs | platform) ;;
+    selection) echo inputs ;;
+    new_edid) echo inputs selection ;;
+    explain) echo inputs selection new_edid ;;
+    compose) echo inputs platform selection new_edid explain ;;
+    *) return 1 ;;
+  esac
+}
+
+# The room of a file of edid_composer/. What every room works from stands beside those that compose.
+composer_room() {
+  case $1 in
+    edid_composer/*/*) basename "$(dirname "$1")" ;;
+    edid_composer/inputs.* | edid_composer/journal.*) echo inputs ;;
+    *) echo compose ;;
+  esac
+}
+
 # Prints the quoted includes of a file.
 includes() { sed -nE 's/^[[:space:]]*#[[:space:]]*include[[:space:]]+"([^"]+)".*/\1/p' "$1"; }
+
+# Whether a file defines something that the library exports.
+operations=$(paste -sd'|' tests/shape/exported_symbols.txt)
+holds_operations() { grep -qE "^[a-z].*\\b($operations)(\\(|\\[)" "$1"; }
 
 complain() { violations+="$1"$'\n'; }
 
@@ -39,9 +67,22 @@ while read -r file; do
     fi
     edges+="$own $included"$'\n'
     [ "$(rank "$included")" -le "$own_rank" ] || complain "$file includes $included, which stands above it"
+    case "$own $included" in edid_composer/*' edid_composer/'*) ;; *) continue ;; esac
+    room=$(composer_room "$own")
+    included_room=$(composer_room "$included")
+    rooms=$(allowed_rooms "$room") || complain "$file is in no known room"
+    case " $room $rooms " in
+      *" $included_room "*) arrows=$((arrows + 1)) ;;
+      *) complain "$file includes $included, which is not for $room" ;;
+    esac
   done
+  case $file in
+    *.cpp) [ -f "${file%.cpp}.h" ] || holds_operations "$file" ||
+      complain "$file has neither a header of its own nor public operations" ;;
+  esac
 done < <(find src -name '*.h' -o -name '*.cpp' -o -name '*.cpp.in' | sort)
 [ "$count" -gt 0 ] || fail "no includes found in src/"
+[ "$arrows" -gt 0 ] || fail "no includes found in src/edid_composer/"
 
 # How far up a room of the program stands: in the order of the table in host/cli/CMakeLists.txt.
 room_rank() {
