@@ -1,11 +1,13 @@
 #!/bin/sh
 # Measures what compositions cost and writes the figures and plots of docs/performance.md. With --strict it fails when a
-# target is missed. Needs a Debian 12 machine, and root or sudo if one of the packages below is missing.
+# target is missed.
+# usage: scripts/bench.sh [--no-install] [--strict]
+# Needs a Debian 12 machine, and root or sudo if one of the packages below is missing.
 set -eu
 cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 
-echo 'Building and measuring; takes 3 minutes. Figures are steadier on a machine that does nothing else.'
+echo 'Building and measuring. Figures are steadier on a machine that does nothing else.'
 install_packages build-essential cmake ninja-build libbenchmark-dev libgtest-dev libgmock-dev libtomlplusplus-dev \
   libcli11-dev nlohmann-json3-dev libutfcpp-dev python3 valgrind
 

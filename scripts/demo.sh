@@ -1,11 +1,12 @@
 #!/bin/sh
 # Builds the command-line program, composes an EDID for a 4K television and shows its report.
+# usage: scripts/demo.sh [--no-install]
 # Needs a Debian 12 machine, and root or sudo if one of the packages below is missing.
 set -eu
 cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 
-echo 'Building edid-composer and composing an EDID for a 4K television; takes 1 to 5 minutes.'
+echo 'Building edid-composer and composing an EDID for a 4K television.'
 install_packages build-essential cmake ninja-build libtomlplusplus-dev libcli11-dev nlohmann-json3-dev libutfcpp-dev
 
 build() {

@@ -1,13 +1,14 @@
 #!/bin/sh
 # Composes every golden case anew and writes tests/end_to_end/golden. What changed is then to be reviewed like code:
 # git diff tests/end_to_end/golden
+# usage: scripts/update_goldens.sh [--no-install]
 # Needs a Debian 12 machine, and root or sudo if one of the packages below is missing.
 set -eu
 cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 
-echo 'Building the library and the golden maker, and making the goldens anew; takes 1 to 5 minutes.'
-install_packages build-essential cmake ninja-build libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev \
+echo 'Building the library and the golden maker, and making the goldens anew.'
+install_packages build-essential cmake ninja-build python3 libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev \
   nlohmann-json3-dev libutfcpp-dev
 
 build() {
