@@ -6,8 +6,10 @@
 #include "commands/exit_status.h"
 #include "io/program_name.h"
 #include "io/standard_output.h"
+#include "io/temporary_file.h"
 
 int main(int argument_count, char **arguments) {
+  edid_cli::remove_temporary_files_on_signals();
   try {
     const int status = edid_cli::run_command_line(argument_count, arguments);
     edid_cli::flush_standard_output();

@@ -14,14 +14,15 @@
 #define TOML_ASSERT(expression) static_assert(true)
 #include <toml++/toml.h>
 
+#include "document_limits.h"
+
 namespace edid_config_store {
 namespace {
 
 /// No lookup of the library is longer: it cuts paths there.
 constexpr std::size_t max_path_length = 255;
-/// The parser and the walk below recurse into the document, so its depth is bounded before it can exhaust the stack.
-constexpr int max_depth = 64;
-constexpr int max_dots_in_line = 128;
+/// No platform needs more, and the library reads each of them at every composition.
+constexpr std::size_t most_entries = 1000;
 
 /// A control character would break the error's line, or mean something to a terminal.
 std::string printable(std::string_view text) {
@@ -105,7 +106,9 @@ class copier_t {
       refuse(position, parent, name, "the path is longer than 255 characters");
     } else if (const auto *table = value.as_table(); table != nullptr) {
       copy_branch(*table, parent, name, position, depth);
-    } else if (const auto *array = value.as_array(); array != nullptr) {
+    } else if (const auto *array = value.as_array(); array != nullptr && array->size() > most_entries) {
+      refuse(position, parent, name, "a list of " + std::to_string(array->size()) + " entries, which has 1000 at most");
+    } else if (array != nullptr) {
       copy_branch(*array, parent, name, position, depth);
     } else if (const auto *integer = value.as_integer(); integer != nullptr) {
       copy_integer(integer->get(), parent, name, position, value.source().begin);
@@ -197,27 +200,11 @@ class copier_t {
   std::optional<refusal_t> refusal_;
 };
 
-/// A key of thousands of names needs no nesting in the document's text, but as much stack when the parser's tree is
-/// freed.
-std::optional<refusal_t> refuse_endless_keys(std::string_view document, std::string_view name) {
-  std::uint32_t line = 1;
-  int dots = 0;
-  for (const char character : document) {
-    if (character == '\n') {
-      ++line;
-      dots = 0;
-    } else if (character == '.' && ++dots > max_dots_in_line) {
-      return refusal_t{at_position(name, {line, 1}) + "more than 128 dots in one line"};
-    }
-  }
-  return std::nullopt;
-}
-
 }  // namespace
 
 std::variant<config_tree_t, refusal_t> read_toml(std::string_view document, std::string_view name) {
-  if (auto refusal = refuse_endless_keys(document, name)) {
-    return *std::move(refusal);
+  if (const auto problem = find_beyond_limits(document)) {
+    return refusal_t{at_position(name, {problem->position.line, problem->position.column}) + problem->text};
   }
   const toml::parse_result parsed = toml::parse(document, name);
   if (!parsed) {

@@ -33,15 +33,11 @@ class kept_lines_t {
     }
     if (is_diagnostic(line)) {
       diagnostics.push_back(std::string(kind_of(line)) + ": " + message_of(line));
-      if (first_error.empty() && line.kind != COMPOSE_LOG_WARNING) {
-        first_error = message_of(line);
-      }
     }
   }
 
   std::string text;
   std::vector<std::string> diagnostics;
-  std::string first_error;
 
  private:
   bool keeps_all_;
@@ -56,8 +52,10 @@ class batch_worker_t {
   batch_result_t work(std::size_t number) const {
     try {
       return compose_one(tasks_[number]);
+    } catch (const not_an_edid_t &problem) {
+      return {"", problem.what(), "", {}};
     } catch (const std::exception &problem) {
-      return {problem.what(), "", {}};
+      return {problem.what(), "", "", {}};
     }
   }
 
@@ -74,20 +72,18 @@ class batch_worker_t {
     }
     const bool is_traced = options_.composition.debug;
     kept_lines_t lines(is_traced || options_.log);
-    const composition_t composition =
-        compose(options_.composition, task.port, task.sink_file.empty() ? shared_sink_ : read_edid_file(task.sink_file),
-                [&lines](const compose_log_line_t &line) { lines.take(line); });
-    if (composition.is_composed) {
+    const composition_t composition = compose(
+        options_.composition, task.port, task.sink_file.empty() ? shared_sink_ : read_edid_file(task.sink_file),
+        [&lines](const compose_log_line_t &line) { lines.take(line); }, decisions_of(options_));
+    const std::string failure = failure_of(composition, options_);
+    if (failure.empty()) {
       write_file_atomically(task.output_file, formatted(composition.new_edid, options_.format), durability_t::later);
     }
     if (options_.log) {
       write_file_atomically(task.log_file, lines.text, durability_t::later);
     }
     batch_result_t result;
-    if (!composition.is_composed) {
-      result.failure = "the library refused to compose an EDID" +
-                       (lines.first_error.empty() ? std::string() : ": " + lines.first_error);
-    }
+    result.failure = failure;
     result.output = is_traced ? std::move(lines.text) : std::string();
     result.diagnostics = std::move(lines.diagnostics);
     return result;
@@ -132,6 +128,9 @@ bool compose_several(const compose_options_t &options) {
         tasks.size(), jobs_of(options), [&worker](std::size_t number) { return worker.work(number); }, take);
   }
   flush_file_system_of(tasks.front().output_file);
+  if (!summary.has_compositions()) {
+    throw bad_input_t(*options.composition.sink + ": holds no sinks");
+  }
   std::fputs(summary.text().c_str(), stdout);
   flush_standard_output();
   return !summary.has_failures();

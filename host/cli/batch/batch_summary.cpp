@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "text/printable_text.h"
 #include "text/text_table.h"
 
 namespace edid_cli {
@@ -18,7 +19,9 @@ std::string without_address(const std::string &diagnostic) {
 }  // namespace
 
 void batch_summary_t::add(const std::string &label, const batch_result_t &result) {
-  if (result.failure.empty()) {
+  if (!result.passed_over.empty()) {
+    passed_over_.push_back(result.passed_over);
+  } else if (result.failure.empty()) {
     ++composed_;
   } else {
     failures_.push_back({label, result.failure});
@@ -45,6 +48,12 @@ std::string batch_summary_t::text() const {
   counts.add({"composed", std::to_string(composed_)});
   counts.add({"failed", std::to_string(failures_.size())});
   std::string text = counts.text();
+  if (!passed_over_.empty()) {
+    text += "\n";
+    for (const std::string &file : passed_over_) {
+      text += "passed over: " + printable(file) + "\n";
+    }
+  }
   if (!failures_.empty()) {
     text_table_t table;
     table.add({"FAILED", "REASON"});

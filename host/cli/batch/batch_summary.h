@@ -14,6 +14,7 @@ class batch_summary_t {
  public:
   void add(const std::string &label, const batch_result_t &result);
   bool has_failures() const { return !failures_.empty(); }
+  bool has_compositions() const { return composed_ != 0 || has_failures(); }
   std::string text() const;
 
  private:
@@ -32,6 +33,7 @@ class batch_summary_t {
 
   std::size_t composed_ = 0;
   std::vector<failure_t> failures_;
+  std::vector<std::string> passed_over_;
   std::map<std::string, diagnostic_count_t> diagnostics_;  ///< By what they say.
   std::size_t uncounted_ = 0;
 };

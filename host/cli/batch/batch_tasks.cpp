@@ -5,6 +5,7 @@
 #include <map>
 #include <set>
 
+#include "edid_input/sink_folder.h"
 #include "io/bad_input.h"
 #include "io/input.h"
 
@@ -19,31 +20,6 @@ constexpr std::string_view port_field = "{port}";
 bool is_folder(const std::string &path) {
   std::error_code ignored;
   return fs::is_directory(path, ignored);
-}
-
-bool has_folder_of_sinks(const composition_options_t &options) {
-  return options.sink && *options.sink != standard_stream && is_folder(*options.sink);
-}
-
-/// The files of a folder, sorted; what is hidden or no file is passed over.
-std::vector<std::string> files_in(const std::string &folder) {
-  std::vector<std::string> names;
-  std::error_code error;
-  for (fs::directory_iterator entry(folder, error), end; !error && entry != end; entry.increment(error)) {
-    std::error_code ignored;
-    const std::string name = entry->path().filename().string();
-    if (!name.starts_with('.') && entry->is_regular_file(ignored)) {
-      names.push_back(name);
-    }
-  }
-  if (error) {
-    throw bad_input_t(folder + ": " + error.message());
-  }
-  if (names.empty()) {
-    throw bad_input_t(folder + ": holds no sinks");
-  }
-  std::sort(names.begin(), names.end());
-  return names;
 }
 
 /// What stands for each sink in file names: its name without the ending, unless another sink's is the same.
@@ -67,12 +43,15 @@ std::string name_of_only_sink(const composition_options_t &options) {
   return *options.sink == standard_stream ? "stdin" : fs::path(*options.sink).stem().string();
 }
 
-/// Beside a file, with another ending than that of EDIDs.
-std::string log_file_of(std::string file, std::string_view ending) {
+/// Beside a file, with another ending than that of EDIDs, and one more where another file has that name.
+std::string log_file_of(std::string file, std::string_view ending, const std::set<std::string> &taken) {
   if (file.ends_with(ending)) {
     file.resize(file.size() - ending.size());
   }
-  return file + ".log";
+  do {
+    file += ".log";
+  } while (taken.contains(file));
+  return file;
 }
 
 std::string replaced(std::string text, std::string_view field, const std::string &value) {
@@ -122,12 +101,12 @@ void refuse_folder_of_sinks(const std::string &pattern, const std::string &sinks
 }  // namespace
 
 bool asks_for_several(const composition_options_t &options) {
-  return options.ports.is_range || has_folder_of_sinks(options);
+  return options.ports.is_range || is_sink_folder(options.sink);
 }
 
 std::vector<task_t> plan_tasks(const compose_options_t &options) {
   const composition_options_t &composition = options.composition;
-  const bool several_sinks = has_folder_of_sinks(composition);
+  const bool several_sinks = is_sink_folder(composition.sink);
   const auto files = several_sinks ? files_in(*composition.sink) : std::vector<std::string>{""};
   const auto names = several_sinks ? short_names_of(files) : std::vector<std::string>{name_of_only_sink(composition)};
   const std::string pattern = pattern_of(options, several_sinks);
@@ -147,9 +126,14 @@ std::vector<task_t> plan_tasks(const compose_options_t &options) {
       const std::string file = replaced(replaced(pattern, port_field, std::to_string(port)), sink_field, names[sink]);
       if (taken.insert(file).second) {
         task.output_file = file;
-        task.log_file = log_file_of(file, file_ending(options.format));
       }
       tasks.push_back(std::move(task));
+    }
+  }
+  for (task_t &task : tasks) {
+    if (!task.output_file.empty()) {
+      task.log_file = log_file_of(task.output_file, file_ending(options.format), taken);
+      taken.insert(task.log_file);
     }
   }
   return tasks;

@@ -8,6 +8,7 @@
 #include "batch/batch_tasks.h"
 #include "commands/exit_status.h"
 #include "commands/option_values.h"
+#include "commands/platform_settings.h"
 #include "commands/shared_options.h"
 #include "composition/composition.h"
 #include "edid_input/edid_file.h"
@@ -17,6 +18,7 @@
 #include "io/program_name.h"
 #include "io/standard_output.h"
 #include "platform/platform_file.h"
+#include "text/printable_text.h"
 
 namespace edid_cli {
 namespace {
@@ -26,19 +28,21 @@ int compose_single(const compose_options_t &options) {
   // Nothing but the EDID may arrive where the EDID is awaited.
   std::FILE *const lines = options.output == standard_stream ? stderr : stdout;
   const composition_t composition =
-      compose(options.composition, options.composition.ports.first, sink, written_to(lines));
-  if (!composition.is_composed) {
+      compose(options.composition, options.composition.ports.first, sink, written_to(lines), decisions_of(options));
+  const std::string failure = failure_of(composition, options);
+  if (!failure.empty()) {
     flush_standard_output();
-    std::fprintf(stderr, "%s: the library refused to compose an EDID\n", program_name);
+    std::fprintf(stderr, "%s: %s\n", program_name, printable(failure).c_str());
     return refused_status;
   }
   write_output(options.output, formatted(composition.new_edid, options.format));
   return done_status;
 }
 
-int run(const compose_options_t &options) {
+int run(compose_options_t &options) {
   check_composition_options(options.composition);
   load_platform(options.composition.platform_file);
+  require_platform_settings(options.composition);
   if (asks_for_several(options.composition)) {
     return compose_several(options) ? done_status : refused_status;
   }
@@ -62,6 +66,8 @@ command_t compose_command() {
               "Write bytes, or hexadecimal text (default raw)"),
        option("--jobs", "N", target->jobs, parse_jobs,
               "Compose so many of several at once (default: as many as there are processors)"),
+       flag("--strict", target->strict,
+            "Fail, and write no EDID, where a sink is not read to its end or a source could not use the EDID"),
        flag("--log", target->log, "Of several: write what the library says into a .log file beside each")});
   return {"compose", "Compose an EDID, or one for each of several sinks or ports", std::move(options),
           [target] { return run(*target); }};

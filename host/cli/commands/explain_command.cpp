@@ -10,6 +10,7 @@
 #include "batch/batch_tasks.h"
 #include "commands/exit_status.h"
 #include "commands/option_values.h"
+#include "commands/platform_settings.h"
 #include "commands/shared_options.h"
 #include "edid_input/edid_file.h"
 #include "explain/answer.h"
@@ -84,11 +85,12 @@ void check(const explain_options_t &options) {
   }
 }
 
-int run(const explain_options_t &options) {
+int run(explain_options_t &options) {
   check_composition_options(options.composition);
   check(options);
   const std::vector<wanted_t> wanted = options.want ? parse_wanted(*options.want) : std::vector<wanted_t>{};
   load_platform(options.composition.platform_file);
+  require_platform_settings(options.composition);
   const std::vector<u8> sink = read_sink(options.composition.sink, options.composition.drm_directory);
   const sink_record_t record(sink);
   const platform_places_t places(platform_name(options.composition));

@@ -15,6 +15,7 @@ struct option_t {
   /// Takes a flag.
   std::function<void()> set{};
   bool is_required = false;
+  bool may_be_repeated = false;
   std::string environment{};  ///< The variable that holds the value where the option is not given.
 };
 
@@ -28,6 +29,11 @@ option_t option(std::string names, std::string value_name, target_t &target, par
 template <typename target_t>
 option_t flag(std::string name, target_t &target, std::string description) {
   return {std::move(name), "", std::move(description), {}, [&target] { target = true; }};
+}
+
+inline option_t repeated(option_t option) {
+  option.may_be_repeated = true;
+  return option;
 }
 
 inline option_t required(option_t option) {

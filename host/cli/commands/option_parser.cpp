@@ -3,6 +3,7 @@
 #include <CLI/App.hpp>
 #include <CLI/Config.hpp>
 #include <CLI/Formatter.hpp>
+#include <algorithm>
 #include <optional>
 
 #include "commands/examples.h"
@@ -11,22 +12,37 @@
 namespace edid_cli {
 namespace {
 
-void add_option(CLI::App &app, const option_t &option) {
+/// Whether a text is the name of one of a command's options, as "-o" or "--output".
+bool is_option_name(const command_t &command, const std::string &text) {
+  return std::any_of(command.options.begin(), command.options.end(), [&text](const option_t &option) {
+    return text.starts_with('-') && ("," + option.names + ",").find("," + text + ",") != std::string::npos;
+  });
+}
+
+void add_option(CLI::App &app, const command_t &command, const option_t &option) {
   if (!option.take) {
     app.add_flag_callback(option.names, option.set, option.description);
     return;
   }
   const std::string long_name = option.names.substr(option.names.rfind(',') + 1);
-  const CLI::callback_t take = [long_name, take_text = option.take](const CLI::results_t &texts) {
-    try {
-      take_text(texts.front());
-    } catch (const bad_input_t &problem) {
-      throw bad_input_t(long_name + ": " + problem.what());
+  const CLI::callback_t take = [&command, long_name, &option](const CLI::results_t &texts) {
+    for (const std::string &text : texts) {
+      if (is_option_name(command, text)) {
+        throw bad_input_t(long_name + ": " + option.value_name + " is missing before " + text);
+      }
+      try {
+        option.take(text);
+      } catch (const bad_input_t &problem) {
+        throw bad_input_t(long_name + ": " + problem.what());
+      }
     }
     return true;
   };
   CLI::Option *const added = app.add_option(option.names, take, option.description);
   added->type_name(option.value_name)->required(option.is_required)->envname(option.environment);
+  if (option.may_be_repeated) {
+    added->expected(1)->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+  }
 }
 
 /// The help or the version, when the user asks for one instead.
@@ -64,7 +80,7 @@ std::variant<help_t, const command_t *> parse_command_line(const program_t &prog
     CLI::App &added = *app.add_subcommand(command.name, command.description);
     added.footer(examples_of(command.name));
     for (const option_t &option : command.options) {
-      add_option(added, option);
+      add_option(added, command, option);
     }
   }
   if (auto help = parse(app, argument_count, arguments)) {

@@ -8,6 +8,26 @@
 #include "io/input.h"
 
 namespace edid_cli {
+namespace {
+
+/// An option that also notes that it was given.
+option_t noted(option_t option, std::set<std::string> &given) {
+  const std::string name = setting_name(option);
+  if (option.take) {
+    option.take = [take = option.take, name, &given](const std::string &text) {
+      take(text);
+      given.insert(name);
+    };
+  } else {
+    option.set = [set = option.set, name, &given] {
+      set();
+      given.insert(name);
+    };
+  }
+  return option;
+}
+
+}  // namespace
 
 option_t drm_directory_option(std::string &directory) {
   directory = default_drm_directory;
@@ -21,16 +41,9 @@ option_t edid_operand(const std::string &name, std::string &source) {
   return required(option(name, "", source, parse_file_name, "The EDID: a file, raw or as text, or a connector"));
 }
 
-std::vector<option_t> composition_options(composition_options_t &target) {
+std::vector<option_t> setting_options(composition_options_t &target) {
   compose_cfg_t &settings = target.settings;
-  settings.audio_mask = all_audio_formats;
-  settings.hdmi_3d_mode = follow_sink_3d_mode;
   return {
-      option("--platform", "FILE", target.platform_file, parse_file_name,
-             "Platform configuration (TOML); the default one otherwise"),
-      option("--sink", "FILE", target.sink, parse_file_name,
-             "EDID of the downstream sink: a file, raw or as text, or a connector; no sink otherwise"),
-      drm_directory_option(target.drm_directory),
       option("--port", "N", target.ports, parse_ports,
              "Input of the platform, counted from 0 (default 0), or several: 0..3"),
       option("--current-mode", "MODE", settings.hdmi_current_mode, parse_video_mode,
@@ -45,8 +58,26 @@ std::vector<option_t> composition_options(composition_options_t &target) {
          const latency_t latency = parse_latency(text);
          std::copy(latency.begin(), latency.end(), settings.edid_latency);
        }},
-      flag("--debug", target.debug, "Trace every decision"),
   };
+}
+
+std::string setting_name(const option_t &option) {
+  return option.names.substr(std::string_view("--").size());
+}
+
+std::vector<option_t> composition_options(composition_options_t &target) {
+  std::vector<option_t> options = {
+      option("--platform", "FILE", target.platform_file, parse_file_name,
+             "Platform configuration (TOML); the default one otherwise"),
+      option("--sink", "FILE", target.sink, parse_file_name,
+             "EDID of the downstream sink: a file, raw or as text, or a connector; no sink otherwise"),
+      drm_directory_option(target.drm_directory),
+  };
+  for (const option_t &setting : setting_options(target)) {
+    options.push_back(noted(setting, target.given));
+  }
+  options.push_back(flag("--debug", target.debug, "Trace every decision"));
+  return options;
 }
 
 void check_composition_options(const composition_options_t &options) {

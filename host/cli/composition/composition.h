@@ -4,6 +4,7 @@
 #include <array>
 #include <cstdio>
 #include <functional>
+#include <string>
 #include <vector>
 
 #include "composition/composition_options.h"
@@ -14,12 +15,27 @@ namespace edid_cli {
 inline constexpr std::size_t new_edid_size = 256;
 using new_edid_t = std::array<u8, new_edid_size>;
 
+/// What the library has read of a key of the configuration, or of an entry; see configuration_reading_t.
+struct kept_reading_t {
+  const configuration_key_t *key;
+  u32 reason;
+  i32 entry;
+  i32 place;
+  std::string node;
+  std::string text;
+  i32 found;
+  i32 used;
+};
+
 /// What came of a composition.
 struct composition_t {
-  bool is_composed = false;  ///< If not, the library has refused, and has said why.
+  bool is_composed = false;
+  std::string refusal;  ///< Why not: what the library has said of it; empty when it is composed.
   new_edid_t new_edid{};
   compose_result_t result{};
+  // Of an observed composition:
   std::vector<compose_decision_t> decisions;
+  std::vector<kept_reading_t> readings;
 };
 
 enum class decisions_t { dropped, kept };

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <optional>
+#include <set>
 #include <string>
 
 #include "edid_composer.h"
@@ -16,6 +17,14 @@ inline constexpr i32 always_3d_mode = 2;
 /// compose_cfg_t::audio_mask.
 inline constexpr u32 all_audio_formats = 0xFFFFFFFF;
 
+/// Every audio format, 3D as the sink has it, no latency.
+inline compose_cfg_t default_settings() {
+  compose_cfg_t settings{};
+  settings.audio_mask = all_audio_formats;
+  settings.hdmi_3d_mode = follow_sink_3d_mode;
+  return settings;
+}
+
 /// Inputs of the platform, from the first to the last.
 struct port_range_t {
   u32 first = 0;
@@ -29,7 +38,8 @@ struct composition_options_t {
   std::optional<std::string> sink;           ///< A file, a folder or a connector. None: no sink.
   std::string drm_directory;
   port_range_t ports;
-  compose_cfg_t settings{};  ///< Its port is set for each composition.
+  compose_cfg_t settings = default_settings();  ///< The port is set for each composition.
+  std::set<std::string> given;  ///< Names of the settings that the command line has, such as "audio-mask".
   bool debug = false;
 };
 

@@ -42,10 +42,14 @@ std::vector<u8> parse_edid(const std::string &content, const std::string &name) 
 std::vector<u8> read_edid_file(const std::string &file) {
   const std::string content = read_input(file);
   const std::string name = input_name(file);
-  if (content.empty()) {
-    throw bad_input_t(name + ": is empty");
+  try {
+    if (content.empty()) {
+      throw bad_input_t(name + ": is empty");
+    }
+    return parse_edid(content, name);
+  } catch (const bad_input_t &problem) {
+    throw not_an_edid_t(problem.what());
   }
-  return parse_edid(content, name);
 }
 
 std::vector<u8> read_edid(const std::string &source, const std::string &drm_directory) {

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "edid_composer.h"
+#include "io/bad_input.h"
 
 namespace edid_cli {
 
@@ -13,7 +14,14 @@ inline constexpr u32 edid_block_size = 128;
 /// The base block counts the blocks that follow it in one byte.
 inline constexpr std::size_t max_edid_size = 256 * edid_block_size;
 
-/// The bytes of an EDID: one or more whole blocks. Their content is not looked at. Throws bad_input_t.
+/// A file that could be read, but holds no EDID in any form.
+class not_an_edid_t : public bad_input_t {
+ public:
+  using bad_input_t::bad_input_t;
+};
+
+/// The bytes of an EDID: one or more whole blocks. Their content is not looked at. Throws bad_input_t,
+/// or not_an_edid_t.
 std::vector<u8> read_edid_file(const std::string &file);
 
 /// The same from a file, from standard input, or, where there is no file of that name, from the connector of that name.

@@ -59,7 +59,7 @@ std::string explanation_page(const explained_t &explained) {
   // What the library prints here it has printed before, or the page says it in other words.
   const discarded_output_t unseen;
   const decoded_edid_t new_edid(std::vector<u8>(bytes.begin(), bytes.end()));
-  const platform_check_t check = check_platform();
+  const platform_check_t check = check_platform(explained.options.settings, {});
   const std::array parts{
       part_t{"title", html_text(title_of(explained))},
       part_t{"summary", summary_html(rows)},

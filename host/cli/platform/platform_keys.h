@@ -1,48 +1,38 @@
-// The keys that the library reads of a platform configuration.
+// The keys that the library reads of a platform configuration, in words. The table itself is the library's.
 #pragma once
 
-#include <cstdint>
-#include <span>
 #include <string>
 #include <vector>
+
+#include "edid_composer.h"
 
 namespace edid_cli {
 
 /// The table of the configuration that holds them.
 inline constexpr const char *platform_domain = "platform.software.drivers.vorex.edid";
+/// The table of the audio formats in it, and how the keys of these begin.
+inline constexpr const char *audio_table = "audio";
+inline constexpr const char *audio_entry_prefix = "entry_";
 
-enum class key_kind_t { signed_number, unsigned_number, text, text_list, number_list };
-
-/// Numbers inside the limits that count as another one all the same; none while @ref last is 0.
-struct number_gap_t {
-  std::int64_t first = 0;
-  std::int64_t last = 0;
-  std::int64_t counts_as = 0;
-};
-
-struct platform_key_t {
-  const char *name;
-  key_kind_t kind;
-  std::int64_t min;  ///< Of a number or a list's numbers. Of a text: with fewer characters, what is @ref short_effect.
-  std::int64_t max;  ///< Of a text or a list's texts: characters.
-  std::int64_t default_number = 0;
-  const char *default_text = "";
-  number_gap_t gap{};
-  std::size_t most_entries = 0;        ///< Of a list: more have no effect. 0: no such limit.
-  bool may_be_empty = true;            ///< Of a list.
-  const char *short_effect = nullptr;  ///< Of a text.
-};
-
-std::span<const platform_key_t> platform_keys();
+/// In the order in which they are read.
+std::vector<const configuration_key_t *> platform_keys();
 
 /// Where a key stands in the whole configuration.
 std::string platform_path(const std::string &key);
 
-/// The audio formats: "audio.entry_a" to "audio.entry_z", numbers of 24 bits that may all be absent.
+/// "audio.entry_a" to "audio.entry_z".
 std::vector<std::string> audio_entry_keys();
-inline constexpr const char *audio_table = "audio";
-inline constexpr const char *audio_entry_prefix = "entry_";
-inline constexpr std::uint32_t largest_audio_entry = 0xFFFFFF;
-inline constexpr std::size_t most_audio_entries = 10;
+
+bool is_list(const configuration_key_t &key);
+bool is_number(const configuration_key_t &key);
+
+/// "week", "audio.entry_a to audio.entry_z".
+std::string name_text(const configuration_key_t &key);
+/// "integer", "list of texts".
+std::string type_text(const configuration_key_t &key);
+/// "0 to 255", "1 to 4 each, 7 entries", "13 characters".
+std::string limits_text(const configuration_key_t &key);
+/// "1", "\"YYY\"", "empty", "absent".
+std::string default_text(const configuration_key_t &key);
 
 }  // namespace edid_cli

@@ -1,6 +1,6 @@
 #include "platform/platform_places.h"
 
-#include "platform/list_reading.h"
+#include "platform/configuration_readings.h"
 #include "platform/platform_keys.h"
 
 namespace edid_cli {
@@ -9,29 +9,6 @@ namespace {
 std::string text_of(const configuration_node_t &node) {
   const auto number = node.integer();
   return number ? std::to_string(*number) : node.text().value_or("");
-}
-
-std::vector<list_entry_t> entries_that_count(const std::string &key, const std::vector<entry_messages_t> &messages) {
-  std::vector<list_entry_t> entries;
-  const auto list = configuration_node_t::find(platform_path(key));
-  const auto nodes = list && list->is_branch() ? list->children() : std::vector<configuration_node_t>{};
-  for (std::size_t index = 0; index < nodes.size(); ++index) {
-    if (index >= messages.size() || !is_skipped(messages[index])) {
-      entries.push_back({key + "[" + std::to_string(index) + "]", text_of(nodes[index]), nodes[index].position()});
-    }
-  }
-  return entries;
-}
-
-std::vector<list_entry_t> audio_entries() {
-  std::vector<list_entry_t> entries;
-  for (const std::string &key : audio_entry_keys()) {
-    const auto node = configuration_node_t::find(platform_path(key));
-    if (node && node->integer()) {
-      entries.push_back({key, text_of(*node), node->position()});
-    }
-  }
-  return entries;
 }
 
 }  // namespace
@@ -45,10 +22,14 @@ std::string platform_list::addition(u32 family) {
 }
 
 platform_places_t::platform_places_t(std::string name) : name_(std::move(name)) {
-  for (const auto &[key, messages] : read_lists().lists) {
-    lists_[key] = entries_that_count(key, messages);
+  for (const kept_reading_t &reading : compose_without_sink(default_settings()).readings) {
+    const auto node = reading.place < 0 ? std::nullopt : node_of(reading);
+    if (node) {
+      const bool is_audio = reading.key->kind == CONFIGURATION_AUDIO_FORMATS;
+      lists_[is_audio ? platform_list::audio : reading.key->name].push_back(
+          {name_of(reading), text_of(*node), node->position()});
+    }
   }
-  lists_[platform_list::audio] = audio_entries();
 }
 
 const std::vector<list_entry_t> &platform_places_t::entries(const std::string &list) const {

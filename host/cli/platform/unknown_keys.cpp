@@ -13,8 +13,10 @@ namespace {
 /// Every key that is read, relative to the library's table.
 std::vector<std::string> known_keys() {
   std::vector<std::string> keys;
-  for (const platform_key_t &key : platform_keys()) {
-    keys.emplace_back(key.name);
+  for (const configuration_key_t *key : platform_keys()) {
+    if (key->kind != CONFIGURATION_AUDIO_FORMATS) {
+      keys.emplace_back(key->name);
+    }
   }
   const std::vector<std::string> entries = audio_entry_keys();
   keys.insert(keys.end(), entries.begin(), entries.end());
@@ -50,7 +52,7 @@ std::vector<std::string> tables_around() {
 
 class search_t {
  public:
-  std::vector<finding_t> run() && {
+  findings_t run() && {
     search_table(*configuration_node_t::find(platform_domain), "");
     for (const std::string &table : tables_around()) {
       search_around(*configuration_node_t::find(table));
@@ -69,7 +71,7 @@ class search_t {
       } else if (!is_known(key)) {
         const auto suggestion = key == audio_table ? std::nullopt : suggestion_for(key, known_and_tables());
         findings_.push_back(
-            {child.position(), key,
+            {severity_t::warning, child.position(), key,
              "nobody reads this key" + (suggestion ? ": did you mean " + *suggestion + "?" : std::string())});
       }
     }
@@ -81,7 +83,7 @@ class search_t {
       const bool is_one =
           std::any_of(known_.begin(), known_.end(), [&name](const std::string &key) { return last_name(key) == name; });
       if (is_one) {
-        findings_.push_back({child.position(), name,
+        findings_.push_back({severity_t::warning, child.position(), name,
                              "nobody reads this key here: it belongs into the table " + std::string(platform_domain)});
       }
     }
@@ -94,20 +96,23 @@ class search_t {
   }
 
   const std::vector<std::string> known_ = known_keys();
-  std::vector<finding_t> findings_;
+  findings_t findings_;
 };
 
 }  // namespace
 
-std::vector<finding_t> find_unknown_keys() {
+findings_t find_unknown_keys() {
   return search_t().run();
 }
 
-std::vector<finding_t> find_missing_table() {
+findings_t find_missing_table() {
   if (configuration_node_t::find(platform_domain)) {
     return {};
   }
-  finding_t finding{{}, "", std::string("the table ") + platform_domain + " is missing: every value is the default"};
+  finding_t finding{severity_t::error,
+                    {},
+                    "",
+                    std::string("the table ") + platform_domain + " is missing: every value is the default"};
   std::vector<std::string> tables = tables_around();
   tables.emplace_back(platform_domain);
   // The first of the domain's names that is not there is the one that may be misspelt.

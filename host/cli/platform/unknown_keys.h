@@ -1,17 +1,15 @@
 // Keys of the platform configuration that nobody reads.
 #pragma once
 
-#include <vector>
-
-#include "platform/platform_check.h"
+#include "platform/finding.h"
 
 namespace edid_cli {
 
 /// Those in the library's table, with the key that may be meant, and those that stand in a table around it and have the
 /// name of one that belongs inside.
-std::vector<finding_t> find_unknown_keys();
+findings_t find_unknown_keys();
 
 /// When the library's table is not there at all: that, with the name that may be meant by another one.
-std::vector<finding_t> find_missing_table();
+findings_t find_missing_table();
 
 }  // namespace edid_cli

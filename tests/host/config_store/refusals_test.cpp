@@ -1,5 +1,9 @@
 // What is refused, with which error, and that nothing of it arrives.
+#include <pthread.h>
 #include "config_store/store_fixture.h"
+
+#include <functional>
+
 #include "support/temporary_directory.h"
 
 namespace host_test {
@@ -69,15 +73,78 @@ INSTANTIATE_TEST_SUITE_P(
         refusal_case_t{"PathTooLong", repeated("a", 256) + " = 1\n",
                        "test.toml:1:1: " + repeated("a", 256) + ": the path is longer than 255 characters"},
         refusal_case_t{"NestedTooDeep", nested_tables(65),
-                       "test.toml:1:130: t" + repeated(".t", 64) + ": tables and arrays are nested more than 64 deep"},
+                       "test.toml:1:129: tables and arrays are nested more than 64 deep"},
         refusal_case_t{"WithoutEnd", "\na" + repeated(".a", 100000) + " = 1\n",
-                       "test.toml:2:1: more than 128 dots in one line"}),
+                       "test.toml:2:130: tables and arrays are nested more than 64 deep"},
+        refusal_case_t{"ListTooLong", "[x]\nlist = [" + repeated("1,", 1001) + "]\n",
+                       "test.toml:2:1: x.list: a list of 1001 entries, which has 1000 at most"}),
     [](const auto &tested) { return tested.param.name; });
 
 TEST_F(ConfigStore, TheDeepestNestingAndTheLongestPathAreAccepted) {
   EXPECT_TRUE(load(nested_tables(64))) << config_store_error();
   EXPECT_TRUE(load(repeated("a", 255) + " = 1\n")) << config_store_error();
   EXPECT_EQ(integer_at(repeated("a", 255)), 1);
+}
+
+TEST_F(ConfigStore, TheLongestListIsAccepted) {
+  EXPECT_TRUE(load("list = [" + repeated("1,", 1000) + "]\n")) << config_store_error();
+}
+
+/// Runs an action on a stack of a mebibyte, as threads of small systems have it.
+void with_small_stack(const std::function<void()> &action) {
+  pthread_attr_t attributes;
+  ASSERT_EQ(pthread_attr_init(&attributes), 0);
+  ASSERT_EQ(pthread_attr_setstacksize(&attributes, 1024UL * 1024UL), 0);
+  pthread_t thread{};
+  const auto run = [](void *passed) -> void * {
+    (*static_cast<const std::function<void()> *>(passed))();
+    return nullptr;
+  };
+  ASSERT_EQ(pthread_create(&thread, &attributes, run, const_cast<std::function<void()> *>(&action)), 0);
+  ASSERT_EQ(pthread_join(thread, nullptr), 0);
+  pthread_attr_destroy(&attributes);
+}
+
+TEST_F(ConfigStore, NestingDoesNotExhaustASmallStack) {
+  const std::string dots = repeated(".a", 40);
+  const std::vector<std::string> documents = {
+      "a = " + repeated("[", 300000),
+      "a = " + repeated("[", 60) + repeated("]", 60) + "\n",
+      "a = " + repeated("{a=", 200000),
+      repeated("[a" + dots + "]\na" + dots + " = 1\n", 10),
+      "a = " + repeated("[\n{ a" + dots + " = ", 5000),
+      "a = [" + repeated("[[\"[\", '[', # [\n", 100000),
+      repeated("[", 300000),
+      "a" + repeated("\n.a", 200000),
+  };
+  for (const std::string &document : documents) {
+    with_small_stack([&] { load(document); });
+  }
+  EXPECT_EQ(refusal_of("x = 1\n[t" + repeated(".t", 30) + "]\na" + repeated(".a", 40) + " = 1\n"),
+            "test.toml:3:68: tables and arrays are nested more than 64 deep");
+}
+
+TEST_F(ConfigStore, CharactersOutsideOfAsciiBelongIntoStringsAndComments) {
+  const std::string beyond = "a character that is not ASCII stands outside of strings and comments";
+  EXPECT_EQ(refusal_of("a = 1\nb = \xEF\xBB\x9A\n"), "test.toml:2:5: " + beyond);
+  EXPECT_EQ(refusal_of("\xC3\xA4 = 1\n"), "test.toml:1:1: " + beyond);
+  EXPECT_EQ(refusal_of("a = '\xC3\xA4' \xC3\xA4\n"), "test.toml:1:9: " + beyond);
+  EXPECT_EQ(refusal_of("a = \"\"\"x\n\"\"\"\"\"\xC3\xA4\n"), "test.toml:2:6: " + beyond);
+  EXPECT_TRUE(load("\xEF\xBB\xBF# \xC3\xA4\na = \"\xC3\xA4\\\"\xC3\xA4\"\nb = '''\n\xEF\xBB\x9A'''\n'\xC3\xA4' = 1\n"))
+      << config_store_error();
+  EXPECT_EQ(text_at("a"), "\xC3\xA4\"\xC3\xA4");
+}
+
+/// The parser looks some of these up beyond the end of its table.
+TEST_F(ConfigStore, EachCharacterThatTheParserHasNoPlaceForIsRefusedOutsideOfStrings) {
+  for (unsigned code = 0xFED0; code <= 0xFEFE; ++code) {
+    const std::string character = {static_cast<char>(0xE0 | code >> 12), static_cast<char>(0x80 | (code >> 6 & 0x3F)),
+                                   static_cast<char>(0x80 | (code & 0x3F))};
+    for (const std::string &document : {character, "a = " + character, "a = [" + character, "[" + character + "]"}) {
+      EXPECT_NE(refusal_of(document).find("that is not ASCII"), std::string::npos) << code;
+    }
+    EXPECT_TRUE(load("a = \"" + character + "\" # " + character + "\n")) << config_store_error();
+  }
 }
 
 struct malformed_case_t {
