@@ -111,34 +111,6 @@ TEST(ConfigurationLog, EmptyConfigurationIsTracedKeyByKeyToo) {
   EXPECT_TRUE(platform_values_destroy(&values));
 }
 
-TEST(ConfigurationLog, EmptyConfigurationYieldsTheDefaults) {
-  const configuration_tree_t tree;
-  platform_values_t values;
-  ASSERT_TRUE(platform_values_init(&values));
-  test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values, nullptr)); });
-
-  test_support::scoped_values_t defaults;
-  EXPECT_EQ(values.native_refresh_rate, 60);
-  EXPECT_EQ(values.week, 1U);
-  EXPECT_EQ(values.year, 2012U);
-  EXPECT_EQ(values.speaker_entry, 1);
-  EXPECT_EQ(values.native_bit, 1);
-  EXPECT_STREQ(values.manufacturer_id, "YYY");
-  // Everything else is 0: with those six reset, no byte but the list heads is set.
-  values.native_refresh_rate = values.speaker_entry = values.native_bit = 0;
-  values.week = values.year = 0;
-  std::memset(values.manufacturer_id, 0, sizeof values.manufacturer_id);
-  for (const ll_list_t *list : {&values.audio_list, &values.video_50_priority, &values.video_50_additional,
-                                &values.video_60_priority, &values.video_60_additional, &values.std_timings}) {
-    EXPECT_EQ(ll_size(list), 0);
-  }
-  ASSERT_TRUE(platform_values_destroy(&values));
-  platform_values_t fresh;
-  ASSERT_TRUE(platform_values_init(&fresh));
-  ASSERT_TRUE(platform_values_destroy(&fresh));
-  EXPECT_EQ(std::memcmp(&values, &fresh, sizeof values), 0);
-}
-
 TEST(ConfigurationLog, EveryPathIsAskedForOnceAndFromTheRoot) {
   const configuration_tree_t tree;
   platform_values_t values;
