@@ -36,11 +36,13 @@ _edid_composer_options() {
       printf '%s\n' --platform --sink --drm-dir --port --current-mode --audio-mask --audio-sink-filter --3d --latency \
         --debug
       ;;&
-    compose) printf '%s\n' --output -o --format --jobs --log ;;
+    compose) printf '%s\n' --output -o --format --jobs --strict --log ;;
     explain) printf '%s\n' --want --json --html ;;
     print) printf '%s\n' --brief --drm-dir ;;
     diff) printf '%s\n' --only-changes --drm-dir ;;
     sinks) printf '%s\n' --drm-dir ;;
+    check-platform) printf '%s\n' --sink --drm-dir --strict ;;
+    platform) printf '%s\n' --keys ;;
     '') printf '%s\n' --version ;;
   esac
   printf '%s\n' --help -h

@@ -10,7 +10,9 @@
  * - integers and strings are values, and booleans read as 0 and 1. Integers range from -2147483648 to 4294967295; those
  * above 2147483647 keep their bit pattern, so that the unsigned reader gets back what was written;
  * - anything else (floats, dates and times), as well as a key that no path can name (empty, or with a dot or a control
- *   character), a path of more than 255 characters, a NUL in a string, and a document of more than 1 MiB, is refused.
+ *   character), a path of more than 255 characters, a NUL in a string, a character that is not ASCII outside of strings
+ *   and comments, nesting deeper than 64, an array of more than 1000 elements, and a document of more than 1 MiB, is
+ *   refused.
  *
  * A process has one tree, which is empty until a first load succeeds. A load that fails leaves the tree as it was.
  *

@@ -3,7 +3,8 @@
 
 The tables of platform-configuration.md and the list of edid-platform.toml(5) name every key that the library reads and
 no other; limits and defaults are compared with those that it names itself when values are missing, too small and too
-large.
+large. So is the library's own table, as "edid-composer platform --keys" prints it, and the comments of the default
+platform are compared with that.
 """
 
 import argparse
@@ -57,6 +58,40 @@ def of_library(scratch):
     return keys
 
 
+def of_table(text):
+    """The same from the library's own table."""
+    keys = {}
+    for line in text.splitlines()[1:]:
+        name, kind, limits, default = re.split(r"  +", line)[:4]
+        number = RANGE.fullmatch(limits)
+        is_number = kind == "integer" and number is not None
+        keys[name.split(" to ")[0]] = (number[1], number[2], default) if is_number else None
+    return keys
+
+
+def limits_in_words(low, high):
+    """How the default platform's comments may tell limits."""
+    values = [str(value) for value in range(int(low), int(high) + 1)] if int(high) - int(low) <= 2 else []
+    upper = rf"(?:{high}|0x{int(high):X})"
+    listed = [", ".join(values[:-1]) + " or " + values[-1]] if len(values) > 1 else []
+    return "|".join([*map(re.escape, listed), rf"\b{low} to {upper}\b", rf"\b{low} or {high}\b"])
+
+
+def comment_problems(text, library):
+    """What the default platform's comments don't tell of the keys below them."""
+    for block in re.split(r"\n\n", text):
+        comment = " ".join(line.lstrip("# ") for line in block.splitlines() if line.startswith("#"))
+        for name in re.findall(r"^(\w+) = ", block, re.MULTILINE):
+            key = name if name in library else f"audio.{name}"
+            if not library.get(key):
+                continue
+            low, high, default = library[key]
+            if not re.search(limits_in_words(low, high), comment):
+                yield f"platform.toml: the comment of {name} doesn't tell its limits, {low} to {high}: {comment}"
+            if not re.search(rf"[Dd]efault {default}\b", comment):
+                yield f"platform.toml: the comment of {name} doesn't tell its default, {default}: {comment}"
+
+
 def problems(documented, library, name):
     audio_entries = {key for key in documented if platform_keys.AUDIO_ENTRY.fullmatch(f"{platform_keys.DOMAIN}.{key}")}
     if not audio_entries:
@@ -83,7 +118,10 @@ def main():
     }
     with scratch_folder.Scratch(arguments.source, arguments.prefix, arguments.libdir) as scratch:
         library = of_library(scratch)
-    found = []
+        table = of_table(scratch.run(["edid-composer", "platform", "--keys"], b"")[1])
+    found = list(problems(table, library, "edid-composer platform --keys"))
+    platform = arguments.source / "host/config_store/platform.toml"
+    found += comment_problems(platform.read_text(), library)
     for name, reader in documents.items():
         found += problems(reader((arguments.source / name).read_text()), library, name)
     for problem in found:

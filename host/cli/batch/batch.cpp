@@ -53,9 +53,9 @@ class batch_worker_t {
     try {
       return compose_one(tasks_[number]);
     } catch (const not_an_edid_t &problem) {
-      return {"", problem.what(), "", {}};
+      return {"", "", {}, problem.what()};
     } catch (const std::exception &problem) {
-      return {problem.what(), "", "", {}};
+      return {problem.what(), "", {}};
     }
   }
 

@@ -12,6 +12,8 @@
 namespace edid_cli {
 namespace {
 
+constexpr std::string_view edid_header("\0\xFF\xFF\xFF\xFF\xFF\xFF\0", 8);
+
 bool is_text_character(char character) {
   const auto byte = static_cast<unsigned char>(character);
   return byte >= 0x20 ? byte != 0x7F : (byte >= '\t' && byte <= '\r');
@@ -48,6 +50,10 @@ std::vector<u8> read_edid_file(const std::string &file) {
     }
     return parse_edid(content, name);
   } catch (const bad_input_t &problem) {
+    // What begins as one is a damaged EDID.
+    if (content.starts_with(edid_header)) {
+      throw;
+    }
     throw not_an_edid_t(problem.what());
   }
 }

@@ -54,6 +54,13 @@ TEST_F(AtomicOutput, AReplacedFileKeepsItsPermissions) {
   EXPECT_EQ(mode_of(path), 0604U);
 }
 
+TEST_F(AtomicOutput, ALinkToNothingIsRefused) {
+  std::filesystem::create_symlink("nowhere.bin", directory_.path("new.bin"));
+  expect_bad_input(run_cli({"compose", "-o", directory_.path("new.bin")}),
+                   directory_.path("new.bin") + ": cannot write: is a link to nowhere.bin, which is not there");
+  EXPECT_TRUE(std::filesystem::is_symlink(directory_.path("new.bin")));
+}
+
 TEST_F(AtomicOutput, ALinkStaysALink) {
   const std::string target = directory_.write("target.bin", "old");
   std::filesystem::create_symlink("target.bin", directory_.path("composed.bin"));

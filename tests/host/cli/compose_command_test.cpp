@@ -108,8 +108,60 @@ class RefusedComposition : public cli_fixture_t {
 TEST_F(RefusedComposition, EndsWithStatusOneAndSaysSo) {
   const process_result_t result = run_cli({"compose", "--platform", platform_, "-o", directory_.path("new.bin")});
   EXPECT_EQ(result.status, 1);
-  EXPECT_EQ(result.error, "edid-composer: the library refused to compose an EDID\n");
+  EXPECT_EQ(result.error,
+            "edid-composer: the library refused to compose an EDID: Failed encoding short audio. Index:1 Type:0\n");
   EXPECT_THAT(result.output, HasSubstr("() ERROR: Failed encoding the new edid.\n"));
+}
+
+TEST_F(RefusedComposition, StrictRefusesAnEdidThatNoSourceCanUse) {
+  const std::string nameless = directory_.write("nameless.toml", "[platform.software.drivers.vorex.edid]\n");
+  const std::string output = directory_.path("new.bin");
+  EXPECT_EQ(run_cli({"compose", "--platform", nameless, "-o", output}).status, 0);
+  std::filesystem::remove(output);
+  const process_result_t result = run_cli({"compose", "--platform", nameless, "-o", output, "--strict"});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_THAT(result.error, HasSubstr("edid-composer: --strict: without a name of 2 characters or more"));
+  EXPECT_FALSE(std::filesystem::exists(output));
+}
+
+TEST_F(RefusedComposition, StrictRefusesASinkThatIsNotRead) {
+  std::string damaged = sample_bytes("tv_4k");
+  damaged[127] = static_cast<char>(damaged[127] + 1);
+  const std::string sink = directory_.write("sink.bin", damaged);
+  const process_result_t result = run_cli({"compose", "--sink", sink, "-o", directory_.path("new.bin"), "--strict"});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_EQ(result.error, "edid-composer: --strict: the sink is not read to its end: base block refused: checksum\n");
+  EXPECT_EQ(run_cli({"compose", "--sink", sample_sink("tv_4k"), "-o", directory_.path("new.bin"), "--strict"}).status,
+            0);
+}
+
+class PlatformSettings : public cli_fixture_t {
+ protected:
+  std::string platform_with(const std::string &settings) {
+    return directory_.write("box.toml", content_of(DEFAULT_PLATFORM_FILE) + "\n[edid-composer]\n" + settings);
+  }
+};
+
+TEST_F(PlatformSettings, StandInForOptions) {
+  const std::string sink = sample_sink("tv_1080p_3d");
+  const std::vector<std::string> options = {"--sink", sink,        "--3d",        "off",          "--port",
+                                            "2",      "--latency", "40,20,60,20", "--audio-mask", "0x80000001"};
+  EXPECT_EQ(composed({"--sink", sink, "--platform",
+                      platform_with("3d = \"off\"\nport = 2\nlatency = [40, 20, 60, 20]\naudio-mask = 0x80000001\n")}),
+            composed(options));
+}
+
+TEST_F(PlatformSettings, GiveWayToTheCommandLine) {
+  const std::string sink = sample_sink("tv_1080p_3d");
+  EXPECT_EQ(composed({"--sink", sink, "--platform", platform_with("port = 2\n"), "--port", "0"}),
+            composed({"--sink", sink}));
+}
+
+TEST_F(PlatformSettings, ThatAreWrongAreBadInput) {
+  const std::string platform = platform_with("prot = 2\n");
+  const process_result_t result = run_cli({"compose", "--platform", platform, "-o", directory_.path("new.bin")});
+  EXPECT_EQ(result.status, 2);
+  EXPECT_THAT(result.error, HasSubstr(": edid-composer.prot: there is no such setting: did you mean port?\n"));
 }
 
 TEST_F(RefusedComposition, WritesNothing) {

@@ -15,6 +15,7 @@ using testing::EndsWith;
 using testing::HasSubstr;
 using testing::Key;
 using testing::Not;
+using testing::StartsWith;
 
 class SeveralSinks : public several_fixture_t {
  protected:
@@ -47,21 +48,61 @@ TEST_F(SeveralSinks, GoTogetherWithSeveralPorts) {
 
 TEST_F(SeveralSinks, AfterABadOneTheOthersFollow) {
   add_sink("1.bin", sample_bytes("tv_4k"));
-  add_sink("2.txt", "00 zz\n");
-  add_sink("3.bin", "");
+  add_sink("2.bin", sample_bytes("tv_4k").substr(0, 100));
   add_sink("4.bin", sample_bytes("tv_4k"));
   const process_result_t result = compose({"--sink", sinks_});
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.error, "");
-  EXPECT_EQ(result.output,
-            "composed  2\nfailed    2\n\n"
-            "FAILED  REASON\n"
-            "2.txt   " +
-                sinks_ +
-                "/2.txt:1:4: \"zz\" is not hexadecimal\n"
-                "3.bin   " +
-                sinks_ + "/3.bin: is empty\n");
+  EXPECT_EQ(result.output, "composed  2\nfailed    1\n\nFAILED  REASON\n2.bin   " + sinks_ +
+                               "/2.bin: 100 bytes are not an EDID, which has 1 to 256 blocks of 128 bytes\n");
   EXPECT_THAT(edids(), ElementsAre(Key("1.bin"), Key("4.bin")));
+}
+
+TEST_F(SeveralSinks, FilesThatAreNoEdidsArePassedOver) {
+  add_sink("1.bin", sample_bytes("tv_4k"));
+  add_sink("2.txt", "00 zz\n");
+  add_sink("3.bin", "");
+  add_sink("README.md", "# Sinks\n");
+  const process_result_t result = compose({"--sink", sinks_});
+  EXPECT_EQ(result.status, 0);
+  EXPECT_EQ(result.error, "");
+  EXPECT_THAT(result.output,
+              StartsWith("composed  1\nfailed    0\n\npassed over: " + sinks_ +
+                         "/2.txt:1:4: \"zz\" is not hexadecimal\npassed over: " + sinks_ +
+                         "/3.bin: is empty\npassed over: " + sinks_ + "/README.md: 0 bytes are not an EDID"));
+  EXPECT_THAT(edids(), ElementsAre(Key("1.bin")));
+}
+
+TEST_F(SeveralSinks, AFolderWithoutAnEdidIsRefused) {
+  add_sink("README.md", "# Sinks\n");
+  const process_result_t result = compose({"--sink", sinks_});
+  EXPECT_EQ(result.status, 2);
+  EXPECT_EQ(result.error, "edid-composer: " + sinks_ + ": holds no sinks\n");
+}
+
+TEST_F(SeveralSinks, LogsNeverTakeTheNameOfAnEdid) {
+  add_sink("a.bin", sample_bytes("tv_4k"));
+  add_sink("a.log.txt", sample_bytes("tv_720p_50hz"));
+  std::filesystem::create_directory(edids_);
+  const process_result_t result = run_cli({"compose", "--sink", sinks_, "--log", "-o", edids_ + "/{sink}"});
+  EXPECT_EQ(result.status, 0);
+  const auto files = edids();
+  EXPECT_THAT(files, ElementsAre(Key("a"), Key("a.log"), Key("a.log.log"), Key("a.log.log.log")));
+  EXPECT_EQ(files.at("a.log").size(), 256U);
+}
+
+TEST_F(SeveralSinks, StrictFailsThoseThatAreNotReadOrOfNoUse) {
+  std::string damaged = sample_bytes("tv_4k");
+  damaged[255] = static_cast<char>(damaged[255] + 1);
+  add_sink("a.bin", sample_bytes("tv_4k"));
+  add_sink("b.bin", damaged);
+  EXPECT_EQ(compose({"--sink", sinks_}).status, 0);
+  std::filesystem::remove_all(edids_);
+  const process_result_t result = compose({"--sink", sinks_, "--strict"});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_THAT(result.output,
+              HasSubstr("b.bin   --strict: the sink is not read to its end: extension refused: checksum"));
+  EXPECT_THAT(edids(), ElementsAre(Key("a.bin")));
 }
 
 TEST_F(SeveralSinks, WhatTheLibrarySaidIsCountedOnce) {
@@ -90,7 +131,7 @@ TEST_F(SeveralSinks, ManyDifferentMessagesAreSummedUp) {
 
 TEST_F(SeveralSinks, NeitherResultsNorOutputDependOnTheNumberOfJobs) {
   add_samples();
-  add_sink("bad.txt", "zz");
+  add_sink("bad.bin", sample_bytes("tv_4k").substr(0, 100));
   for (int number = 0; number < 40; ++number) {
     add_sink("more" + std::to_string(number) + ".bin", sample_bytes("tv_4k"));
   }

@@ -54,7 +54,9 @@ TEST_F(StandardStreams, ARefusedCompositionSaysWhyOnStandardErrorThen) {
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.output, "");
   EXPECT_THAT(result.error, HasSubstr("() ERROR: Failed encoding the new edid.\n"));
-  EXPECT_THAT(result.error, testing::EndsWith("\nedid-composer: the library refused to compose an EDID\n"));
+  EXPECT_THAT(result.error,
+              testing::EndsWith("\nedid-composer: the library refused to compose an EDID: Failed encoding short audio. "
+                                "Index:1 Type:0\n"));
 }
 
 TEST_F(StandardStreams, OutputThatCannotBeWrittenIsAnError) {
