@@ -114,6 +114,7 @@ TEST(ConfigurationLog, EmptyConfigurationIsTracedKeyByKeyToo) {
 TEST(ConfigurationLog, EmptyConfigurationYieldsTheDefaults) {
   const configuration_tree_t tree;
   platform_values_t values;
+  std::memset(static_cast<void *>(&values), 0, sizeof values);  // Padding is compared too.
   ASSERT_TRUE(platform_values_init(&values));
   test_support::output_of([&] { EXPECT_TRUE(_read_platform_values(&values, nullptr)); });
 
@@ -134,6 +135,7 @@ TEST(ConfigurationLog, EmptyConfigurationYieldsTheDefaults) {
   }
   ASSERT_TRUE(platform_values_destroy(&values));
   platform_values_t fresh;
+  std::memset(static_cast<void *>(&fresh), 0, sizeof fresh);
   ASSERT_TRUE(platform_values_init(&fresh));
   ASSERT_TRUE(platform_values_destroy(&fresh));
   EXPECT_EQ(std::memcmp(&values, &fresh, sizeof values), 0);
