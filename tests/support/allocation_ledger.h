@@ -3,8 +3,8 @@
 
 namespace test_support {
 
-/// Keeps account of the malloc() or calloc() and free() calls of statically linked code while it lives, one at a time. For
-/// executables that are linked with allocation_wrapping (see robustness/CMakeLists.txt).
+/// Keeps account of the malloc() or calloc() and free() calls of statically linked code while it lives, one at a time.
+/// For executables that are linked with allocation_wrapping (see robustness/CMakeLists.txt).
 class allocation_ledger_t {
  public:
   allocation_ledger_t();

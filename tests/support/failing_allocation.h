@@ -6,8 +6,8 @@ namespace test_support {
 /// How many allocations fail, from the one that a test names on.
 enum class failing_t { only_that_one, all_from_there_on };
 
-/// While it lives, the @p nth malloc() or calloc() from its construction on (counted from 1) fails. Works on code that is linked
-/// statically, such as the library in unit_tests; calls from within shared libraries are not seen.
+/// While it lives, the @p nth malloc() or calloc() from its construction on (counted from 1) fails. Works on code that
+/// is linked statically, such as the library in unit_tests; calls from within shared libraries are not seen.
 class failing_allocation_t {
  public:
   explicit failing_allocation_t(int nth, failing_t failing = failing_t::only_that_one);
