@@ -502,15 +502,15 @@ typedef struct configuration_key_t {
   u32 kind;         /**< @ref configuration_kind. */
   const char *path; /**< The whole path, as the `config_*` operations are asked for it. */
   const char *name; /**< Its end, after "platform.software.drivers.vorex.edid.". */
-  u32 minimum;      /**< Smallest number: of an integer, which becomes this one where it is smaller; of an entry, which is
-                         passed over where it is: a VIC, an HDMI_VIC, a bit, a refresh rate in Hz. Of a text: fewest
-                         characters that have an effect. */
-  u32 maximum;      /**< Largest number, likewise. Of a text: most characters; those after them are not read. */
+  u32 minimum; /**< Smallest number: of an integer, which becomes this one where it is smaller; of an entry, which is
+                    passed over where it is: a VIC, an HDMI_VIC, a bit, a refresh rate in Hz. Of a text: fewest
+                    characters that have an effect. */
+  u32 maximum; /**< Largest number, likewise. Of a text: most characters; those after them are not read. */
   u32 default_number;       /**< Of an integer. */
   const char *default_text; /**< Of a text. */
   u32 entry_characters;     /**< Of a list of texts: most characters of an entry; those after them are not read. */
-  u32 most_entries;         /**< Of a list and of the audio formats: entries after so many have no effect. 0: no limit. */
-  const char *meaning;      /**< What it does, in a sentence or two. */
+  u32 most_entries;    /**< Of a list and of the audio formats: entries after so many have no effect. 0: no limit. */
+  const char *meaning; /**< What it does, in a sentence or two. */
 } configuration_key_t;
 
 /**
@@ -523,45 +523,45 @@ EDID_COMPOSER_API const configuration_key_t *configuration_key(u32 index);
 
 /** What became of a key or of an entry; @ref configuration_reading_t::reason. */
 enum configuration_reason {
-  CONFIGURATION_TAKEN = 1,         /**< Taken as it is. */
-  CONFIGURATION_ABSENT = 2,        /**< Nothing of its kind is there: a number or text has its default, a list is empty. */
-  CONFIGURATION_TOO_SMALL = 3,     /**< A number below the smallest, which is taken. */
-  CONFIGURATION_TOO_LARGE = 4,     /**< A number above the largest, which is taken. */
-  CONFIGURATION_WITHOUT_MEANING = 5,     /**< A number within the limits that has no meaning: another one is taken. */
-  CONFIGURATION_EMPTY = 6,               /**< A list of video modes of which no entry counts. */
-  CONFIGURATION_WRONG_KIND = 7,          /**< Entry passed over: an integer among texts, or the reverse. */
-  CONFIGURATION_OUT_OF_RANGE = 8,        /**< Entry passed over: its number is outside of the limits. */
-  CONFIGURATION_NOT_A_NUMBER = 9,        /**< Entry passed over: a video mode that does not begin with a number. */
-  CONFIGURATION_3D_UNKNOWN = 10,         /**< Entry passed over: a word that is neither FP nor SBSH nor TBH. */
-  CONFIGURATION_NO_ROOM = 11,            /**< Entry passed over: @ref configuration_key_t::most_entries are there. */
-  CONFIGURATION_WIDTH_NOT_IN_EIGHTS = 12,  /**< Entry passed over: the width is no multiple of 8. */
-  CONFIGURATION_WIDTH_NOT_ENCODABLE = 13,  /**< Entry taken, but it has no byte for its width: sources read another. */
-  CONFIGURATION_HEIGHT_UNKNOWN = 14,       /**< Entry passed over: no aspect ratio has this height at its width. */
-  CONFIGURATION_RATE_ROUNDED_UP = 15,      /**< Entry taken, its refresh rate without the fraction and one higher. */
-  CONFIGURATION_OUT_OF_MEMORY = 16         /**< Entry passed over: no list entry could be had. */
+  CONFIGURATION_TAKEN = 1,     /**< Taken as it is. */
+  CONFIGURATION_ABSENT = 2,    /**< Nothing of its kind is there: a number or text has its default, a list is empty. */
+  CONFIGURATION_TOO_SMALL = 3, /**< A number below the smallest, which is taken. */
+  CONFIGURATION_TOO_LARGE = 4, /**< A number above the largest, which is taken. */
+  CONFIGURATION_WITHOUT_MEANING = 5,      /**< A number within the limits that has no meaning: another one is taken. */
+  CONFIGURATION_EMPTY = 6,                /**< A list of video modes of which no entry counts. */
+  CONFIGURATION_WRONG_KIND = 7,           /**< Entry passed over: an integer among texts, or the reverse. */
+  CONFIGURATION_OUT_OF_RANGE = 8,         /**< Entry passed over: its number is outside of the limits. */
+  CONFIGURATION_NOT_A_NUMBER = 9,         /**< Entry passed over: a video mode that does not begin with a number. */
+  CONFIGURATION_3D_UNKNOWN = 10,          /**< Entry passed over: a word that is neither FP nor SBSH nor TBH. */
+  CONFIGURATION_NO_ROOM = 11,             /**< Entry passed over: @ref configuration_key_t::most_entries are there. */
+  CONFIGURATION_WIDTH_NOT_IN_EIGHTS = 12, /**< Entry passed over: the width is no multiple of 8. */
+  CONFIGURATION_WIDTH_NOT_ENCODABLE = 13, /**< Entry taken, but it has no byte for its width: sources read another. */
+  CONFIGURATION_HEIGHT_UNKNOWN = 14,      /**< Entry passed over: no aspect ratio has this height at its width. */
+  CONFIGURATION_RATE_ROUNDED_UP = 15,     /**< Entry taken, its refresh rate without the fraction and one higher. */
+  CONFIGURATION_OUT_OF_MEMORY = 16        /**< Entry passed over: no list entry could be had. */
 };
 
 /** What was read of a key or of an entry. Its texts are valid until the observer returns. */
 typedef struct configuration_reading_t {
-  u32 size;                       /**< Bytes of the record that the library fills. A later version may append members. */
-  u32 reason;                     /**< What became of it; @ref configuration_reason. */
+  u32 size;   /**< Bytes of the record that the library fills. A later version may append members. */
+  u32 reason; /**< What became of it; @ref configuration_reason. */
   const configuration_key_t *key; /**< The key, static. */
-  i32 entry;        /**< Which entry: its place in the host's list, from 0; of an audio format its letter, 0 for "a".
-                         -1: the key itself, of a list after its entries. */
-  i32 place;        /**< Place, from 0, among the entries that count; -1 for one that was passed over, and for a key. Where
-                         @ref compose_decision_t::priority_index and addition_index point. */
+  i32 entry; /**< Which entry: its place in the host's list, from 0; of an audio format its letter, 0 for "a".
+                  -1: the key itself, of a list after its entries. */
+  i32 place; /**< Place, from 0, among the entries that count; -1 for one that was passed over, and for a key. Where
+                  @ref compose_decision_t::priority_index and addition_index point. */
   const char *node; /**< Name of an entry's node in the host's tree; empty for an audio format and for a key. */
   const char *text; /**< A text as it counts, a list's text as it was read; else empty. */
-  i32 found; /**< The number that is there, or for which an entry was replaced or passed over: width, height, refresh rate
-                  or VIC; 0 where there is none. Of a list: its entries. Unsigned numbers keep their bits. */
+  i32 found; /**< The number that is there, or for which an entry was replaced or passed over: width, height, refresh
+                rate or VIC; 0 where there is none. Of a list: its entries. Unsigned numbers keep their bits. */
   i32 used;  /**< The number that counts; 0 for an entry that was passed over. Of a list: its entries that count. */
 } configuration_reading_t;
 
 /**
  * Receives what was read.
  *
- * Called on the thread that composes while the configuration is read: once for each key, and before a list's key for each
- * of its entries. Audio formats that are absent are passed over.
+ * Called on the thread that composes while the configuration is read: once for each key, and before a list's key for
+ * each of its entries. Audio formats that are absent are passed over.
  *
  * @param reading the record; it is gone when the call returns.
  * @param context @ref compose_request_t::configuration_observer_context.
