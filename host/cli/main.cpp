@@ -7,6 +7,7 @@
 #include "io/program_name.h"
 #include "io/standard_output.h"
 #include "io/temporary_file.h"
+#include "text/printable_text.h"
 
 int main(int argument_count, char **arguments) {
   edid_cli::remove_temporary_files_on_signals();
@@ -17,7 +18,7 @@ int main(int argument_count, char **arguments) {
   } catch (const std::exception &problem) {
     // What standard output still holds comes first, as it happened first.
     std::fflush(stdout);
-    std::fprintf(stderr, "%s: %s\n", edid_cli::program_name, problem.what());
+    std::fprintf(stderr, "%s: %s\n", edid_cli::program_name, edid_cli::printable(problem.what()).c_str());
     return edid_cli::bad_input_status;
   }
 }

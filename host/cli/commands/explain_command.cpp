@@ -1,9 +1,7 @@
 #include "commands/explain_command.h"
 
-#include <algorithm>
 #include <cstdio>
 #include <filesystem>
-#include <iterator>
 #include <memory>
 #include <optional>
 
@@ -31,6 +29,7 @@ struct explain_options_t {
   composition_options_t composition;
   std::optional<std::string> want;  ///< One mode or format that is asked about; none: all decisions.
   bool json = false;
+  bool wide = false;      ///< The tables with all columns.
   std::string html_file;  ///< Empty: no page.
 };
 
@@ -64,13 +63,21 @@ std::string platform_name(const composition_options_t &options) {
 }
 
 int print_answers(const explain_options_t &options, const std::vector<wanted_t> &wanted, const explained_t &explained) {
-  std::vector<answer_t> answers;
-  std::transform(wanted.begin(), wanted.end(), std::back_inserter(answers),
-                 [&explained](const wanted_t &one) { return answer(one, explained); });
+  const answers_t answers = answers_to(wanted, explained);
   std::fputs((options.json ? answer_json(*options.want, answers) : answer_text(answers)).c_str(), stdout);
-  return std::any_of(answers.begin(), answers.end(), [](const answer_t &one) { return one.is_offered; })
-             ? offered_status
-             : not_offered_status;
+  return answers.is_any_offered() ? offered_status : not_offered_status;
+}
+
+void print_explanation(const explain_options_t &options, const explanation_t &explanation) {
+  if (!options.html_file.empty()) {
+    write_output(options.html_file, explanation_page(explanation));
+  }
+  if (options.json) {
+    std::fputs(explanation_json(explanation).c_str(), stdout);
+  } else if (options.html_file.empty()) {
+    const table_width_t width = options.wide ? table_width_t::wide : table_width_t::narrow;
+    std::fputs(explanation_text(explanation, width).c_str(), stdout);
+  }
 }
 
 void check(const explain_options_t &options) {
@@ -79,6 +86,9 @@ void check(const explain_options_t &options) {
   }
   if (options.want && !options.html_file.empty()) {
     throw bad_input_t("--want and --html don't go together");
+  }
+  if (options.wide && (options.json || options.want || !options.html_file.empty())) {
+    throw bad_input_t("--wide is for the tables: it goes with neither --json, --want nor --html");
   }
   if (options.json && options.html_file == standard_stream) {
     throw bad_input_t("--json and --html cannot both go to standard output");
@@ -102,16 +112,12 @@ int run(explain_options_t &options) {
     return options.want ? bad_input_status : refused_status;
   }
   const std::string sink_name = options.composition.sink ? input_name(*options.composition.sink) : "";
-  const explained_t explained{composition, sink, record.get(), sink_name, places, options.composition};
+  const sink_reading_t reading = sink_reading(sink, composition.result);
+  const explained_t explained{composition, sink, record.get(), sink_name, reading, places, options.composition};
   if (options.want) {
     return print_answers(options, wanted, explained);
   }
-  if (!options.html_file.empty()) {
-    write_output(options.html_file, explanation_page(explained));
-  }
-  if (options.json || options.html_file.empty()) {
-    std::fputs((options.json ? explanation_json(explained) : explanation_text(explained)).c_str(), stdout);
-  }
+  print_explanation(options, explanation_of(explained));
   return done_status;
 }
 
@@ -120,13 +126,15 @@ int run(explain_options_t &options) {
 command_t explain_command() {
   const auto target = std::make_shared<explain_options_t>();
   std::vector<option_t> options = composition_options(target->composition);
-  options.insert(options.end(),
-                 {option(
-                      "--want", "MODE", target->want, [](const std::string &text) { return text; },
-                      "Tell what stands in the way of one mode or format: 16, 1920x1080p60, 4k:1, ac3, audio:2"),
-                  flag("--json", target->json, "Print a JSON document"),
-                  option("--html", "FILE", target->html_file, parse_file_name,
-                         "Write a page to read in a browser; - for standard output")});
+  options.insert(
+      options.end(),
+      {option(
+           "--want", "MODE", target->want, [](const std::string &text) { return text; },
+           "Say what stands in the way of one mode or format: 1080p60, 4k30, vic 16, pcm8, ac3, 3d, deep-color"),
+       flag("--wide", target->wide, "Print where each row comes from, and wrap nothing"),
+       flag("--json", target->json, "Print a JSON document"),
+       option("--html", "FILE", target->html_file, parse_file_name,
+              "Write a page to read in a browser; - for standard output")});
   return {"explain", "Tell why a composed EDID offers what it offers", std::move(options),
           [target] { return run(*target); }};
 }

@@ -1,5 +1,7 @@
 #include "commands/print_command.h"
 
+#include <unistd.h>
+
 #include <cstdio>
 #include <filesystem>
 #include <memory>
@@ -13,6 +15,7 @@
 #include "io/input.h"
 #include "io/program_name.h"
 #include "io/standard_output.h"
+#include "text/printable_text.h"
 
 namespace edid_cli {
 namespace {
@@ -37,11 +40,19 @@ std::string title_of(const std::string &file) {
 int run(const print_options_t &options) {
   const std::vector<u8> edid = read_edid(options.source, options.drm_directory);
   const bool decoded = decodes(edid);
-  print_edid(edid.data(), static_cast<u32>(edid.size()), options.brief ? 1 : 0, title_of(options.source).c_str());
+  const auto print = [&] {
+    print_edid(edid.data(), static_cast<u32>(edid.size()), options.brief ? 1 : 0, title_of(options.source).c_str());
+  };
+  // The library prints a sink's texts as they are, and a terminal obeys what is among them.
+  if (isatty(STDOUT_FILENO) == 1) {
+    std::fputs(printable_lines(printed_by(print)).c_str(), stdout);
+  } else {
+    print();
+  }
   if (!decoded) {
     flush_standard_output();
     std::fprintf(stderr, "%s: %s: the library refused to decode this EDID\n", program_name,
-                 input_name(options.source).c_str());
+                 printable(input_name(options.source)).c_str());
     return refused_status;
   }
   return done_status;

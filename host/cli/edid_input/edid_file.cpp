@@ -20,8 +20,37 @@ bool is_text_character(char character) {
 }
 
 /// No text holds the zero bytes of an EDID's header, and hardly an EDID without them holds text only.
-bool is_raw(std::string_view content) {
-  return !std::all_of(content.begin(), content.end(), is_text_character);
+bool is_text(std::string_view content) {
+  return std::all_of(content.begin(), content.end(), is_text_character);
+}
+
+/// The registry's editor writes UTF-16, low byte first. Empty when it is none, or none that could hold digits.
+std::string text_of_utf16(std::string_view content) {
+  constexpr std::string_view byte_order_mark = "\xFF\xFE";
+  std::string text;
+  if (content.starts_with(byte_order_mark) && content.size() % 2 == 0) {
+    for (std::size_t place = byte_order_mark.size(); place < content.size(); place += 2) {
+      text += content[place + 1] == 0 ? content[place] : '?';
+    }
+  }
+  return is_text(text) ? text : "";
+}
+
+/// Tools and editors put a newline after what they write.
+std::vector<u8> raw_bytes(std::string_view content) {
+  for (const std::string_view newline : {"\r\n", "\n"}) {
+    if (content.ends_with(newline) && content.size() % edid_block_size == newline.size()) {
+      content.remove_suffix(newline.size());
+    }
+  }
+  return {content.begin(), content.end()};
+}
+
+std::vector<u8> bytes_of(const std::string &content, const std::string &name) {
+  const std::string utf16 = text_of_utf16(content);
+  return !utf16.empty()     ? parse_hex_text(utf16, name)
+         : is_text(content) ? parse_hex_text(content, name)
+                            : raw_bytes(content);
 }
 
 bool exists(const std::string &file) {
@@ -30,8 +59,7 @@ bool exists(const std::string &file) {
 }
 
 std::vector<u8> parse_edid(const std::string &content, const std::string &name) {
-  std::vector<u8> bytes =
-      is_raw(content) ? std::vector<u8>(content.begin(), content.end()) : parse_hex_text(content, name);
+  std::vector<u8> bytes = bytes_of(content, name);
   if (bytes.empty() || bytes.size() % edid_block_size != 0 || bytes.size() > max_edid_size) {
     throw bad_input_t(name + ": " + std::to_string(bytes.size()) +
                       " bytes are not an EDID, which has 1 to 256 blocks of 128 bytes");

@@ -76,6 +76,8 @@ std::string video_mode_text(const short_video_desc_t &mode) {
          (mode.native != 0 ? " native" : "") + names_of(mode.stereo, stereo_names);
 }
 
+}  // namespace
+
 std::string audio_format_text(const short_audio_desc_t &format) {
   char rates[128] = "";
   audio_freq_string(format.frequencies, rates, sizeof rates);
@@ -97,8 +99,6 @@ std::string audio_format_text(const short_audio_desc_t &format) {
   }
   return text;
 }
-
-}  // namespace
 
 std::string version_text(const edid_t &edid) {
   return std::to_string(edid.version) + "." + std::to_string(edid.revision);

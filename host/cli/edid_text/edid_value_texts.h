@@ -10,6 +10,8 @@ namespace edid_cli {
 
 std::string version_text(const edid_t &edid);
 std::string gamma_text(const edid_t &edid);
+/// "AC3, 6 channels, 32kHz 44.1kHz 48kHz, 640 kbit/s".
+std::string audio_format_text(const short_audio_desc_t &format);
 std::string speaker_text(const edid_t &edid);
 std::vector<std::string> standard_timing_texts(const edid_t &edid);
 std::vector<std::string> detailed_timing_texts(const edid_t &edid);

@@ -4,14 +4,22 @@
 
 namespace edid_cli {
 
-u32 explained_t::family() const {
+u32 family_of(const composition_t &composition) {
   const compose_decision_t *const rate = find_decision(composition, COMPOSE_SUBJECT_NATIVE_RATE);
   return rate != nullptr && rate->code == 50 ? 50 : 60;
 }
 
-bool explained_t::is_extension_announced() const {
+bool announces_extension(const composition_t &composition) {
   const compose_decision_t *const room = find_decision(composition, COMPOSE_SUBJECT_EXTENSION_ROOM);
   return room == nullptr || room->reason != COMPOSE_REASON_NOT_ANNOUNCED;
+}
+
+u32 explained_t::family() const {
+  return family_of(composition);
+}
+
+bool explained_t::is_extension_announced() const {
+  return announces_extension(composition);
 }
 
 const compose_decision_t *find_decision(const composition_t &composition, compose_subject subject) {

@@ -6,6 +6,7 @@
 
 #include "composition/composition.h"
 #include "edid_text/decoded_edid.h"
+#include "explain/sink_reading.h"
 #include "platform/platform_places.h"
 
 namespace edid_cli {
@@ -15,6 +16,7 @@ struct explained_t {
   const std::vector<u8> &sink_bytes;  ///< Empty: no sink.
   const edid_t &sink;                 ///< What could be decoded of it.
   std::string sink_name;              ///< Empty: no sink.
+  const sink_reading_t &reading;      ///< What of the sink's bytes the library has read.
   const platform_places_t &places;
   const composition_options_t &options;
 
@@ -23,6 +25,11 @@ struct explained_t {
   /// Whether sources look at the extension at all.
   bool is_extension_announced() const;
 };
+
+/// The refresh family whose lists a composition has used.
+u32 family_of(const composition_t &composition);
+/// Whether sources look at the extension at all.
+bool announces_extension(const composition_t &composition);
 
 /// The first decision about a subject; nullptr when there is none.
 const compose_decision_t *find_decision(const composition_t &composition, compose_subject subject);

@@ -3,11 +3,11 @@
 
 #include <string>
 
-#include "explain/explained.h"
+#include "explain/explanation.h"
 
 namespace edid_cli {
 
 /// One page that needs nothing else.
-std::string explanation_page(const explained_t &explained);
+std::string explanation_page(const explanation_t &explanation);
 
 }  // namespace edid_cli

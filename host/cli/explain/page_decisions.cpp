@@ -7,8 +7,6 @@
 namespace edid_cli {
 namespace {
 
-constexpr section_t sections[] = {section_t::video, section_t::mode_4k, section_t::audio, section_t::derived};
-
 const char *verdict_class(const row_t &row) {
   switch (row.decision.verdict) {
     case COMPOSE_VERDICT_OFFERED:
@@ -36,28 +34,61 @@ std::string row_html(const row_t &row) {
          "</td><td class=\"mono\">" + sources_html(row) + "</td></tr>\n";
 }
 
-}  // namespace
-
-std::string summary_html(const std::vector<row_t> &rows) {
-  std::string html;
-  for (const section_t section : sections) {
-    if (section == section_t::derived) {
-      continue;
-    }
-    const auto count = [&rows, section](bool offered) {
-      return std::count_if(rows.begin(), rows.end(), [section, offered](const row_t &row) {
-        return row.section == section && row.is_offered() == offered;
-      });
-    };
-    html += std::string("<li>") + section_title(section) + ": <b>" + std::to_string(count(true)) + " offered</b>, " +
-            std::to_string(count(false)) + " left out</li>";
+/// A name and its values, a line each.
+std::string fact_html(const char *name, const std::vector<std::string> &values) {
+  std::string html = std::string("<dt>") + name + "</dt><dd>";
+  bool is_empty = true;
+  for (const std::string &value : values) {
+    html += value.empty() ? "" : "<span>" + html_text(value) + "</span>";
+    is_empty = is_empty && value.empty();
   }
-  return html;
+  return html + (is_empty ? "none" : "") + "</dd>\n";
 }
 
-std::string warnings_html(const std::vector<row_t> &rows) {
+std::vector<std::string> first_ones(const std::vector<std::string> &lost) {
+  constexpr std::size_t shown = 5;
+  std::vector<std::string> texts(lost.begin(),
+                                 lost.begin() + static_cast<std::ptrdiff_t>(std::min(shown, lost.size())));
+  if (lost.size() > shown) {
+    texts.push_back("and " + std::to_string(lost.size() - shown) + " more");
+  }
+  return texts;
+}
+
+std::vector<std::string> reason_texts(const summary_t &summary) {
+  std::vector<std::string> texts;
+  for (const common_reason_t &reason : summary.reasons) {
+    texts.push_back(std::to_string(reason.count) + " times: " + reason.text);
+  }
+  return texts;
+}
+
+}  // namespace
+
+std::string summary_html(const explanation_t &explanation) {
+  const summary_t &summary = explanation.summary;
+  // What was not read of the sink stands among the warnings.
+  const bool is_told = !explanation.reading.gaps.empty();
+  std::string html = "<dl class=\"first\">" + (is_told ? "" : fact_html("Sink", {summary.status})) +
+                     fact_html("Best video", {summary.best_video}) +
+                     fact_html("Preferred video", {summary.preferred_video}) + fact_html("Audio", summary.audio);
+  if (explanation.reading.is_given) {
+    html += fact_html("Lost", first_ones(summary.lost));
+  }
+  html += fact_html("Most common reasons", reason_texts(summary)) + "</dl>\n<ul class=\"sum\">";
+  for (const count_t &count : summary.counts) {
+    html += std::string("<li>") + section_title(count.section) + ": <b>" + std::to_string(count.offered) +
+            " offered</b>, " + std::to_string(count.left_out) + " left out</li>";
+  }
+  return html + "</ul>";
+}
+
+std::string warnings_html(const explanation_t &explanation) {
   std::string html;
-  for (const std::string &warning : warnings_of(rows)) {
+  for (const std::string &gap : explanation.reading.gaps) {
+    html += "<p class=\"warning\"><b>Sink:</b> " + html_text(gap) + "</p>\n";
+  }
+  for (const std::string &warning : explanation.warnings) {
     html += "<p class=\"warning\"><b>Warning:</b> " + html_text(warning) + "</p>\n";
   }
   return html;

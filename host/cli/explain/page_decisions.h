@@ -4,12 +4,12 @@
 #include <string>
 #include <vector>
 
-#include "explain/rows.h"
+#include "explain/explanation.h"
 
 namespace edid_cli {
 
-std::string summary_html(const std::vector<row_t> &rows);
-std::string warnings_html(const std::vector<row_t> &rows);
+std::string summary_html(const explanation_t &explanation);
+std::string warnings_html(const explanation_t &explanation);
 std::string section_options_html();
 std::string decisions_html(const std::vector<row_t> &rows);
 

@@ -15,6 +15,9 @@ struct reason_text_t {
   const char *keys[2] = {nullptr, nullptr};  ///< Of the platform; null: none.
   const char *setting = nullptr;             ///< An option of the command line; null: none.
   sink_part_t sink_part = sink_part_t::none;
+  /// The sentence for a sink that was not read to its end, where the reason rests on what the sink doesn't have: with
+  /// {missing} for the part that was not read. Null: the reason doesn't rest on it.
+  const char *unread_sentence = nullptr;
 };
 
 /// The row of a reason; one without keys for a reason that is not known.

@@ -23,6 +23,10 @@ std::string megahertz_of_kilohertz(i32 value) {
   return text;
 }
 
+std::string channels_text(i32 value) {
+  return std::to_string(value) + (value == 1 ? " channel" : " channels");
+}
+
 /// One number in the form that a letter stands for.
 std::string formatted(i32 value, char form) {
   switch (form) {
@@ -39,7 +43,7 @@ std::string formatted(i32 value, char form) {
     case 'm':  // A sink's TMDS clock.
       return value == 0 ? "declares none" : "declares " + std::to_string(value) + " MHz";
     case 'c':
-      return std::to_string(value) + (value == 1 ? " channel" : " channels");
+      return channels_text(value);
     case 'o':
       return value != 0 ? "yes" : "no";
     default:
@@ -64,32 +68,107 @@ std::string who_has_it(const compose_decision_t &decision, const explained_t &ex
   return addition && !sink ? addition_list(decision, explained) : "The sink";
 }
 
+std::string other_family(const compose_decision_t &, const explained_t &explained) {
+  return explained.family() == 60 ? "50" : "60";
+}
+
+std::string missing_part(const compose_decision_t &, const explained_t &explained) {
+  return explained.reading.missing_part;
+}
+
+/// Where a source finds none of its kind, it is the extension that it does not find.
+std::string why_no_room(const compose_decision_t &decision, const explained_t &explained) {
+  return explained.is_extension_announced()
+             ? "there is no room for it: a source finds " + std::to_string(decision.value[0]) + " of its kind"
+             : "without a monitor name sources do not read the extension";
+}
+
+/// Only what has changed; bit rates and sample sizes are not among a reason's numbers.
+std::string narrowed(const compose_decision_t &decision, const explained_t &) {
+  const i32(&value)[4] = decision.value;
+  std::string text;
+  if (value[0] != value[1]) {
+    text = channels_text(value[0]) + " became " + std::to_string(value[1]);
+  }
+  if (value[2] != value[3]) {
+    text += (text.empty() ? "" : ", ") + sample_rates(value[2]) + " became " + sample_rates(value[3]);
+  }
+  return text.empty() ? "fewer sample sizes, or a lower bit rate" : text;
+}
+
+/// Rates are counted down: 59 Hz is 59.94 Hz.
+std::string rate(const compose_decision_t &decision, const explained_t &) {
+  const std::string family = std::to_string(decision.code);
+  const std::string told = std::to_string(decision.value[1]);
+  return told + " Hz" + (told == family ? "" : ", which counts as " + family);
+}
+
+std::string raster(const compose_decision_t &decision, const explained_t &) {
+  const i32(&value)[4] = decision.value;
+  return raster_name(value[0], value[1], value[2], value[3] != 0);
+}
+
+std::string declared(const compose_decision_t &decision, const explained_t &) {
+  return decision.verdict == COMPOSE_VERDICT_LEFT_OUT ? "" : ": 0 ms is declared, as other latencies are";
+}
+
+struct named_place_t {
+  std::string_view name;
+  std::string (*text)(const compose_decision_t &decision, const explained_t &explained);
+};
+
+constexpr named_place_t named_places[] = {
+    {"priority", priority_list}, {"addition", addition_list}, {"who", who_has_it},    {"other", other_family},
+    {"missing", missing_part},   {"no_room", why_no_room},    {"narrowed", narrowed}, {"rate1", rate},
+    {"raster0", raster},         {"declared", declared},
+};
+
 /// What a place in braces stands for.
 std::string resolved(std::string_view place, const compose_decision_t &decision, const explained_t &explained) {
-  if (place == "priority") {
-    return priority_list(decision, explained);
-  }
-  if (place == "addition") {
-    return addition_list(decision, explained);
-  }
-  if (place == "who") {
-    return who_has_it(decision, explained);
+  for (const named_place_t &named : named_places) {
+    if (named.name == place) {
+      return named.text(decision, explained);
+    }
   }
   const i32(&value)[4] = decision.value;
-  if (place == "raster0") {
-    return raster_name(value[0], value[1], value[2], value[3] != 0);
-  }
   const std::size_t number = static_cast<std::size_t>(place.front() - '0');
   return formatted(value[number], place.size() > 2 ? place[2] : ' ');
 }
 
+/// The library reads a short video descriptor as one of VIC 1 to 127 with a native bit; CTA-861-F made the bytes from
+/// 193 on VICs of their own.
+std::string above_last_vic(const compose_decision_t &decision, const explained_t &explained) {
+  const u32 vic = sink_vic(decision, explained.reading);
+  const std::string read_as =
+      vic == decision.code ? "" : " It takes this one for VIC " + std::to_string(decision.code) + ".";
+  const u32 hdmi_vic = hdmi_vic_of_vic(vic);
+  const std::string other = hdmi_vic == 0 ? "" : " HDMI 1.4 has it as 4k:" + std::to_string(hdmi_vic) + ".";
+  return "The sink has it; this library offers VICs up to 64." + read_as + other;
+}
+
 }  // namespace
 
+u32 sink_vic(const compose_decision_t &decision, const sink_reading_t &reading) {
+  constexpr u8 first_without_native_bit = 193;
+  const auto place = static_cast<std::size_t>(decision.sink_index);
+  const bool is_there = decision.sink_index >= 0 && place < reading.short_video.size();
+  const u8 byte = is_there ? reading.short_video[place] : u8{0};
+  return decision.code > last_library_vic && byte >= first_without_native_bit ? byte : decision.code;
+}
+
+bool rests_on_unread(const compose_decision_t &decision, const explained_t &explained) {
+  return explained.reading.is_incomplete() && reason_text(decision.reason).unread_sentence != nullptr;
+}
+
 std::string reason_sentence(const compose_decision_t &decision, const explained_t &explained) {
-  const char *const sentence = reason_text(decision.reason).sentence;
-  if (sentence == nullptr) {
+  const reason_text_t &row = reason_text(decision.reason);
+  if (row.sentence == nullptr) {
     return compose_reason_string(decision.reason);
   }
+  if (decision.subject == COMPOSE_SUBJECT_VIDEO_MODE && decision.code > last_library_vic) {
+    return above_last_vic(decision, explained);
+  }
+  const char *const sentence = rests_on_unread(decision, explained) ? row.unread_sentence : row.sentence;
   std::string text;
   std::string_view rest = sentence;
   for (std::size_t open = 0; (open = rest.find('{')) != std::string_view::npos;) {

@@ -1,14 +1,12 @@
 #include "explain/rows.h"
 
 #include <algorithm>
-#include <cstdlib>
+#include <functional>
 #include <iterator>
 #include <limits>
-#include <optional>
 #include <tuple>
 
-#include "edid_text/physical_address_text.h"
-#include "explain/mode_names.h"
+#include "explain/decision_names.h"
 #include "explain/reason_texts.h"
 
 namespace edid_cli {
@@ -16,9 +14,6 @@ namespace {
 
 constexpr const char *section_titles[] = {"Video modes", "4Kx2K modes", "Audio formats", "Limits and derived values"};
 constexpr const char *section_ids[] = {"video", "4k", "audio", "derived"};
-constexpr const char *latency_names[] = {"video latency", "audio latency", "interlaced video latency",
-                                         "interlaced audio latency"};
-
 section_t section_of(u32 subject) {
   switch (subject) {
     case COMPOSE_SUBJECT_VIDEO_MODE:
@@ -33,83 +28,6 @@ section_t section_of(u32 subject) {
   }
 }
 
-/// The descriptor that an audio decision is about, as its first source has it.
-std::optional<short_audio_desc_t> audio_of(const compose_decision_t &decision, const explained_t &explained) {
-  if ((decision.origins & COMPOSE_ORIGIN_PLATFORM_AUDIO) != 0) {
-    const list_entry_t *const entry = explained.places.entry(platform_list::audio, decision.priority_index);
-    const auto value = entry != nullptr ? static_cast<u32>(std::strtol(entry->text.c_str(), nullptr, 10)) : 0U;
-    short_audio_desc_t format{};
-    if ((value >> 3 & 15U) != 0 && decode_edid_short_audio(static_cast<u8>(value), static_cast<u8>(value >> 8),
-                                                           static_cast<u8>(value >> 16), &format) != 0) {
-      return format;
-    }
-    return std::nullopt;
-  }
-  i32 place = decision.sink_index;
-  for (const ll_entry_t *entry = explained.sink.audio_list.head; entry != nullptr; entry = entry->next) {
-    if (place-- == 0) {
-      return *static_cast<const short_audio_desc_t *>(entry->data);
-    }
-  }
-  return std::nullopt;
-}
-
-std::string audio_name(const compose_decision_t &decision, const explained_t &explained) {
-  const auto format = audio_of(decision, explained);
-  const std::string channels =
-      format ? ", " + std::to_string(format->channels) + (format->channels == 1 ? " channel" : " channels") : "";
-  return audio_type_name(decision.code) + channels;
-}
-
-std::string sink_timing_name(const compose_decision_t &decision) {
-  const i32(&value)[4] = decision.value;
-  return raster_name(value[0], value[1], value[2], value[3] != 0);
-}
-
-std::string derived_name(const compose_decision_t &decision) {
-  const std::string code = std::to_string(decision.code);
-  switch (decision.subject) {
-    case COMPOSE_SUBJECT_NATIVE_RATE:
-      return "refresh family " + code + " Hz";
-    case COMPOSE_SUBJECT_GEOMETRY_LIMIT:
-      return decision.reason == COMPOSE_REASON_GEOMETRY_UNLIMITED ? "height limit: none"
-                                                                  : "height limit " + code + " lines";
-    case COMPOSE_SUBJECT_CURRENT_MODE:
-      return decision.code == 0 ? "current mode" : "current mode " + short_mode_name(decision.code);
-    case COMPOSE_SUBJECT_PHYSICAL_ADDRESS:
-      return "physical address " + physical_address_text(decision.code);
-    case COMPOSE_SUBJECT_DEEP_COLOR:
-      return "deep colour, " + code + " bits";
-    case COMPOSE_SUBJECT_TMDS_CLOCK:
-      return decision.code == 0 ? "TMDS clock: not declared" : "TMDS clock " + code + " MHz";
-    case COMPOSE_SUBJECT_LATENCY:
-      return decision.code < std::size(latency_names) ? latency_names[decision.code] : "latency " + code;
-    case COMPOSE_SUBJECT_3D:
-      return decision.code != 0 ? "3D" : "3D: none";
-    case COMPOSE_SUBJECT_PADDING:
-      return "padding: " + code + (decision.code == 1 ? " mode" : " modes");
-    case COMPOSE_SUBJECT_EXTENSION_ROOM:
-      return "extension: " + code + " bytes";
-    default:
-      return std::string(compose_subject_string(decision.subject)) + " " + code;
-  }
-}
-
-std::string name_of(const compose_decision_t &decision, const explained_t &explained) {
-  switch (decision.subject) {
-    case COMPOSE_SUBJECT_VIDEO_MODE:
-      return video_mode_name(decision.code);
-    case COMPOSE_SUBJECT_SINK_TIMING:
-      return sink_timing_name(decision);
-    case COMPOSE_SUBJECT_4K_MODE:
-      return mode_4k_name(decision.code);
-    case COMPOSE_SUBJECT_AUDIO_FORMAT:
-      return audio_name(decision, explained);
-    default:
-      return derived_name(decision);
-  }
-}
-
 auto order_of(const row_t &row) {
   constexpr i32 last = std::numeric_limits<i32>::max();
   const compose_decision_t &decision = row.decision;
@@ -119,7 +37,78 @@ auto order_of(const row_t &row) {
                     is_placed ? decision.position : last, decision.subject, decision.code);
 }
 
+constexpr u32 sink_origins = COMPOSE_ORIGIN_DETAILED_TIMING | COMPOSE_ORIGIN_STANDARD_TIMING |
+                             COMPOSE_ORIGIN_SHORT_VIDEO | COMPOSE_ORIGIN_SINK_4K | COMPOSE_ORIGIN_SINK_AUDIO;
+
+/// Whether a timing stands in an extension that is malformed.
+bool is_doubtful(const compose_decision_t &decision, const sink_reading_t &reading) {
+  return decision.reason == COMPOSE_REASON_TIMING_WITHOUT_VIC &&
+         (decision.origins & COMPOSE_ORIGIN_DETAILED_TIMING) != 0 &&
+         reading.extension_status == COMPOSE_EXTENSION_MALFORMED && decision.sink_index >= 0 &&
+         static_cast<std::size_t>(decision.sink_index) >= reading.base_timings;
+}
+
+row_t row_of(const compose_decision_t &decision, const explained_t &explained) {
+  row_t row{section_of(decision.subject),         decision,
+            decision_name(decision, explained),   reason_sentence(decision, explained),
+            rests_on_unread(decision, explained), sources_of(decision, explained)};
+  if (is_of_unread_block(decision, explained.reading)) {
+    row.sentence = "This library reads one extension. It takes the bytes after it for timings, and offers none.";
+  } else if (is_doubtful(decision, explained.reading)) {
+    row.sentence = "It stands in an extension that is malformed, and may be no timing at all.";
+    row.rests_on_unread = true;
+  }
+  return row;
+}
+
+/// Whether one is left out because the other, of the other side, is offered.
+bool is_same_format(const row_t &offered, const row_t &other) {
+  constexpr u32 covered[] = {COMPOSE_REASON_PLATFORM_FORMATS_ONLY, COMPOSE_REASON_SINK_FORMATS_ONLY,
+                             COMPOSE_REASON_DUPLICATE};
+  return offered.section == section_t::audio && offered.is_offered() && other.section == section_t::audio &&
+         !other.is_offered() && offered.name == other.name && offered.is_of_sink() != other.is_of_sink() &&
+         std::find(std::begin(covered), std::end(covered), other.decision.reason) != std::end(covered);
+}
+
+/// One row for a format that is offered of one side and left out of the other. The order of the rows changes.
+void merge_audio(std::vector<row_t> &rows) {
+  const auto is_left_out = [](const row_t &row) { return row.section == section_t::audio && !row.is_offered(); };
+  const auto first_left_out = std::stable_partition(rows.begin(), rows.end(), std::not_fn(is_left_out));
+  std::vector<row_t> others(std::make_move_iterator(first_left_out), std::make_move_iterator(rows.end()));
+  rows.erase(first_left_out, rows.end());
+  for (row_t &other : others) {
+    const auto offered =
+        std::find_if(rows.begin(), rows.end(), [&other](const row_t &row) { return is_same_format(row, other); });
+    if (offered == rows.end()) {
+      rows.push_back(std::move(other));
+      continue;
+    }
+    offered->sentence += other.is_of_sink() ? " The sink has it too." : " The platform has it too.";
+    offered->sources.insert(offered->sources.end(), other.sources.begin(), other.sources.end());
+    offered->merged.push_back(std::move(other));
+  }
+}
+
+/// One row for all that was taken for timings.
+void merge_unread_blocks(std::vector<row_t> &rows, const sink_reading_t &reading) {
+  const auto is_unread = [&reading](const row_t &row) { return is_of_unread_block(row.decision, reading); };
+  const auto first = std::find_if(rows.begin(), rows.end(), is_unread);
+  if (first == rows.end()) {
+    return;
+  }
+  for (auto other = std::next(first); other != rows.end(); ++other) {
+    if (is_unread(*other)) {
+      first->merged.push_back(*other);
+    }
+  }
+  rows.erase(std::remove_if(std::next(first), rows.end(), is_unread), rows.end());
+}
+
 }  // namespace
+
+bool row_t::is_of_sink() const {
+  return (decision.origins & sink_origins) != 0;
+}
 
 std::vector<std::string> warnings_of(const std::vector<row_t> &rows) {
   constexpr u32 warned_of[] = {COMPOSE_REASON_TOO_FEW_MODES, COMPOSE_REASON_ROOM_EXCEEDED,
@@ -160,9 +149,10 @@ std::string source_text(const row_t &row) {
 std::vector<row_t> rows_of(const explained_t &explained) {
   std::vector<row_t> rows;
   for (const compose_decision_t &decision : explained.composition.decisions) {
-    rows.push_back({section_of(decision.subject), decision, name_of(decision, explained),
-                    reason_sentence(decision, explained), sources_of(decision, explained)});
+    rows.push_back(row_of(decision, explained));
   }
+  merge_audio(rows);
+  merge_unread_blocks(rows, explained.reading);
   std::stable_sort(rows.begin(), rows.end(),
                    [](const row_t &left, const row_t &right) { return order_of(left) < order_of(right); });
   return rows;

@@ -10,15 +10,20 @@
 namespace edid_cli {
 
 enum class section_t { video, mode_4k, audio, derived };
+inline constexpr section_t sections[] = {section_t::video, section_t::mode_4k, section_t::audio, section_t::derived};
 
 struct row_t {
-  section_t section;
-  compose_decision_t decision;
+  section_t section{};
+  compose_decision_t decision{};
   std::string name;
   std::string sentence;
+  bool rests_on_unread = false;  ///< On a part of the sink's EDID that was not read.
   std::vector<source_t> sources;
+  std::vector<row_t> merged{};  ///< Decisions that are told on this row, as of the sink's format like an offered one.
 
   bool is_offered() const { return decision.verdict != COMPOSE_VERDICT_LEFT_OUT; }
+  /// Whether the sink has it, whatever became of it.
+  bool is_of_sink() const;
 };
 
 /// What is wrong with the new EDID as a whole.

@@ -3,6 +3,7 @@
 #include <string_view>
 
 #include "edid_text/physical_address_text.h"
+#include "explain/decision_names.h"
 #include "explain/mode_names.h"
 #include "explain/reason_table.h"
 #include "text/hexadecimal.h"
@@ -54,6 +55,10 @@ class gathering_t {
   bool names(u32 origin) const { return (decision_.origins & origin) != 0; }
 
   void add_sink() {
+    if (is_of_unread_block(decision_, explained_.reading)) {
+      sources_.push_back({source_kind_t::sink, "sink: bytes after block 1"});
+      return;
+    }
     std::string text;
     for (const sink_origin_t &row : sink_origins) {
       if (names(row.origin)) {

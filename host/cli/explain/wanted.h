@@ -1,6 +1,7 @@
-// What is asked about: a mode or a format.
+// What is asked about: a mode, a format, or what an EDID may declare besides.
 #pragma once
 
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -8,14 +9,17 @@
 
 namespace edid_cli {
 
-/// One thing that may be wanted: a video mode by its VIC, a 4Kx2K mode by its HDMI_VIC, or an audio type.
 struct wanted_t {
-  compose_subject subject;
-  u32 code;
+  compose_subject subject;  ///< Video mode, 4Kx2K mode, audio format, deep colour or 3D.
+  u32 code;                 ///< As of a decision: VIC, HDMI_VIC, audio type, bits per pixel; 1 for 3D.
+  u32 channels = 0;         ///< Of an audio format: the fewest; 0: any number.
 };
 
-/// "16", "1920x1080p60", "4k:1", "audio:2" or "ac3". More than one where modes differ in their aspect ratio only.
-/// Throws bad_input_t.
+/// "16", "vic 95", "1080p60", "1920x1080p60", "4k30", "4k:1", "ac3", "pcm8", "audio:2", "3d", "deep-color". More than
+/// one where modes differ in their aspect ratio only. Throws bad_input_t.
 std::vector<wanted_t> parse_wanted(std::string_view text);
+
+/// "1920x1080p60 16:9 (VIC 16)".
+std::string wanted_name(const wanted_t &wanted);
 
 }  // namespace edid_cli

@@ -6,7 +6,7 @@
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
-#include <string>
+#include <memory>
 
 #include "io/bad_input.h"
 
@@ -42,6 +42,24 @@ standard_output_redirect_t::~standard_output_redirect_t() {
 }
 
 discarded_output_t::discarded_output_t() : nowhere_(open_null_device()), redirect_(nowhere_.get()) {}
+
+std::string printed_by(const std::function<void()> &print) {
+  const std::unique_ptr<std::FILE, int (*)(std::FILE *)> file(std::tmpfile(), std::fclose);
+  if (file == nullptr) {
+    throw bad_input_t(std::string("temporary file: ") + std::strerror(errno));
+  }
+  {
+    const standard_output_redirect_t redirect(fileno(file.get()));
+    print();
+  }
+  std::rewind(file.get());
+  std::string text;
+  char chunk[4096];
+  for (std::size_t size = 0; (size = std::fread(chunk, 1, sizeof chunk, file.get())) != 0;) {
+    text.append(chunk, size);
+  }
+  return text;
+}
 
 void flush_standard_output() {
   if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {

@@ -1,6 +1,9 @@
 // Where the library's output goes: it prints on C's standard output.
 #pragma once
 
+#include <functional>
+#include <string>
+
 #include "io/file_descriptor.h"
 
 namespace edid_cli {
@@ -28,6 +31,9 @@ class discarded_output_t {
   file_descriptor_t nowhere_;
   standard_output_redirect_t redirect_;
 };
+
+/// What is printed on standard output while a function runs. Throws bad_input_t where there is no room for it.
+std::string printed_by(const std::function<void()> &print);
 
 /// Writes out what is buffered. Throws bad_input_t when any of the output could not be written.
 void flush_standard_output();

@@ -1,19 +1,16 @@
 // Texts from outside on their way to a terminal.
 #pragma once
 
-#include <algorithm>
 #include <string>
 #include <string_view>
 
 namespace edid_cli {
 
-/// With a question mark for each control character: these would break a line, or mean something to a terminal.
-inline std::string printable(std::string_view text) {
-  std::string result(text);
-  std::replace_if(
-      result.begin(), result.end(),
-      [](char character) { return static_cast<unsigned char>(character) < 0x20 || character == 0x7F; }, '?');
-  return result;
-}
+/// With a question mark for each control character: these would break a line, or mean something to a terminal. That
+/// holds for U+0080 to U+009F as well, which some terminals obey, and for bytes that are no UTF-8.
+std::string printable(std::string_view text);
+
+/// The same for a text of several lines: tabs and the ends of lines stay.
+std::string printable_lines(std::string_view text);
 
 }  // namespace edid_cli

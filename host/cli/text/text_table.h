@@ -1,6 +1,8 @@
 // Tables of text on standard output.
 #pragma once
 
+#include <cstddef>
+#include <limits>
 #include <string>
 #include <vector>
 
@@ -10,13 +12,17 @@ namespace edid_cli {
 class text_table_t {
  public:
   using row_t = std::vector<std::string>;
+  static constexpr std::size_t any_width = std::numeric_limits<std::size_t>::max();
 
   void add(row_t row);
   bool empty() const { return rows_.empty(); }
-  /// The whole table, a line each row, without blanks at their ends.
-  std::string text() const;
+  /// The whole table, without blanks at the ends of lines. In a table wider than @p most_columns the last cells go on
+  /// in further lines, broken between words.
+  std::string text(std::size_t most_columns = any_width) const;
 
  private:
+  std::vector<std::size_t> widths() const;
+
   std::vector<row_t> rows_;
 };
 

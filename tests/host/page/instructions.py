@@ -1,46 +1,25 @@
-"""Does what "explain --want" tells to do, to the letter: in a platform's text and in a command line."""
+"""Does what "explain --want" says has to be done: in a platform's text and in a command line. Steps are data."""
 
 import re
+
+DOMAIN = "platform.software.drivers.vorex.edid"
 
 
 class NotUnderstood(Exception):
     pass
 
 
-def _add_to_list(lines, line, entry):
-    """Behind the last entry of the list whose key stands in a line, counted from 1."""
-    index = line - 1
-    while "]" not in lines[index].partition("#")[0]:
-        index += 1
-    before, _, behind = lines[index].rpartition("]")
-    comma = ", " if before.strip() and not before.rstrip().endswith(("[", ",")) else ""
-    lines[index] = f"{before}{comma}{entry}]{behind}"
+def _table(key):
+    return f"[{DOMAIN}.audio]" if key.startswith("audio.") else f"[{DOMAIN}]"
 
 
-def _add_to_table(lines, assignment, table):
-    lines.insert(lines.index(f"[{table}]") + 1, assignment)
+def _own_name(key):
+    return key.rpartition(".")[2]
 
 
-def _take_out(lines, line, text):
-    before = lines[line - 1]
-    lines[line - 1] = re.sub(rf'(?:"{re.escape(text)}"|\b{re.escape(text)}\s*=.*),?', "", before, count=1)
-    if lines[line - 1] == before:
-        raise NotUnderstood(f"{text} does not stand in line {line}: {before}")
-
-
-def _replace(lines, line, old, new):
-    before = lines[line - 1]
-    position = re.search(rf"\b{re.escape(old)}\b", before[::-1]) or re.search(rf"\b{re.escape(old)}\b", before)
-    if position is None:
-        raise NotUnderstood(f"{old} does not stand in line {line}: {before}")
-    begin = before.rindex(old)
-    lines[line - 1] = before[:begin] + new + before[begin + len(old) :]
-
-
-def _set(lines, line, key, value):
-    if not lines[line - 1].startswith(key.rpartition(".")[2]):
-        raise NotUnderstood(f"{key} does not stand in line {line}: {lines[line - 1]}")
-    lines[line - 1] = f"{key.rpartition('.')[2]} = {value}"
+def _entry(value):
+    """A list's entry as it stands in a line; numbers may be written in other ways."""
+    return re.escape(value) if value.startswith('"') else rf"\b{value}\b"
 
 
 class Instructions:
@@ -56,30 +35,65 @@ class Instructions:
     def follow(self, steps):
         """Steps as the JSON document has them. Those further down come first: lines keep their numbers."""
         for step in sorted(steps, key=lambda step: step.get("line", 0), reverse=True):
-            self._follow(step["text"])
+            action = getattr(self, "_" + step["action"].replace(" ", "_"), None)
+            if action is None:
+                raise NotUnderstood(step["action"])
+            action(step)
 
-    def _follow(self, text):
-        place = r"[\w. ]+:(\d+)"
-        for pattern, do in (
-            (rf"add (\S+) to \w+ \({place}\)", lambda entry, line: _add_to_list(self.lines, int(line), entry)),
-            (rf"set ([\w.]+) = (\S+) \({place}\)", lambda key, value, line: _set(self.lines, int(line), key, value)),
-            (rf"add audio\.(\w+ = 0x\w+) \(.*\) behind {place}",
-             lambda entry, line: self.lines.insert(int(line), entry)),
-            (rf'take "([^"]+)" out of \w+ \({place}\)', lambda entry, line: _take_out(self.lines, int(line), entry)),
-            (rf"take audio\.(\w+) out \({place}\)", lambda key, line: _take_out(self.lines, int(line), key)),
-            (rf"write (\S+) in place of (\S+) in \w+ \({place}\)",
-             lambda new, old, line: _replace(self.lines, int(line), old, new)),
-            (r"add (\w+ = \S+) to the table (\S+) of", lambda entry, table: _add_to_table(self.lines, entry, table)),
-            (r"give (--\S+) (\w+)", self._give),
-            (r"leave (--\S+) away", self.arguments.remove),
-        ):
-            if found := re.match(pattern, text):
-                do(*found.groups())
-                return
-        raise NotUnderstood(text)
+    def _add_to_list(self, step):
+        """Behind the last entry of the list whose key stands in a line, counted from 1."""
+        if "line" not in step:
+            self._add_key(step["key"], f"[{step['value']}]")
+            return
+        index = step["line"] - 1
+        while "]" not in self.lines[index].partition("#")[0]:
+            index += 1
+        before, _, behind = self.lines[index].rpartition("]")
+        comma = ", " if before.strip() and not before.rstrip().endswith(("[", ",")) else ""
+        self.lines[index] = f"{before}{comma}{step['value']}]{behind}"
 
-    def _give(self, option, value):
-        if option in self.arguments:
-            position = self.arguments.index(option)
+    def _last_entry(self, step, value):
+        found = list(re.finditer(_entry(value) + ",?", self.lines[step["line"] - 1].partition("#")[0]))
+        if not found:
+            raise NotUnderstood(f"{value} does not stand in line {step['line']}: {self.lines[step['line'] - 1]}")
+        return found[-1].span()
+
+    def _take_out_of_list(self, step):
+        begin, end = self._last_entry(step, step["value"])
+        line = self.lines[step["line"] - 1]
+        self.lines[step["line"] - 1] = line[:begin] + line[end:]
+
+    def _replace_in_list(self, step):
+        begin, end = self._last_entry(step, step["old_value"])
+        line = self.lines[step["line"] - 1]
+        self.lines[step["line"] - 1] = f"{line[:begin]}{step['value']},{line[end:]}"
+
+    def _set(self, step):
+        if "line" in step:
+            self._check(step)
+            self.lines[step["line"] - 1] = f"{_own_name(step['key'])} = {step['value']}"
+        else:
+            self._add_key(step["key"], step["value"])
+
+    def _take_out(self, step):
+        self._check(step)
+        self.lines[step["line"] - 1] = ""
+
+    def _check(self, step):
+        line = self.lines[step["line"] - 1]
+        if not line.startswith(_own_name(step["key"])):
+            raise NotUnderstood(f"{step['key']} does not stand in line {step['line']}: {line}")
+
+    def _add_key(self, key, value):
+        if _table(key) not in self.lines:
+            self.lines.append(_table(key))
+        self.lines.insert(self.lines.index(_table(key)) + 1, f"{_own_name(key)} = {value}")
+
+    def _give_option(self, step):
+        if step["key"] in self.arguments:
+            position = self.arguments.index(step["key"])
             del self.arguments[position : position + 2]
-        self.arguments += [option, value]
+        self.arguments += [step["key"], step["value"]]
+
+    def _drop_option(self, step):
+        self.arguments.remove(step["key"])

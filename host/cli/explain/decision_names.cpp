@@ -1,0 +1,139 @@
+#include "explain/decision_names.h"
+
+#include <cstdlib>
+#include <iterator>
+#include <optional>
+
+#include "edid_text/physical_address_text.h"
+#include "explain/mode_names.h"
+#include "explain/reason_texts.h"
+
+namespace edid_cli {
+namespace {
+
+constexpr const char *latency_names[] = {"video latency", "audio latency", "interlaced video latency",
+                                         "interlaced audio latency"};
+
+/// The descriptor that an audio decision is about, as its first source has it.
+std::optional<short_audio_desc_t> audio_of(const compose_decision_t &decision, const explained_t &explained) {
+  if ((decision.origins & COMPOSE_ORIGIN_PLATFORM_AUDIO) != 0) {
+    const list_entry_t *const entry = explained.places.entry(platform_list::audio, decision.priority_index);
+    const auto value = entry != nullptr ? static_cast<u32>(std::strtol(entry->text.c_str(), nullptr, 10)) : 0U;
+    short_audio_desc_t format{};
+    if ((value >> 3 & 15U) != 0 && decode_edid_short_audio(static_cast<u8>(value), static_cast<u8>(value >> 8),
+                                                           static_cast<u8>(value >> 16), &format) != 0) {
+      return format;
+    }
+    return std::nullopt;
+  }
+  i32 place = decision.sink_index;
+  for (const ll_entry_t *entry = explained.sink.audio_list.head; entry != nullptr; entry = entry->next) {
+    if (place-- == 0) {
+      return *static_cast<const short_audio_desc_t *>(entry->data);
+    }
+  }
+  return std::nullopt;
+}
+
+std::string audio_name(const compose_decision_t &decision, const explained_t &explained) {
+  const auto format = audio_of(decision, explained);
+  if (format) {
+    return audio_type_name(decision.code) + ", " + channels_name(format->channels);
+  }
+  const bool is_basic = decision.reason == COMPOSE_REASON_BASIC_AUDIO;
+  return audio_type_name(decision.code) + (is_basic ? ", " + channels_name(static_cast<u32>(decision.value[0])) : "");
+}
+
+/// The lines of a standard timing, which has only its width and aspect ratio: EDID 1.3, section 3.9, where code 0 is
+/// 16:10. (In EDIDs before 1.3, which the library doesn't read, it is 1:1.)
+i32 standard_timing_lines(u32 width, u32 aspect_ratio) {
+  struct ratio_t {
+    u32 width;
+    u32 lines;
+  };
+  constexpr ratio_t ratios[] = {{16, 10}, {4, 3}, {5, 4}, {16, 9}};
+  const ratio_t &ratio = ratios[aspect_ratio & 3U];
+  return static_cast<i32>(width * ratio.lines / ratio.width);
+}
+
+std::string sink_timing_name(const compose_decision_t &decision, const explained_t &explained) {
+  const i32(&value)[4] = decision.value;
+  if ((decision.origins & COMPOSE_ORIGIN_DETAILED_TIMING) != 0) {
+    // One without lines is none; it is named all the same, so that it can be found.
+    return value[1] == 0 ? std::to_string(value[0]) + "x0" : raster_name(value[0], value[1], value[2], value[3] != 0);
+  }
+  i32 place = decision.sink_index;
+  for (const ll_entry_t *entry = explained.sink.std_timings.head; entry != nullptr; entry = entry->next) {
+    if (place-- == 0) {
+      const auto &timing = *static_cast<const std_timing_t *>(entry->data);
+      return raster_name(value[0], standard_timing_lines(timing.h_active, timing.aspect_ratio), value[2], false);
+    }
+  }
+  return raster_name(value[0], value[1], value[2], value[3] != 0);
+}
+
+/// "block 2 (DisplayID extension), block 3 (...)".
+std::string unread_blocks(const sink_reading_t &reading) {
+  std::string text;
+  for (const sink_block_t &block : reading.blocks) {
+    if (block.number > 1) {
+      text += (text.empty() ? "block " : ", block ") + std::to_string(block.number) + " (" + block.kind + ")";
+    }
+  }
+  return text;
+}
+
+std::string derived_name(const compose_decision_t &decision) {
+  const std::string code = std::to_string(decision.code);
+  switch (decision.subject) {
+    case COMPOSE_SUBJECT_NATIVE_RATE:
+      return "refresh family " + code + " Hz";
+    case COMPOSE_SUBJECT_GEOMETRY_LIMIT:
+      return decision.reason == COMPOSE_REASON_GEOMETRY_UNLIMITED ? "height limit: none"
+                                                                  : "height limit " + code + " lines";
+    case COMPOSE_SUBJECT_CURRENT_MODE:
+      return decision.code == 0 ? "current mode" : "current mode " + short_mode_name(decision.code);
+    case COMPOSE_SUBJECT_PHYSICAL_ADDRESS:
+      return decision.verdict == COMPOSE_VERDICT_LEFT_OUT ? "physical address: none"
+                                                          : "physical address " + physical_address_text(decision.code);
+    case COMPOSE_SUBJECT_DEEP_COLOR:
+      return "deep colour, " + code + " bits";
+    case COMPOSE_SUBJECT_TMDS_CLOCK:
+      return decision.code == 0 ? "TMDS clock: not declared" : "TMDS clock " + code + " MHz";
+    case COMPOSE_SUBJECT_LATENCY:
+      return decision.code < std::size(latency_names) ? latency_names[decision.code] : "latency " + code;
+    case COMPOSE_SUBJECT_3D:
+      return decision.code != 0 ? "3D" : "3D: none";
+    case COMPOSE_SUBJECT_PADDING:
+      return "padding: " + code + (decision.code == 1 ? " mode" : " modes");
+    case COMPOSE_SUBJECT_EXTENSION_ROOM:
+      return "extension: " + code + " bytes";
+    default:
+      return std::string(compose_subject_string(decision.subject)) + " " + code;
+  }
+}
+
+}  // namespace
+
+bool is_of_unread_block(const compose_decision_t &decision, const sink_reading_t &reading) {
+  return decision.subject == COMPOSE_SUBJECT_SINK_TIMING && (decision.origins & COMPOSE_ORIGIN_DETAILED_TIMING) != 0 &&
+         decision.sink_index >= 0 && static_cast<std::size_t>(decision.sink_index) >= reading.detailed_timings;
+}
+
+std::string decision_name(const compose_decision_t &decision, const explained_t &explained) {
+  switch (decision.subject) {
+    case COMPOSE_SUBJECT_VIDEO_MODE:
+      return video_mode_name(sink_vic(decision, explained.reading));
+    case COMPOSE_SUBJECT_SINK_TIMING:
+      return is_of_unread_block(decision, explained.reading) ? "bytes of " + unread_blocks(explained.reading)
+                                                             : sink_timing_name(decision, explained);
+    case COMPOSE_SUBJECT_4K_MODE:
+      return mode_4k_name(decision.code);
+    case COMPOSE_SUBJECT_AUDIO_FORMAT:
+      return audio_name(decision, explained);
+    default:
+      return derived_name(decision);
+  }
+}
+
+}  // namespace edid_cli
