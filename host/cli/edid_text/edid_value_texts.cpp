@@ -5,6 +5,9 @@
 #include <iterator>
 #include <string_view>
 
+#include "edid_text/mode_names.h"
+#include "edid_text/speaker_names.h"
+
 namespace edid_cli {
 namespace {
 
@@ -31,12 +34,6 @@ constexpr bit_name_t stereo_names[] = {
     {STEREO_L_DEPTH, "LD"},           {STEREO_L_DEPTH_GRAPHICS, "LDGD"},
 };
 
-/// Speaker allocation, CEA-861, section 7.5.3.
-constexpr bit_name_t speaker_names[] = {
-    {0x001, "FL/FR"},   {0x002, "LFE"},     {0x004, "FC"},      {0x008, "RL/RR"}, {0x010, "RC"},  {0x020, "FLC/FRC"},
-    {0x040, "RLC/RRC"}, {0x080, "FLW/FRW"}, {0x100, "FLH/FRH"}, {0x200, "TC"},    {0x400, "FCH"},
-};
-
 /// The names of the bits that are set, with a blank before each.
 template <std::size_t size>
 std::string names_of(u32 bits, const bit_name_t (&names)[size]) {
@@ -52,8 +49,8 @@ std::string without_blanks_at_end(const std::string &text) {
 }
 
 std::string standard_timing_text(const std_timing_t &timing) {
-  return std::to_string(timing.h_active) + " wide, " + std_aspect_string(timing.aspect_ratio) + ", " +
-         std::to_string(timing.refresh_rate) + " Hz";
+  return std::to_string(timing.h_active) + "x" + std::to_string(standard_timing_lines(timing)) + "p" +
+         std::to_string(timing.refresh_rate);
 }
 
 std::string detailed_timing_text(const detailed_timing_t &timing) {
@@ -72,8 +69,9 @@ std::string detailed_timing_text(const detailed_timing_t &timing) {
 }
 
 std::string video_mode_text(const short_video_desc_t &mode) {
-  return std::to_string(mode.vic) + " " + without_blanks_at_end(short_video_timing_string(mode.vic)) +
-         (mode.native != 0 ? " native" : "") + names_of(mode.stereo, stereo_names);
+  const u32 vic = vic_of(mode);
+  const bool is_native = mode.native != 0 && vic == mode.vic;
+  return video_mode_name(vic) + (is_native ? " native" : "") + names_of(mode.stereo, stereo_names);
 }
 
 }  // namespace
@@ -100,6 +98,16 @@ std::string audio_format_text(const short_audio_desc_t &format) {
   return text;
 }
 
+u32 standard_timing_lines(const std_timing_t &timing) {
+  struct ratio_t {
+    u32 width;
+    u32 lines;
+  };
+  constexpr ratio_t ratios[] = {{16, 10}, {4, 3}, {5, 4}, {16, 9}};
+  const ratio_t &ratio = ratios[timing.aspect_ratio & 3U];
+  return timing.h_active * ratio.lines / ratio.width;
+}
+
 std::string version_text(const edid_t &edid) {
   return std::to_string(edid.version) + "." + std::to_string(edid.revision);
 }
@@ -112,8 +120,11 @@ std::string gamma_text(const edid_t &edid) {
 
 std::string speaker_text(const edid_t &edid) {
   const u32 speakers = edid.speaker[0] | static_cast<u32>(edid.speaker[1]) << 8;
-  const std::string names = names_of(speakers, speaker_names);
-  return names.empty() ? "-" : names.substr(1);
+  std::string names;
+  for (const speaker_name_t &speaker : speaker_names) {
+    names += (speakers & speaker.bit) == 0 ? "" : (names.empty() ? "" : " ") + std::string(speaker.abbreviation);
+  }
+  return names.empty() ? "-" : names;
 }
 
 texts_t standard_timing_texts(const edid_t &edid) {

@@ -8,6 +8,10 @@
 
 namespace edid_cli {
 
+/// A standard timing holds its width and an aspect ratio (EDID 1.3, section 3.9), whose code 0 is 16:10. (In EDIDs
+/// before 1.3, which the library doesn't read, it is 1:1.)
+u32 standard_timing_lines(const std_timing_t &timing);
+
 std::string version_text(const edid_t &edid);
 std::string gamma_text(const edid_t &edid);
 /// "AC3, 6 channels, 32kHz 44.1kHz 48kHz, 640 kbit/s".

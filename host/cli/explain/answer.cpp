@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "explain/mode_names.h"
+#include "edid_text/mode_names.h"
 #include "explain/offer.h"
 #include "explain/reason_texts.h"
 #include "explain/way.h"
@@ -33,7 +33,7 @@ std::string why_never(const wanted_t &wanted) {
 std::vector<compose_decision_t> decisions_about(const wanted_t &wanted, const explained_t &explained) {
   std::vector<compose_decision_t> decisions;
   for (const compose_decision_t &decision : explained.composition.decisions) {
-    const bool is_same = wanted.subject == COMPOSE_SUBJECT_3D || sink_vic(decision, explained.reading) == wanted.code;
+    const bool is_same = wanted.subject == COMPOSE_SUBJECT_3D || sink_vic(decision, explained) == wanted.code;
     if (decision.subject == static_cast<u32>(wanted.subject) && is_same) {
       decisions.push_back(decision);
     }

@@ -1,5 +1,6 @@
 #include "explain/base_block_bytes.h"
 
+#include "edid_text/edid_value_texts.h"
 #include "explain/descriptor_bytes.h"
 #include "text/hexadecimal.h"
 
@@ -53,18 +54,11 @@ std::string timing_names(const field_place_t &place) {
 }
 
 std::string standard_timing(const field_place_t &place) {
-  struct ratio_t {
-    unsigned width;
-    unsigned height;
-  };
-  // EDID 1.3 reads code 0 as 16:10; here it is the older 1:1.
-  constexpr ratio_t ratios[] = {{1, 1}, {4, 3}, {5, 4}, {16, 9}};
   if (place.here(0) == 1 && place.here(1) == 1) {
     return "unused";
   }
-  const ratio_t ratio = ratios[place.here(1) >> 6];
-  const unsigned width = (place.here(0) + 31) * 8;
-  return field_text("%ux%u, %u Hz", width, width * ratio.height / ratio.width, (place.here(1) & 0x3FU) + 60);
+  const std_timing_t timing{(place.here(0) + 31) * 8, place.here(1) >> 6, (place.here(1) & 0x3FU) + 60};
+  return field_text("%ux%u, %u Hz", timing.h_active, standard_timing_lines(timing), timing.refresh_rate);
 }
 
 constexpr field_row_t identity_rows[] = {
@@ -79,7 +73,7 @@ constexpr field_row_t identity_rows[] = {
 };
 
 std::string low_bits(const field_place_t &) {
-  return "two low bits of each coordinate, see the bytes behind";
+  return "two low bits of each coordinate, see the bytes after them";
 }
 
 constexpr field_row_t display_rows[] = {

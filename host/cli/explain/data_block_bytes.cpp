@@ -2,23 +2,13 @@
 
 #include <algorithm>
 
+#include "edid_text/mode_names.h"
+#include "edid_text/speaker_names.h"
 #include "explain/hdmi_bytes.h"
-#include "explain/mode_names.h"
 
 namespace edid_cli {
 namespace {
 
-constexpr field_bit_t speaker_bits[] = {{0x001, "front left and right"},
-                                        {0x002, "LFE"},
-                                        {0x004, "front centre"},
-                                        {0x008, "rear left and right"},
-                                        {0x010, "rear centre"},
-                                        {0x020, "front left and right of centre"},
-                                        {0x040, "rear left and right of centre"},
-                                        {0x080, "front wide"},
-                                        {0x100, "front high"},
-                                        {0x200, "top centre"},
-                                        {0x400, "front centre high"}};
 constexpr field_bit_t colorimetry_bits[] = {{0x01, "xvYCC601"}, {0x02, "xvYCC709"}};
 constexpr field_bit_t metadata_bits[] = {{0x01, "MD0"}, {0x02, "MD1"}, {0x04, "MD2"}, {0x08, "MD3"}};
 constexpr field_bit_t rate_bits[] = {{0x01, "32 kHz"}, {0x02, "44.1 kHz"},  {0x04, "48 kHz"}, {0x08, "88.2 kHz"},
@@ -63,7 +53,12 @@ void name_video(byte_naming_t &naming, std::size_t end) {
 }
 
 void name_speakers(byte_naming_t &naming, std::size_t) {
-  naming.name(byte_block_t::speakers, 3, "Speakers", set_bit_names(naming.next() | naming.next(1) << 8, speaker_bits));
+  const unsigned speakers = naming.next() | naming.next(1) << 8;
+  std::string names;
+  for (const speaker_name_t &speaker : speaker_names) {
+    names += (speakers & speaker.bit) == 0 ? "" : (names.empty() ? "" : ", ") + std::string(speaker.name);
+  }
+  naming.name(byte_block_t::speakers, 3, "Speakers", names.empty() ? "none" : names);
 }
 
 void name_vendor(byte_naming_t &naming, std::size_t end) {

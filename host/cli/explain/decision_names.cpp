@@ -4,8 +4,9 @@
 #include <iterator>
 #include <optional>
 
+#include "edid_text/edid_value_texts.h"
+#include "edid_text/mode_names.h"
 #include "edid_text/physical_address_text.h"
-#include "explain/mode_names.h"
 #include "explain/reason_texts.h"
 
 namespace edid_cli {
@@ -44,18 +45,6 @@ std::string audio_name(const compose_decision_t &decision, const explained_t &ex
   return audio_type_name(decision.code) + (is_basic ? ", " + channels_name(static_cast<u32>(decision.value[0])) : "");
 }
 
-/// The lines of a standard timing, which has only its width and aspect ratio: EDID 1.3, section 3.9, where code 0 is
-/// 16:10. (In EDIDs before 1.3, which the library doesn't read, it is 1:1.)
-i32 standard_timing_lines(u32 width, u32 aspect_ratio) {
-  struct ratio_t {
-    u32 width;
-    u32 lines;
-  };
-  constexpr ratio_t ratios[] = {{16, 10}, {4, 3}, {5, 4}, {16, 9}};
-  const ratio_t &ratio = ratios[aspect_ratio & 3U];
-  return static_cast<i32>(width * ratio.lines / ratio.width);
-}
-
 std::string sink_timing_name(const compose_decision_t &decision, const explained_t &explained) {
   const i32(&value)[4] = decision.value;
   if ((decision.origins & COMPOSE_ORIGIN_DETAILED_TIMING) != 0) {
@@ -66,7 +55,7 @@ std::string sink_timing_name(const compose_decision_t &decision, const explained
   for (const ll_entry_t *entry = explained.sink.std_timings.head; entry != nullptr; entry = entry->next) {
     if (place-- == 0) {
       const auto &timing = *static_cast<const std_timing_t *>(entry->data);
-      return raster_name(value[0], standard_timing_lines(timing.h_active, timing.aspect_ratio), value[2], false);
+      return raster_name(value[0], static_cast<i32>(standard_timing_lines(timing)), value[2], false);
     }
   }
   return raster_name(value[0], value[1], value[2], value[3] != 0);
@@ -123,7 +112,7 @@ bool is_of_unread_block(const compose_decision_t &decision, const sink_reading_t
 std::string decision_name(const compose_decision_t &decision, const explained_t &explained) {
   switch (decision.subject) {
     case COMPOSE_SUBJECT_VIDEO_MODE:
-      return video_mode_name(sink_vic(decision, explained.reading));
+      return video_mode_name(sink_vic(decision, explained));
     case COMPOSE_SUBJECT_SINK_TIMING:
       return is_of_unread_block(decision, explained.reading) ? "bytes of " + unread_blocks(explained.reading)
                                                              : sink_timing_name(decision, explained);

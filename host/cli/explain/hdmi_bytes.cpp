@@ -2,8 +2,8 @@
 
 #include <algorithm>
 
+#include "edid_text/mode_names.h"
 #include "edid_text/physical_address_text.h"
-#include "explain/mode_names.h"
 
 namespace edid_cli {
 namespace {

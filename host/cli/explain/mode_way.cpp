@@ -1,7 +1,7 @@
 // The steps that bring a video mode or a 4Kx2K mode into the new EDID, or one of the settings.
 #include <algorithm>
 
-#include "explain/mode_names.h"
+#include "edid_text/mode_names.h"
 #include "explain/way.h"
 #include "platform/platform_places.h"
 

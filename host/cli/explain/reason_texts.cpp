@@ -2,8 +2,8 @@
 
 #include <cstdio>
 
+#include "edid_text/mode_names.h"
 #include "edid_text/physical_address_text.h"
-#include "explain/mode_names.h"
 #include "explain/reason_table.h"
 #include "text/hexadecimal.h"
 
@@ -138,7 +138,7 @@ std::string resolved(std::string_view place, const compose_decision_t &decision,
 /// The library reads a short video descriptor as one of VIC 1 to 127 with a native bit; CTA-861-F made the bytes from
 /// 193 on VICs of their own.
 std::string above_last_vic(const compose_decision_t &decision, const explained_t &explained) {
-  const u32 vic = sink_vic(decision, explained.reading);
+  const u32 vic = sink_vic(decision, explained);
   const std::string read_as =
       vic == decision.code ? "" : " It takes this one for VIC " + std::to_string(decision.code) + ".";
   const u32 hdmi_vic = hdmi_vic_of_vic(vic);
@@ -148,12 +148,15 @@ std::string above_last_vic(const compose_decision_t &decision, const explained_t
 
 }  // namespace
 
-u32 sink_vic(const compose_decision_t &decision, const sink_reading_t &reading) {
-  constexpr u8 first_without_native_bit = 193;
-  const auto place = static_cast<std::size_t>(decision.sink_index);
-  const bool is_there = decision.sink_index >= 0 && place < reading.short_video.size();
-  const u8 byte = is_there ? reading.short_video[place] : u8{0};
-  return decision.code > last_library_vic && byte >= first_without_native_bit ? byte : decision.code;
+u32 sink_vic(const compose_decision_t &decision, const explained_t &explained) {
+  i32 place = decision.sink_index;
+  const bool is_above = decision.subject == COMPOSE_SUBJECT_VIDEO_MODE && decision.code > last_library_vic;
+  for (const ll_entry_t *entry = explained.sink.video_list.head; is_above && entry != nullptr; entry = entry->next) {
+    if (place-- == 0) {
+      return vic_of(*static_cast<const short_video_desc_t *>(entry->data));
+    }
+  }
+  return decision.code;
 }
 
 bool rests_on_unread(const compose_decision_t &decision, const explained_t &explained) {

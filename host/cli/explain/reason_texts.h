@@ -14,6 +14,6 @@ std::string reason_sentence(const compose_decision_t &decision, const explained_
 bool rests_on_unread(const compose_decision_t &decision, const explained_t &explained);
 
 /// The VIC that the sink means: not always the one that the library reads.
-u32 sink_vic(const compose_decision_t &decision, const sink_reading_t &reading);
+u32 sink_vic(const compose_decision_t &decision, const explained_t &explained);
 
 }  // namespace edid_cli

@@ -18,7 +18,6 @@ constexpr std::size_t first_data_block = 4;
 constexpr std::size_t checksum_offset = edid_block_size - 1;
 constexpr u8 cta_tag = 0x02;
 constexpr unsigned audio_tag = 1;
-constexpr unsigned video_tag = 2;
 /// Where the detailed timings may begin at most for this library.
 constexpr unsigned last_timings_offset = 110;
 
@@ -256,7 +255,6 @@ sink_reading_t sink_reading(const std::vector<u8> &sink, const compose_result_t 
   reading.detailed_timings = reading.base_timings;
   if (is_extension_read(result)) {
     reading.detailed_timings += timings_of_extension(bytes);
-    reading.short_video = payloads(bytes, video_tag);
     reading.short_audio = short_audio_descriptors(payloads(bytes, audio_tag));
   }
   return reading;

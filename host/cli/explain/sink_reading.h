@@ -28,8 +28,6 @@ struct sink_reading_t {
   std::size_t detailed_timings = 0;
   /// The same of the base block alone.
   std::size_t base_timings = 0;
-  /// The bytes of block 1's short video descriptors, in order.
-  std::vector<u8> short_video;
   /// Block 1's short audio descriptors, in order, byte 1 lowest.
   std::vector<u32> short_audio;
 

@@ -2,9 +2,9 @@
 
 #include <string_view>
 
+#include "edid_text/mode_names.h"
 #include "edid_text/physical_address_text.h"
 #include "explain/decision_names.h"
-#include "explain/mode_names.h"
 #include "explain/reason_table.h"
 #include "text/hexadecimal.h"
 

@@ -4,7 +4,7 @@
 #include <cstdint>
 #include <map>
 
-#include "explain/mode_names.h"
+#include "edid_text/mode_names.h"
 #include "explain/reason_texts.h"
 
 namespace edid_cli {
@@ -17,11 +17,11 @@ bool is_mode(const row_t &row) {
 }
 
 /// Pixels a second; 0 for what is no mode.
-std::uint64_t pixel_rate(const row_t &row, const sink_reading_t &reading) {
+std::uint64_t pixel_rate(const row_t &row, const explained_t &explained) {
   const i32(&value)[4] = row.decision.value;
   std::optional<raster_t> raster;
   if (row.decision.subject == COMPOSE_SUBJECT_VIDEO_MODE) {
-    raster = raster_of_vic(sink_vic(row.decision, reading));
+    raster = raster_of_vic(sink_vic(row.decision, explained));
   } else if (row.decision.subject == COMPOSE_SUBJECT_4K_MODE) {
     raster = raster_of_hdmi_vic(row.decision.code);
   } else if (row.decision.subject == COMPOSE_SUBJECT_SINK_TIMING) {
@@ -45,10 +45,10 @@ std::string preferred_video(const std::vector<row_t> &rows) {
   return first != rows.end() ? first->name : "";
 }
 
-std::string best_video(const std::vector<row_t> &rows, const sink_reading_t &reading) {
+std::string best_video(const std::vector<row_t> &rows, const explained_t &explained) {
   const std::vector<row_t> modes = offered_modes(rows);
-  const auto best = std::max_element(modes.begin(), modes.end(), [&reading](const row_t &left, const row_t &right) {
-    return pixel_rate(left, reading) < pixel_rate(right, reading);
+  const auto best = std::max_element(modes.begin(), modes.end(), [&explained](const row_t &left, const row_t &right) {
+    return pixel_rate(left, explained) < pixel_rate(right, explained);
   });
   return best != modes.end() ? best->name : "";
 }
@@ -83,14 +83,14 @@ bool is_offered_as_4k(const row_t &row, const std::vector<row_t> &rows) {
          });
 }
 
-std::vector<std::string> lost_of_sink(const std::vector<row_t> &rows, const sink_reading_t &reading) {
+std::vector<std::string> lost_of_sink(const std::vector<row_t> &rows, const explained_t &explained) {
   std::vector<row_t> lost;
   std::copy_if(rows.begin(), rows.end(), std::back_inserter(lost), [&](const row_t &row) {
     return row.is_of_sink() && !row.is_offered() && row.merged.empty() && !row.rests_on_unread &&
            !is_offered_as_4k(row, rows);
   });
-  std::stable_sort(lost.begin(), lost.end(), [&reading](const row_t &left, const row_t &right) {
-    return pixel_rate(left, reading) > pixel_rate(right, reading);
+  std::stable_sort(lost.begin(), lost.end(), [&explained](const row_t &left, const row_t &right) {
+    return pixel_rate(left, explained) > pixel_rate(right, explained);
   });
   std::vector<std::string> names;
   for (const row_t &row : lost) {
@@ -155,8 +155,9 @@ std::string status_of(const sink_reading_t &reading) {
 
 summary_t summary_of(const std::vector<row_t> &rows, const explained_t &explained) {
   const sink_reading_t &reading = explained.reading;
-  return {status_of(reading),          preferred_video(rows), best_video(rows, reading),    offered_audio(rows),
-          lost_of_sink(rows, reading), counts_of(rows),       common_reasons(rows, reading)};
+  return {status_of(reading),           preferred_video(rows),         best_video(rows, explained),
+          offered_audio(rows),          lost_of_sink(rows, explained), counts_of(rows),
+          common_reasons(rows, reading)};
 }
 
 std::string first_of(const std::vector<std::string> &texts, std::size_t shown) {

@@ -6,7 +6,7 @@
 #include <iterator>
 #include <optional>
 
-#include "explain/mode_names.h"
+#include "edid_text/mode_names.h"
 #include "io/bad_input.h"
 #include "text/lower_case.h"
 #include "text/whole_number.h"

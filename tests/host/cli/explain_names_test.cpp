@@ -4,7 +4,7 @@
 #include <set>
 
 #include "explain/answer.h"
-#include "explain/mode_names.h"
+#include "edid_text/mode_names.h"
 #include "io/bad_input.h"
 
 namespace edid_cli {

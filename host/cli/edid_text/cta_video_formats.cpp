@@ -1,4 +1,4 @@
-#include "explain/cta_video_formats.h"
+#include "edid_text/cta_video_formats.h"
 
 #include <algorithm>
 #include <iterator>

@@ -1,10 +1,10 @@
-#include "explain/mode_names.h"
+#include "edid_text/mode_names.h"
 
 #include <algorithm>
 #include <cstdio>
 #include <string_view>
 
-#include "explain/cta_video_formats.h"
+#include "edid_text/cta_video_formats.h"
 
 namespace edid_cli {
 namespace {
@@ -74,6 +74,11 @@ std::optional<raster_t> raster_of_vic(u32 vic) {
 
 std::optional<raster_t> raster_of_hdmi_vic(u32 hdmi_vic) {
   return hdmi_vic >= 1 && hdmi_vic <= last_hdmi_vic ? raster_of_vic(vics_of_hdmi_vics[hdmi_vic - 1]) : std::nullopt;
+}
+
+u32 vic_of(const short_video_desc_t &descriptor) {
+  constexpr u32 native_bit = 0x80;
+  return descriptor.native != 0 && descriptor.vic > last_library_vic ? descriptor.vic | native_bit : descriptor.vic;
 }
 
 u32 pixel_clock_of_vic(u32 vic) {
