@@ -37,7 +37,7 @@ _edid_composer_options() {
         --debug
       ;;&
     compose) printf '%s\n' --output -o --format --jobs --strict --log ;;
-    explain) printf '%s\n' --want --json --html ;;
+    explain) printf '%s\n' --want --wide --json --html ;;
     print) printf '%s\n' --brief --drm-dir ;;
     diff) printf '%s\n' --only-changes --drm-dir ;;
     sinks) printf '%s\n' --drm-dir ;;

@@ -33,12 +33,16 @@ int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
   const edid_cli::composition_t composition = edid_cli::compose(options, 0, sink, unheard, edid_cli::decisions_t::kept);
   if (!composition.is_composed) return 0;
   const edid_cli::decoded_edid_t decoded(sink.empty() ? std::vector<u8>(fuzz::block_size) : sink);
-  const edid_cli::explained_t explained{composition, sink, decoded.record(), "fuzz.bin", places, options};
-  FUZZ_REQUIRE(nlohmann::json::accept(edid_cli::explanation_json(explained)));
-  FUZZ_REQUIRE(edid_cli::explanation_page(explained).ends_with("</html>\n"));
-  FUZZ_REQUIRE(!edid_cli::explanation_text(explained).empty());
+  const edid_cli::sink_reading_t reading = edid_cli::sink_reading(sink, composition.result);
+  const edid_cli::explained_t explained{composition, sink, decoded.record(), "fuzz.bin", reading, places, options};
+  const edid_cli::explanation_t explanation = edid_cli::explanation_of(explained);
+  FUZZ_REQUIRE(nlohmann::json::accept(edid_cli::explanation_json(explanation)));
+  FUZZ_REQUIRE(edid_cli::explanation_page(explanation).ends_with("</html>\n"));
+  FUZZ_REQUIRE(!edid_cli::explanation_text(explanation, edid_cli::table_width_t::narrow).empty());
   const u32 vic = 1 + (mended >> 2);
-  const edid_cli::answer_t answer = edid_cli::answer({COMPOSE_SUBJECT_VIDEO_MODE, vic}, explained);
-  FUZZ_REQUIRE(answer.is_offered || !answer.reasons.empty());
+  const edid_cli::answers_t answers = edid_cli::answers_to({{COMPOSE_SUBJECT_VIDEO_MODE, vic}}, explained);
+  const edid_cli::answer_t &answer = answers.answers.front();
+  FUZZ_REQUIRE(!answer.reasons.empty());
+  FUZZ_REQUIRE(answer.is_offered == (answer.ways.empty() && answer.no_way.empty()));
   return 0;
 }

@@ -75,7 +75,10 @@ std::string explanation_of(const golden_case_t &golden_case) {
   test_support::output_of([&] {
     const edid_cli::decoded_edid_t decoded(sink);
     const edid_cli::platform_places_t places(golden_case.platform);
-    text = edid_cli::explanation_text({composition, sink, decoded.record(), golden_case.sink, places, options});
+    const edid_cli::sink_reading_t reading = edid_cli::sink_reading(sink, composition.result);
+    text = edid_cli::explanation_text(
+        edid_cli::explanation_of({composition, sink, decoded.record(), golden_case.sink, reading, places, options}),
+        edid_cli::table_width_t::wide);
   });
   return text;
 }

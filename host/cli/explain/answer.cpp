@@ -56,7 +56,10 @@ std::string decision_sentence(const wanted_t &wanted, const compose_decision_t &
 
 std::vector<std::string> reasons_of(const wanted_t &wanted, bool is_offered, const explained_t &explained) {
   std::vector<std::string> reasons;
+  bool is_told = false;
   for (const compose_decision_t &decision : decisions_about(wanted, explained)) {
+    // For no room it is said that the extension is not announced.
+    is_told = is_told || decision.reason == COMPOSE_REASON_NO_ROOM;
     if (!is_offered || decision.verdict != COMPOSE_VERDICT_LEFT_OUT) {
       reasons.push_back(decision_sentence(wanted, decision, explained));
     }
@@ -64,7 +67,7 @@ std::vector<std::string> reasons_of(const wanted_t &wanted, bool is_offered, con
   if (reasons.empty()) {
     reasons.push_back(without_decision(wanted));
   }
-  if (!is_offered && !explained.is_extension_announced()) {
+  if (!is_offered && !is_told && !explained.is_extension_announced()) {
     reasons.push_back(
         reason_sentence(*find_decision(explained.composition, COMPOSE_SUBJECT_EXTENSION_ROOM), explained));
   }

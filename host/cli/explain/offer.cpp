@@ -8,12 +8,14 @@
 namespace edid_cli {
 namespace {
 
-constexpr std::size_t extension_count_offset = 126;
-
 /// Without an extension that is announced a source reads the base block only.
+bool is_extension_announced(const new_edid_t &new_edid) {
+  constexpr std::size_t extension_count_offset = 126;
+  return new_edid[extension_count_offset] != 0;
+}
+
 std::vector<u8> bytes_that_are_read(const new_edid_t &new_edid) {
-  const bool is_announced = new_edid[extension_count_offset] != 0;
-  return {new_edid.begin(), new_edid.begin() + (is_announced ? 256 : 128)};
+  return {new_edid.begin(), new_edid.begin() + (is_extension_announced(new_edid) ? 256 : 128)};
 }
 
 template <typename entry_t, typename predicate_t>
@@ -26,12 +28,15 @@ bool any_of(const ll_list_t &list, predicate_t predicate) {
   return false;
 }
 
-bool has_mode(const edid_t &edid, u32 vic) {
-  return any_of<short_video_desc_t>(edid.video_list, [vic](const auto &mode) { return mode.vic == vic; }) ||
-         any_of<detailed_timing_t>(edid.dtd_list, [&](const auto &timing) {
-           u32 vic_of_timing = 0;
-           return convert_dtd_to_vic(&edid, &timing, &vic_of_timing) == 1 && vic_of_timing == vic;
-         });
+bool has_short_descriptor(const edid_t &edid, u32 vic) {
+  return any_of<short_video_desc_t>(edid.video_list, [vic](const auto &mode) { return mode.vic == vic; });
+}
+
+bool has_detailed_timing(const edid_t &edid, u32 vic) {
+  return any_of<detailed_timing_t>(edid.dtd_list, [&edid, vic](const auto &timing) {
+    u32 vic_of_timing = 0;
+    return convert_dtd_to_vic(&edid, &timing, &vic_of_timing) == 1 && vic_of_timing == vic;
+  });
 }
 
 u32 channels_of(const edid_t &edid, u32 type) {
@@ -65,7 +70,8 @@ bool is_offered(const wanted_t &wanted, const new_edid_t &new_edid) {
     case COMPOSE_SUBJECT_3D:
       return edid.hdmi_3d_present != 0;
     default:
-      return has_mode(edid, wanted.code);
+      return is_extension_announced(new_edid) ? has_short_descriptor(edid, wanted.code)
+                                              : has_detailed_timing(edid, wanted.code);
   }
 }
 

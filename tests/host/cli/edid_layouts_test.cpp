@@ -75,6 +75,25 @@ std::string output_properties(const std::string &bytes) {
          "\tBroadcast RGB: Automatic \n\t\tsupported: Automatic, Full\n   1920x1080 60.00*+\n";
 }
 
+std::string rows_of_numbers(const std::string &bytes) {
+  return "  0x" + [&bytes] {
+    std::string numbers = hex_of(bytes, ", 0x");
+    for (std::size_t at = 0, count = 0; (at = numbers.find(", ", at)) != std::string::npos; ++at) {
+      numbers.replace(at, 2, ++count % row_size == 0 ? ",\n" : ", ");
+    }
+    return numbers;
+  }() + ",\n";
+}
+
+/// As the registry's editor writes it, 16 bytes a line.
+std::string registry_text(const std::string &bytes) {
+  std::string text = "Windows Registry Editor Version 5.00\r\n\r\n[HKEY_LOCAL_MACHINE\\DISPLAY]\r\n\"EDID\"=hex:";
+  for (std::size_t offset = 0; offset < bytes.size(); offset += row_size) {
+    text += (offset == 0 ? "" : ",\\\r\n  ") + hex_of(bytes.substr(offset, row_size), ",");
+  }
+  return text + "\r\n\r\n";
+}
+
 class EdidLayouts : public cli_fixture_t {
  protected:
   process_result_t print(const std::string &content) { return run_cli({"print", directory_.write("edid", content)}); }
@@ -164,6 +183,57 @@ TEST_F(EdidLayouts, AnOffsetThatDoesNotFollowIsNamedWithItsPlace) {
 TEST_F(EdidLayouts, WordsOfTwoBytesHaveNoOrderAndAreRefused) {
   expect_bad_input(print("0000000 ff00 ffff ffff 00ff\n"),
                    path() + ":1:9: \"ff00\" is not one byte; dump with xxd or hexdump -C");
+}
+
+TEST_F(EdidLayouts, AnArrayInC) {
+  const std::string array = "#include <stdint.h>\n/* A television: {00} */\nstatic const uint8_t edid[256] = {\n" +
+                            rows_of_numbers(bytes_) + "};  // 0xFF\n";
+  expect_same_as_raw(array);
+  expect_same_as_raw("unsigned char edid[][128] = {{\n" + rows_of_numbers(bytes_.substr(0, 128)) + "}, {\n" +
+                     rows_of_numbers(bytes_.substr(128)) + "}};");
+  std::string decimal;
+  for (const char byte : bytes_) {
+    decimal += std::to_string(static_cast<unsigned char>(byte)) + ",";
+  }
+  expect_same_as_raw("{" + decimal + "}");
+}
+
+TEST_F(EdidLayouts, WhatIsWrongInAnArrayIsNamedWithItsPlace) {
+  expect_bad_input(print("u8 e[] = {\n0x00, 0x100\n};\n"), path() + ":2:7: \"0x100\" is not a number from 0 to 255");
+  expect_bad_input(print("u8 e[] = { EDID };"), path() + ":1:12: \"EDID\" is not a number from 0 to 255");
+  expect_bad_input(print("u8 e[] = {0};\nu8 f[] = {0};"),
+                   path() + ":2:10: \"{\" begins a second array; the first is at line 1. Leave one of them");
+  expect_bad_input(print("\nu8 e[] = { 0,"), path() + ": the array that begins at line 2 has no closing brace");
+}
+
+TEST_F(EdidLayouts, AValueOfTheRegistry) {
+  const std::string text = registry_text(bytes_);
+  expect_same_as_raw(text);
+  expect_same_as_raw("\xEF\xBB\xBF" + text);
+  std::string utf16 = "\xFF\xFE";
+  for (const char character : text) {
+    utf16 += {character, '\0'};
+  }
+  expect_same_as_raw(utf16);
+}
+
+TEST_F(EdidLayouts, WhatIsWrongInTheRegistryIsNamedWithItsPlace) {
+  const std::string text = registry_text(bytes_);
+  expect_bad_input(print("REGEDIT4\n\n[HKEY]\n\"Other\"=hex:00\n"),
+                   path() + ": no value \"EDID\"=hex:... in this part of the registry");
+  expect_bad_input(print(text + text), path() + ":24: a second EDID; the first is at line 4. Leave one of them");
+  expect_bad_input(print("REGEDIT4\n\"EDID\"=hex:00,zz\n"), path() + ":2:15: \"zz\" is not hexadecimal");
+}
+
+TEST_F(EdidLayouts, AByteOrderMarkBeforeDigits) {
+  expect_same_as_raw("\xEF\xBB\xBF" + rows_of(bytes_, "", " "));
+}
+
+TEST_F(EdidLayouts, ARawDumpWithANewlineAfterIt) {
+  expect_same_as_raw(bytes_ + "\n");
+  expect_same_as_raw(bytes_ + "\r\n");
+  expect_bad_input(print(bytes_ + "\n\n"),
+                   path() + ": 258 bytes are not an EDID, which has 1 to 256 blocks of 128 bytes");
 }
 
 TEST_F(EdidLayouts, OfTwoDisplaysNoneIsChosen) {

@@ -18,9 +18,9 @@ using testing::StartsWith;
 
 class Explain : public cli_fixture_t {
  protected:
-  /// The tables' lines.
+  /// The tables' lines, with all columns.
   static std::vector<std::string> explained(std::vector<std::string> arguments) {
-    arguments.insert(arguments.begin(), "explain");
+    arguments.insert(arguments.begin(), {"explain", "--wide"});
     const process_result_t result = run_cli(arguments);
     EXPECT_EQ(result.status, 0) << result.error;
     std::vector<std::string> lines;
@@ -90,7 +90,7 @@ TEST_F(Explain, CountsOnlyEntriesThatAreTakenWhenItTellsTheirLines) {
 
 TEST_F(Explain, TellsOfTimingsOfTheSinkThatHaveNoVic) {
   const auto rows = table(explained({"--sink", sample_sink("monitor_base_block")}), "Video modes");
-  EXPECT_THAT(row_of(rows, "No VIC stands for"), AllOf(StartsWith("left out"), HasSubstr("sink: ")));
+  EXPECT_THAT(row_of(rows, "it has no VIC"), AllOf(StartsWith("left out"), HasSubstr("sink: ")));
 }
 
 TEST_F(Explain, TellsTheSettingThatAFormatIsLeftOutFor) {
@@ -100,7 +100,7 @@ TEST_F(Explain, TellsTheSettingThatAFormatIsLeftOutFor) {
 
 TEST_F(Explain, TellsHowAFormatWasNarrowed) {
   const auto rows = table(explained({"--sink", sample_sink("tv_1080p_3d"), "--audio-sink-filter"}), "Audio formats");
-  EXPECT_THAT(row_of(rows, "narrowed"), AllOf(StartsWith("changed"), HasSubstr(" became ")));
+  EXPECT_THAT(row_of(rows, " became "), AllOf(StartsWith("changed"), HasSubstr("narrowed")));
 }
 
 TEST_F(Explain, TellsTheDerivedValues) {
@@ -115,9 +115,44 @@ TEST_F(Explain, TellsTheDerivedValues) {
 TEST_F(Explain, WarnsAboveTheTablesOfWhatConcernsTheWholeEdid) {
   const std::string file = changed_platform("monitor_name = \"Media Box\"", "monitor_name = \"\"");
   const auto lines = explained({"--platform", file});
-  ASSERT_GT(lines.size(), 2U);
-  EXPECT_THAT(lines[1], StartsWith("warning: Without a monitor name"));
-  EXPECT_THAT(explained({})[1], Not(HasSubstr("warning")));
+  EXPECT_THAT(row_of(lines, "warning:"), HasSubstr("Without a monitor name"));
+  const auto plain = explained({});
+  EXPECT_TRUE(std::none_of(plain.begin(), plain.end(),
+                           [](const std::string &line) { return line.find("warning") != std::string::npos; }));
+}
+
+TEST_F(Explain, BeginsWithWhatMatters) {
+  const auto lines = explained({"--sink", sample_sink("tv_4k")});
+  ASSERT_GT(lines.size(), 7U);
+  EXPECT_THAT(lines[0], AllOf(StartsWith("sink: "), HasSubstr("tv_4k.txt (SAMPLE 4K TV)")));
+  EXPECT_EQ(lines[1], "platform:  default platform");
+  EXPECT_EQ(lines[2], "status:    All of the sink's EDID was read.");
+  EXPECT_EQ(lines[3], "video:     at best 3840x2160p30 (4k:1); preferred: 1920x1080p60 16:9 (VIC 16)");
+  EXPECT_THAT(lines[4], StartsWith("audio:     PCM, 8 channels; "));
+  EXPECT_THAT(lines[5], StartsWith("lost: "));
+  EXPECT_THAT(lines[6], AllOf(StartsWith("reasons: "), HasSubstr(" times: ")));
+}
+
+TEST_F(Explain, FitsAHundredColumnsUnlessAllOfItIsAskedFor) {
+  for (const char *name : sample_names) {
+    const std::string output = run_cli({"explain", "--sink", sample_sink(name)}).output;
+    std::istringstream stream(output);
+    for (std::string line; std::getline(stream, line);) {
+      EXPECT_LE(line.size(), 100U) << line;
+    }
+    EXPECT_THAT(output, Not(HasSubstr("priority_list[")));
+  }
+  EXPECT_THAT(run_cli({"explain", "--wide"}).output, HasSubstr("60_hz_priority_list["));
+}
+
+TEST_F(Explain, HasAFormatOfBothSidesOnOneRow) {
+  const auto rows = table(explained({"--sink", sample_sink("tv_4k")}), "Audio formats");
+  EXPECT_THAT(row_of(rows, "AC3, 6 channels"),
+              AllOf(StartsWith("offered"), HasSubstr("The platform has it. The sink has it too."),
+                    HasSubstr("audio.entry_c"), HasSubstr("sink: short audio descriptor")));
+  EXPECT_EQ(std::count_if(rows.begin(), rows.end(),
+                          [](const std::string &row) { return row.find("AC3, 6 channels") != std::string::npos; }),
+            1);
 }
 
 TEST_F(Explain, KeepsWhatTheLibrarySaysOffStandardOutput) {
@@ -162,6 +197,12 @@ TEST_F(Explain, RefusesWhatDoesNotGoTogether) {
   expect_bad_input(run_cli({"explain", "--port", "0..1"}), "explain looks at one composition: one sink and one port");
   expect_bad_input(run_cli({"explain", "--want", "16", "--html", directory_.path("page.html")}),
                    "--want and --html don't go together");
+  for (const std::vector<std::string> &other :
+       {std::vector<std::string>{"--json"}, {"--want", "16"}, {"--html", "-"}}) {
+    std::vector<std::string> arguments{"explain", "--wide"};
+    arguments.insert(arguments.end(), other.begin(), other.end());
+    expect_bad_input(run_cli(arguments), "--wide is for the tables: it goes with neither --json, --want nor --html");
+  }
   expect_bad_input(run_cli({"explain", "--json", "--html", "-"}),
                    "--json and --html cannot both go to standard output");
   EXPECT_EQ(run_cli({"explain", "--sink", directory_.path("missing.bin")}).status, 2);

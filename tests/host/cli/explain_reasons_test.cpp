@@ -72,7 +72,7 @@ class Reasons : public testing::Test {
         decision(COMPOSE_SUBJECT_NATIVE_RATE, 50, COMPOSE_VERDICT_OFFERED, COMPOSE_REASON_RATE_OF_PLATFORM));
   }
 
-  explained_t explained() { return {composition_, no_bytes_, sink_, "", places_(), options_}; }
+  explained_t explained() { return {composition_, no_bytes_, sink_, "", reading_, places_(), options_}; }
   std::string sentence(const compose_decision_t &decision) { return reason_sentence(decision, explained()); }
 
   std::vector<std::string> sources(const compose_decision_t &decision) {
@@ -97,6 +97,7 @@ class Reasons : public testing::Test {
 
   std::optional<platform_places_t> read_;
   composition_t composition_;
+  sink_reading_t reading_;
   const std::vector<u8> no_bytes_;
   edid_t sink_{};
   composition_options_t options_;
@@ -150,21 +151,27 @@ TEST_F(Reasons, PutTheirNumbersIntoWords) {
        {1080, 720},
        "It has 1080 lines, and the sink's tallest mode limits them to 720."},
       {COMPOSE_REASON_NO_ROOM, {10}, "It was chosen, but there is no room for it: a source finds 10 of its kind."},
-      {COMPOSE_REASON_TIMING_WITHOUT_VIC, {1366, 768, 60, 0}, "No VIC stands for the sink's timing 1366x768p60."},
-      {COMPOSE_REASON_TIMING_WITHOUT_VIC, {1920, 540, 50, 1}, "No VIC stands for the sink's timing 1920x540i50."},
-      {COMPOSE_REASON_TIMING_WITHOUT_VIC,
-       {1280, 0, 75, 0},
-       "No VIC stands for the sink's timing 1280 pixels wide at 75 Hz."},
-      {COMPOSE_REASON_PLATFORM_FORMAT, {1}, "The platform has it, with 1 channel."},
+      {COMPOSE_REASON_TIMING_WITHOUT_VIC, {1366, 768, 60, 0}, "The sink has it; it has no VIC, so it is not offered."},
+      {COMPOSE_REASON_PLATFORM_FORMAT, {1}, "The platform has it."},
       {COMPOSE_REASON_NARROWED_TO_SINK,
        {8, 6, 0x7F, 0x07},
        "The platform's format, narrowed to what the sink takes: 8 channels became 6, 32kHz 44.1kHz 48kHz 88.2kHz "
        "96kHz 176.4kHz 192kHz became 32kHz 44.1kHz 48kHz."},
+      {COMPOSE_REASON_NARROWED_TO_SINK,
+       {8, 6, 0x07, 0x07},
+       "The platform's format, narrowed to what the sink takes: 8 channels became 6."},
+      {COMPOSE_REASON_NARROWED_TO_SINK,
+       {2, 2, 0x0F, 0x07},
+       "The platform's format, narrowed to what the sink takes: 32kHz 44.1kHz 48kHz 88.2kHz became 32kHz 44.1kHz "
+       "48kHz."},
+      {COMPOSE_REASON_NARROWED_TO_SINK,
+       {2, 2, 0x07, 0x07},
+       "The platform's format, narrowed to what the sink takes: fewer sample sizes, or a lower bit rate."},
       {COMPOSE_REASON_NOT_AN_AUDIO_FORMAT, {0x123407}, "The platform's entry 0x123407 is not an audio format."},
-      {COMPOSE_REASON_DUPLICATE, {2, 0}, "Format number 1 of the choice covers it already."},
+      {COMPOSE_REASON_DUPLICATE, {2, 0}, "Format 1 of those chosen covers it already."},
       {COMPOSE_REASON_AUDIO_MASK, {0x3, 0x40}, "The audio mask in force, 0x3, leaves its type out; its bit is 0x40."},
       {COMPOSE_REASON_AUDIO_MASK, {-2, 1}, "The audio mask in force, 0xFFFFFFFE, leaves its type out; its bit is 0x1."},
-      {COMPOSE_REASON_RATE_OF_DETAILED_TIMING, {0, 59}, "The sink's detailed timing 1 has 59 Hz."},
+      {COMPOSE_REASON_CURRENT_MODE_WITHOUT_VIC, {1920, 540, 50, 1}, "No VIC stands for 1920x540i50."},
       {COMPOSE_REASON_ADDRESS_BELOW_SINK,
        {3, 0x2000},
        "Input 3 stands in the first free place of the sink's address 2.0.0.0."},
@@ -189,6 +196,53 @@ TEST_F(Reasons, PutTheirNumbersIntoWords) {
   }
 }
 
+TEST_F(Reasons, SayWhichRateCountsAsWhich) {
+  compose_decision_t rate =
+      decision(COMPOSE_SUBJECT_NATIVE_RATE, 60, COMPOSE_VERDICT_OFFERED, COMPOSE_REASON_RATE_OF_DETAILED_TIMING);
+  rate.value[1] = 60;
+  EXPECT_EQ(sentence(rate), "The sink's detailed timing 1 has 60 Hz.");
+  rate.value[1] = 59;
+  EXPECT_EQ(sentence(rate), "The sink's detailed timing 1 has 59 Hz, which counts as 60.");
+}
+
+TEST_F(Reasons, SayWhatALatencyOf0MsIsDeclaredFor) {
+  EXPECT_EQ(sentence(decision(COMPOSE_SUBJECT_LATENCY, 0, COMPOSE_VERDICT_LEFT_OUT, COMPOSE_REASON_LATENCY_NONE)),
+            "Neither the platform nor the sink tells of a delay.");
+  EXPECT_EQ(sentence(decision(COMPOSE_SUBJECT_LATENCY, 0, COMPOSE_VERDICT_OFFERED, COMPOSE_REASON_LATENCY_NONE)),
+            "Neither the platform nor the sink tells of a delay: 0 ms is declared, as other latencies are.");
+}
+
+TEST_F(Reasons, ForNoRoomAreTheNameThatIsMissing) {
+  composition_.decisions.push_back(
+      decision(COMPOSE_SUBJECT_EXTENSION_ROOM, 80, COMPOSE_VERDICT_CHANGED, COMPOSE_REASON_NOT_ANNOUNCED));
+  EXPECT_EQ(sentence(left_out(COMPOSE_REASON_NO_ROOM, {0})),
+            "It was chosen, but without a monitor name sources do not read the extension.");
+}
+
+TEST_F(Reasons, OfVicsAboveTheLibrarysAreTheLibrary) {
+  compose_decision_t mode = left_out(COMPOSE_REASON_NOT_IN_PRIORITY_LIST, {});
+  mode.code = 97;
+  EXPECT_EQ(sentence(mode), "The sink has it; this library offers VICs up to 64.");
+  mode.code = 95;
+  EXPECT_EQ(sentence(mode), "The sink has it; this library offers VICs up to 64. HDMI 1.4 has it as 4k:1.");
+}
+
+TEST_F(Reasons, ThatRestOnWhatWasNotReadSaySo) {
+  reading_.missing_part = "the sink's extension was not read";
+  u32 resting = 0;
+  for (u32 reason = 1; std::string(compose_reason_string(reason)) != compose_reason_string(0); ++reason) {
+    compose_decision_t known = left_out(COMPOSE_REASON_NO_ROOM, {});
+    known.reason = reason;
+    const bool says_so = sentence(known).find(reading_.missing_part) != std::string::npos;
+    EXPECT_EQ(says_so, rests_on_unread(known, explained())) << sentence(known);
+    resting += says_so ? 1 : 0;
+  }
+  EXPECT_EQ(resting, 14U);
+  EXPECT_EQ(sentence(left_out(COMPOSE_REASON_NOT_AVAILABLE, {})),
+            "Only 60_hz_priority_list names it, and the sink's extension was not read.");
+  EXPECT_FALSE(rests_on_unread(left_out(COMPOSE_REASON_SINK_HAS_IT, {}), explained()));
+}
+
 TEST_F(Reasons, ComeFromTheEntryThatCounts) {
   compose_decision_t mode =
       decision(COMPOSE_SUBJECT_VIDEO_MODE, 4, COMPOSE_VERDICT_OFFERED, COMPOSE_REASON_SINK_HAS_IT);
@@ -206,7 +260,7 @@ TEST_F(Reasons, ComeFromTheOtherFamilysListWhereOnlyThatNamesIt) {
   mode.priority_index = 1;
   mode.value[0] = 60;
   EXPECT_THAT(sources(mode), ElementsAre("box.toml:8 50_hz_priority_list[2]"));
-  EXPECT_EQ(sentence(mode), "Only lists of the other refresh family name it; 60 Hz is in use.");
+  EXPECT_EQ(sentence(mode), "Only the 50 Hz lists name it, and the 60 Hz lists are in use.");
 }
 
 TEST_F(Reasons, ComeFrom4kListsAndAudioEntries) {

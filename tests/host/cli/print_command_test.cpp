@@ -2,6 +2,7 @@
 #include <gmock/gmock.h>
 
 #include "cli/cli_fixture.h"
+#include "support/terminal.h"
 
 namespace host_test {
 namespace {
@@ -91,6 +92,35 @@ TEST_F(PrintCommand, AnExtensionThatDoesNotDecodeEndsWithStatusOne) {
   EXPECT_EQ(result.error,
             "edid-composer: " + directory_.path("sink.bin") + ": the library refused to decode this EDID\n");
   EXPECT_THAT(result.output, HasSubstr("() ERROR: Failed decoding EDID block 1.\n"));
+}
+
+TEST_F(PrintCommand, OnATerminalTextsOfTheSinkHaveNoControlCharacters) {
+  std::string bytes = sample_bytes("tv_4k");
+  const std::size_t name = bytes.find("SAMPLE 4K TV");
+  ASSERT_NE(name, std::string::npos);
+  bytes.replace(name, 4, "\x1B[2J");
+  int sum = 0;
+  for (std::size_t at = 0; at < 127; ++at) {
+    sum += static_cast<unsigned char>(bytes[at]);
+  }
+  bytes[127] = static_cast<char>(-sum);
+  const std::string file = directory_.write("sink.bin", bytes);
+  EXPECT_THAT(run_cli({"print", file}).output, HasSubstr("Monitor name        = \"\x1B[2JLE 4K TV\"\n"));
+  terminal_t terminal;
+  process_t print{cli_program(), {"print", file}};
+  print.output_file = terminal.name();
+  EXPECT_EQ(print.run().status, 0);
+  const std::string shown = terminal.content();
+  EXPECT_THAT(shown, HasSubstr("\nMonitor name        = \"?[2JLE 4K TV\"\n"));
+  EXPECT_THAT(shown, HasSubstr("\n\tStand-by "));
+  EXPECT_EQ(shown.find('\x1B'), std::string::npos);
+}
+
+TEST_F(PrintCommand, NamesOfFilesInMessagesHaveNoControlCharacters) {
+  EXPECT_EQ(run_cli({"print", "no\x1B[31m\nsuch\xC2\x9Bz"}).error,
+            "edid-composer: no?[31m?such?z: No such file or directory\n");
+  const std::string file = directory_.write("a\x1B[31m", std::string(128, '\0'));
+  EXPECT_THAT(run_cli({"print", file}).error, testing::EndsWith("a?[31m: the library refused to decode this EDID\n"));
 }
 
 }  // namespace

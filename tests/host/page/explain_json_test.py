@@ -1,5 +1,7 @@
 """The JSON document of "explain" is valid whatever a sink and a platform say, and tells what the bytes offer."""
 
+import html.parser
+import re
 import unittest
 
 import explaining
@@ -8,6 +10,61 @@ import sinks
 
 HOSTILE_NAMES = [b'"quoted"\\', b"\xff\xfe\x80\x00\x01", b"tab\there", b"</script>", b"\xed\xa0\x80", b"\xc0\xaf",
                  b"\xf0\x9f\x98", b"na\xc3\xafve \xe2\x82\xac", b"\x7f\x1b[31m", b"{{sink}}"]
+
+
+class Cells(html.parser.HTMLParser):
+    """The texts of a page's cells, facts and warnings."""
+
+    def __init__(self):
+        super().__init__()
+        self.texts = []
+        self._open = []
+
+    def handle_starttag(self, tag, _):
+        if tag in ("td", "th", "dt", "dd", "span", "p", "li", "h1"):
+            self._open.append(tag)
+            self.texts.append("")
+
+    def handle_endtag(self, tag):
+        if self._open and tag == self._open[-1]:
+            self._open.pop()
+
+    def handle_data(self, data):
+        if self._open:
+            self.texts[-1] += data
+
+
+# What the page says of itself: headings of tables and cards, labels, and what joins the document's texts.
+OWN_TEXTS = {"Verdict", "What", "Why", "From", "Offset", "Bytes", "Part", "Field", "Meaning", "Sink", "New EDID", "Key",
+             "Value", "Default", "Limits", "Best video", "Preferred video", "Audio", "Lost", "Most common reasons",
+             "none", "-", "Base block", "Limits and derived values",
+             "Why a box shows this EDID on its HDMI input, and what became of every mode and format.",
+             "Point at, tap or move to a byte with the arrow keys: what it means stands below."}
+
+
+def cells_of(page):
+    parser = Cells()
+    parser.feed(page.partition("<body>")[2].partition("<script>")[0])
+    return [text.strip() for text in parser.texts if text.strip()]
+
+
+def strings_of(value):
+    if isinstance(value, dict):
+        for key, inner in value.items():
+            yield key
+            yield from strings_of(inner)
+    elif isinstance(value, list):
+        for inner in value:
+            yield from strings_of(inner)
+    else:
+        yield str(value)
+
+
+def is_known(text, known):
+    """In the document as it is, or bytes and numbers of it in another form."""
+    forms = (text, text.removeprefix("Warning: "), re.sub(r"^\d+ times: ", "", text), re.sub(r": \d+ offered.*", "", text))
+    return (text in OWN_TEXTS or any(form in known for form in forms) or
+            re.fullmatch(r"(0x)?[0-9A-F]{2}( [0-9A-F]{2})*|and \d+ more", text) is not None)
 
 
 class JsonTest(explaining.ExplainTest):
@@ -75,8 +132,55 @@ class JsonTest(explaining.ExplainTest):
         sink = self.write("tv.bin", sinks.sink(vics=[16], timings=[sinks.timing(1366, 768)]))
         (timing,) = [found for found in self.decisions("--sink", sink) if found["subject"] == "sink timing"]
         self.assertEqual((timing["verdict"], timing["values"][:2]), ("left out", [1366, 768]))
-        self.assertIn("1366x768p", timing["sentence"])
+        self.assertEqual(timing["name"][:9], "1366x768p")
         self.assertEqual([source["text"] for source in timing["sources"]], ["sink: detailed timing 1"])
+
+    def test_vics_above_the_librarys_are_named_by_their_timing(self):
+        sink = self.write("tv.bin", sinks.sink(vics=[16, 97, 95, 219, 100]))
+        names = {decision["code"]: (decision["name"], decision["sentence"]) for decision in self.decisions("--sink", sink)
+                 if decision["subject"] == "video mode"}
+        only = "The sink has it; this library offers VICs up to 64."
+        self.assertEqual(names[97], ("3840x2160p60 16:9 (VIC 97)", only))
+        self.assertEqual(names[95], ("3840x2160p30 16:9 (VIC 95)", only + " HDMI 1.4 has it as 4k:1."))
+        self.assertEqual(names[91], ("4096x2160p120 256:135 (VIC 219)", only + " It takes this one for VIC 91."))
+
+    def test_standard_timings_are_named_with_their_lines(self):
+        base = bytearray(sinks.sink(vics=[16]))
+        base[38:44] = bytes([0x95, 0x00, 0x81, 0x40, 0x81, 0x80])  # 1440 16:10, 1280 4:3, 1280 5:4
+        sink = self.write("tv.bin", sinks.with_checksum(bytes(base[:128])) + bytes(base[128:]))
+        names = [decision["name"] for decision in self.decisions("--sink", sink) if decision["subject"] == "sink timing"]
+        self.assertEqual(sorted(names), ["1280x1024p60", "1280x960p60", "1440x900p60"])
+
+    def test_a_format_of_both_sides_is_one_row_with_both_decisions(self):
+        sink = self.write("tv.bin", sinks.sink(vics=[16], audio=[(0x15, 0x07, 0x50), (0x67, 0x54, 0x00)]))
+        formats = [decision for decision in self.decisions("--sink", sink) if decision["section"] == "audio"]
+        (ac3,) = [decision for decision in formats if decision["code"] == 2]
+        self.assertEqual((ac3["verdict"], ac3["sentence"]), ("offered", "The platform has it. The sink has it too."))
+        self.assertEqual([merged["verdict"] for merged in ac3["merged"]], ["left out"])
+        self.assertEqual([source["kind"] for source in ac3["sources"]], ["platform", "sink", "platform"])
+        (truehd,) = [decision for decision in formats if decision["code"] == 12]
+        self.assertEqual(truehd["verdict"], "left out")
+
+    def test_the_summary_says_what_is_best_and_what_is_lost(self):
+        sink = self.write("tv.bin", sinks.sink(vics=[16, 97, 95, 4], vics_4k=[1], audio=[(0x67, 0x54, 0x00)]))
+        summary = self.explain_json("--sink", sink)["summary"]
+        self.assertEqual(summary["best_video"], "3840x2160p30 (4k:1)")
+        self.assertEqual(summary["preferred_video"], "1920x1080p60 16:9 (VIC 16)")
+        # VIC 95 is not lost: HDMI 1.4 has it as 4k:1, which is offered.
+        self.assertEqual(summary["lost"], ["3840x2160p60 16:9 (VIC 97)", "MLP/TrueHD, 8 channels"])
+        self.assertIn("PCM, 8 channels", summary["audio"])
+        self.assertLessEqual(len(summary["reasons"]), 3)
+        counts = [reason["count"] for reason in summary["reasons"]]
+        self.assertEqual(counts, sorted(counts, reverse=True))
+
+    def test_the_page_shows_nothing_that_is_not_in_the_document(self):
+        for name in ("tv_4k", "tv_1080p_3d", "av_receiver", "monitor_base_block"):
+            arguments = ("--sink", self.sample(name), "--audio-sink-filter")
+            known = set(strings_of(self.explain_json(*arguments)))
+            _, page, _ = self.run_program("explain", "--html", "-", *arguments)
+            shown = cells_of(page)
+            self.assertGreater(len(shown), 300)
+            self.assertEqual([text for text in shown if not is_known(text, known)], [], name)
 
     def test_is_valid_whatever_the_sink_is_called(self):
         for name in HOSTILE_NAMES:

@@ -76,10 +76,10 @@ class Filters(PageTest):
 
     def test_verdict_and_subject_filter_together(self):
         self.browser.press("#verdict", "left")
-        self.browser.press("#section", "Audio")
+        self.browser.press("#section", "Video")
         document = self.explain_json("--sink", self.sample("tv_720p_50hz"))["decisions"]
         expected = [decision["name"] for decision in document
-                    if decision["verdict"] == "left out" and decision["section"] == "audio"]
+                    if decision["verdict"] == "left out" and decision["section"] == "video"]
         self.assertGreater(len(expected), 0)
         self.assertEqual(self.shown(), expected)
 
@@ -196,6 +196,15 @@ class Accessible(PageTest):
         self.browser.run("document.querySelectorAll('details').forEach(part => part.open = true)")
         contrast, where = self.browser.run(CONTRAST)
         self.assertGreaterEqual(contrast, 4.5, where)
+
+    def test_it_begins_with_what_matters(self):
+        self.open("--sink", self.sample("tv_4k"))
+        facts = self.browser.run("return Object.fromEntries([...document.querySelectorAll('header dt')].map(name => "
+                                 "[name.textContent, name.nextElementSibling.innerText]))")
+        self.assertEqual(list(facts), ["Sink", "Best video", "Preferred video", "Audio", "Lost", "Most common reasons"])
+        self.assertEqual(facts["Sink"], "All of the sink's EDID was read.")
+        self.assertEqual(facts["Best video"], "3840x2160p30 (4k:1)")
+        self.assertLessEqual(len(facts["Most common reasons"].splitlines()), 3)
 
     def test_it_has_a_language_a_title_and_headings_in_order(self):
         self.open("--sink", self.sample("tv_4k"))
