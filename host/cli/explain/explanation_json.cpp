@@ -95,7 +95,10 @@ json_t json_key(const key_reading_t &key) {
 }
 
 json_t json_finding(const finding_t &finding) {
-  return {{"from", line_text(finding.position)}, {"key", json_text(finding.key)}, {"text", json_text(finding.text)}};
+  return {{"severity", severity_text(finding.severity)},
+          {"from", line_text(finding.position)},
+          {"key", json_text(finding.key)},
+          {"text", json_text(finding.text)}};
 }
 
 json_t json_bytes_field(const byte_field_t &field) {

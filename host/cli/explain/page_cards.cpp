@@ -55,7 +55,9 @@ std::string keys_html(const platform_check_t &check) {
 std::string findings_html(const platform_check_t &check) {
   std::string html;
   for (const finding_t &finding : check.findings) {
-    html += "<li>" + html_text(line_text(finding.position) + ", " + finding.key + ": " + finding.text) + "</li>\n";
+    const std::string key = finding.key.empty() ? "" : ", " + finding.key;
+    html += std::string("<li><b>") + severity_text(finding.severity) +
+            "</b>: " + html_text(line_text(finding.position) + key + ": " + finding.text) + "</li>\n";
   }
   return html.empty() ? "" : "<h3 class=\"second\">What is wrong with it</h3>\n<ul>\n" + html + "</ul>";
 }
