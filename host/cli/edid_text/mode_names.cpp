@@ -78,7 +78,8 @@ std::optional<raster_t> raster_of_hdmi_vic(u32 hdmi_vic) {
 
 u32 vic_of(const short_video_desc_t &descriptor) {
   constexpr u32 native_bit = 0x80;
-  return descriptor.native != 0 && descriptor.vic > last_library_vic ? descriptor.vic | native_bit : descriptor.vic;
+  const u32 later = descriptor.vic | native_bit;
+  return descriptor.native != 0 && find_cta_video_format(later) != nullptr ? later : descriptor.vic;
 }
 
 u32 pixel_clock_of_vic(u32 vic) {

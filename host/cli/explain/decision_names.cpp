@@ -41,8 +41,9 @@ std::string audio_name(const compose_decision_t &decision, const explained_t &ex
   if (format) {
     return audio_type_name(decision.code) + ", " + channels_name(format->channels);
   }
-  const bool is_basic = decision.reason == COMPOSE_REASON_BASIC_AUDIO;
-  return audio_type_name(decision.code) + (is_basic ? ", " + channels_name(static_cast<u32>(decision.value[0])) : "");
+  constexpr u32 basic_audio_channels = 2;
+  const bool is_basic = (decision.origins & COMPOSE_ORIGIN_LIBRARY) != 0;
+  return audio_type_name(decision.code) + (is_basic ? ", " + channels_name(basic_audio_channels) : "");
 }
 
 std::string sink_timing_name(const compose_decision_t &decision, const explained_t &explained) {

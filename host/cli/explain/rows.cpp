@@ -83,7 +83,10 @@ void merge_audio(std::vector<row_t> &rows) {
       rows.push_back(std::move(other));
       continue;
     }
-    offered->sentence += other.is_of_sink() ? " The sink has it too." : " The platform has it too.";
+    // Once is enough for a sink that lists it twice.
+    if (offered->merged.empty()) {
+      offered->sentence += other.is_of_sink() ? " The sink has it too." : " The platform has it too.";
+    }
     offered->sources.insert(offered->sources.end(), other.sources.begin(), other.sources.end());
     offered->merged.push_back(std::move(other));
   }
