@@ -86,7 +86,7 @@ constexpr reason_text_t rows[] = {
      "No mode that was read of the sink tells it, so the platform does: {missing}."},
     {COMPOSE_REASON_RATE_FORCED, "The platform says {0}, which is neither 50 nor 60.", {"native_refresh_rate"}},
     {COMPOSE_REASON_GEOMETRY_OF_SINK,
-     "No mode may be taller than the sink's tallest one.",
+     "No mode may be taller than the sink's tallest one{unlisted}.",
      {"geometry_limit"},
      nullptr,
      sink_part_t::none,

@@ -112,6 +112,11 @@ std::string declared(const compose_decision_t &decision, const explained_t &) {
   return decision.verdict == COMPOSE_VERDICT_LEFT_OUT ? "" : ": 0 ms is declared, as other latencies are";
 }
 
+/// The tallest mode is looked for among the short video descriptors.
+std::string unlisted(const compose_decision_t &decision, const explained_t &) {
+  return decision.code != 0 ? "" : ", and it has no short video descriptor";
+}
+
 struct named_place_t {
   std::string_view name;
   std::string (*text)(const compose_decision_t &decision, const explained_t &explained);
@@ -120,7 +125,7 @@ struct named_place_t {
 constexpr named_place_t named_places[] = {
     {"priority", priority_list}, {"addition", addition_list}, {"who", who_has_it},    {"other", other_family},
     {"missing", missing_part},   {"no_room", why_no_room},    {"narrowed", narrowed}, {"rate1", rate},
-    {"raster0", raster},         {"declared", declared},
+    {"raster0", raster},         {"declared", declared},      {"unlisted", unlisted},
 };
 
 /// What a place in braces stands for.

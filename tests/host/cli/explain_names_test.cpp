@@ -45,7 +45,9 @@ TEST(ModeNames, AreDifferentForEachVic) {
 TEST(ModeNames, ReadBytesFrom193OnAsVicsOfTheirOwn) {
   EXPECT_EQ(vic_of({.native = 1, .vic = 16, .stereo = 0}), 16U);
   EXPECT_EQ(vic_of({.native = 0, .vic = 97, .stereo = 0}), 97U);
+  EXPECT_EQ(vic_of({.native = 1, .vic = 65, .stereo = 0}), 193U);
   EXPECT_EQ(vic_of({.native = 1, .vic = 91, .stereo = 0}), 219U);
+  EXPECT_EQ(vic_of({.native = 1, .vic = 98, .stereo = 0}), 98U);
 }
 
 TEST(ModeNames, HaveTheHdmiVicOfTheSameMode) {

@@ -12,7 +12,7 @@ namespace edid_cli {
 namespace {
 
 batch_result_t result_of(std::size_t number) {
-  return {.failure = "", .passed_over = "", .output = std::to_string(number), .diagnostics = {}};
+  return {.failure = "", .output = std::to_string(number), .diagnostics = {}, .passed_over = ""};
 }
 
 TEST(OrderedWorkers, HandOverEachResultInOrder) {
