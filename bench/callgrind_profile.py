@@ -12,13 +12,15 @@ import check_costs  # noqa: E402  (beside the path that it needs)
 # The first that matches what callgrind_annotate calls a function: "file:function".
 GROUPS = [
     ("Heap (C library)", r"malloc/(malloc|arena)\.c|morecore|bench/heap_meter"),
-    ("Texts and numbers (C library)", r"stdio-common|/libio/|stdlib/strto|/debug/|/locale/|string/.*(str|mem)"),
+    ("Text (C library)", r"stdio-common|/libio/|stdlib/strto|/debug/|/locale/|string/.*(str|mem)"),
     ("Configuration store", r"host/config_store|functional_hash|_Hash_bytes|string_view"),
-    ("Lists: integrity and type checks", r"linked_list/.*(verif|sound|checked_walk|magic|str_checksum)"),
-    ("Lists: entries", r"src/linked_list/"),
-    ("Decoders and encoders", r"src/edid_decode_encode/|src/bytes\.h|src/text_field\.h"),
-    ("Composer", r"src/edid_composer/"),
-    ("Conversions, configuration getters", r"src/utility/"),
+    ("Lists", r"src/linked_list/"),
+    ("Decoders, encoders, report", r"src/edid_decode_encode/|src/bytes\.h|src/text_field\.h|src/utility/printers"),
+    ("Reading the platform", r"src/edid_composer/platform/|src/utility/(configuration|platform_values)"),
+    ("Selecting modes and formats", r"src/edid_composer/selection/"),
+    ("Values of the new EDID", r"src/edid_composer/new_edid/"),
+    ("Explaining", r"src/edid_composer/(explain|journal)"),
+    ("Names and conversions", r"src/utility/"),
 ]
 REST = "Other"
 

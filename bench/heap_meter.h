@@ -7,9 +7,9 @@
 namespace bench {
 
 struct heap_use_t {
-  std::uint64_t allocations;  ///< Calls of malloc, calloc and realloc.
-  std::uint64_t frees;        ///< Calls of free with something to free.
-  std::uint64_t bytes;        ///< What was asked for.
+  std::uintmax_t allocations;  ///< Calls of malloc, calloc and realloc.
+  std::uintmax_t frees;        ///< Calls of free with something to free.
+  std::uintmax_t bytes;        ///< What was asked for.
 };
 
 /// Since the program began. Exact as long as one thread is at work.

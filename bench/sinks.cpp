@@ -2,99 +2,120 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <fstream>
 #include <iterator>
+#include <stdexcept>
 
 #include "support/hex_text.h"
 
 namespace bench {
 namespace {
 
-constexpr u32 vic_count = 64;
-constexpr std::size_t largest_payload = 31;
-constexpr std::size_t short_audio_size = 3;
-/// Range limits as the base block has them.
-constexpr u8 limits[] = {23, 61, 15, 90, 30};
+constexpr std::size_t block_size = 128;
 
-bytes_t base_block() {
-  return test_support::base_block_builder_t()
-      .descriptor(0, test_support::timing_descriptor(test_support::timing_of_vic(16)))
-      .descriptor(1, test_support::timing_descriptor(test_support::timing_of_vic(4)))
-      .descriptor(2, test_support::text_descriptor(0xFC, "BENCH SINK"))
-      .descriptor(3, test_support::range_limits_descriptor(limits[0], limits[1], limits[2], limits[3], limits[4]))
-      .extensions(1)
-      .build();
+bytes_t raw_bytes(const std::filesystem::path &file) {
+  std::ifstream stream(file, std::ios::binary);
+  return {std::istreambuf_iterator<char>(stream), {}};
 }
 
-bytes_t hdmi_block() {
-  return test_support::hdmi_block({0x10, 0x00, 0xB8, 0x3C});
-}
-
-/// Payload bytes as data blocks of one kind, as many as they need; none is cut inside of @p unit bytes.
-void add_blocks(test_support::extension_builder_t *extension, const bytes_t &payload, std::size_t unit,
-                bytes_t (*block)(const bytes_t &)) {
-  const std::size_t step = largest_payload / unit * unit;
-  for (std::size_t begin = 0; begin < payload.size(); begin += step) {
-    const auto first = payload.begin() + static_cast<std::ptrdiff_t>(begin);
-    const auto last = payload.begin() + static_cast<std::ptrdiff_t>(std::min(begin + step, payload.size()));
-    extension->block(block(bytes_t(first, last)));
-  }
-}
-
-bytes_t video_payload(u32 count) {
+/// A data block with a payload of @p size bytes, made from one descriptor over and over again.
+bytes_t block_of(u8 tag, std::size_t size, const bytes_t &descriptor) {
   bytes_t payload;
-  for (u32 i = 0; i < count; ++i)
-    payload.push_back(static_cast<u8>(1 + i % vic_count));
-  return payload;
+  while (payload.size() < size)
+    payload.insert(payload.end(), descriptor.begin(), descriptor.end());
+  payload.resize(size);
+  return test_support::data_block(tag, payload);
 }
 
-/// Types 2 to 14 over again, with 2 to 8 channels, so that no two are equal.
-bytes_t audio_payload(u32 count) {
-  bytes_t payload;
-  for (u32 i = 0; i < count; ++i) {
-    constexpr u32 first_type = 2;
-    constexpr u32 types = 13;
-    const u32 type = first_type + i % types;
-    const u32 channels = 1 + i / types;
-    payload.insert(payload.end(), {static_cast<u8>(type << 3 | channels), 0x07, 0x50});
+/// @p count descriptors, each one larger than the one before.
+bytes_t ascending(u8 first, u8 count, u8 step, const bytes_t &rest) {
+  bytes_t descriptors;
+  for (u8 i = 0; i < count; ++i) {
+    descriptors.push_back(static_cast<u8>(first + i * step));
+    descriptors.insert(descriptors.end(), rest.begin(), rest.end());
   }
-  return payload;
+  return descriptors;
 }
 
-sink_t sink_of(const std::string &name, u32 video, u32 audio) {
-  test_support::extension_builder_t extension;
-  extension.flags(0xF0);
-  add_blocks(&extension, video_payload(video), 1, test_support::video_block);
-  add_blocks(&extension, audio_payload(audio), short_audio_size, test_support::audio_block);
-  extension.block(hdmi_block());
-  return {name, test_support::join(base_block(), extension.build())};
+/// A detailed timing with that pixel clock; of the rest only the width is there.
+bytes_t timing_bytes(u8 clock_low, u8 clock_high) {
+  constexpr std::size_t descriptor_size = 18;
+  bytes_t bytes{clock_low, clock_high, 0x03};
+  bytes.resize(descriptor_size);
+  return bytes;
 }
 
 }  // namespace
 
-const std::vector<sink_t> &sample_sinks() {
-  static const std::vector<sink_t> sinks = [] {
-    std::vector<sink_t> found;
-    for (const auto &entry : std::filesystem::directory_iterator(EXAMPLES_DIR "/sinks")) {
-      if (entry.path().extension() != ".txt") continue;
-      found.push_back({entry.path().stem().string(), test_support::bytes_of_hex_file(entry.path().string())});
-    }
-    std::sort(found.begin(), found.end(), [](const sink_t &a, const sink_t &b) { return a.name < b.name; });
-    return found;
-  }();
+std::vector<sink_t> sinks_of(const std::string &folder) {
+  std::vector<sink_t> sinks;
+  for (const auto &file : std::filesystem::directory_iterator(folder)) {
+    const std::string name = file.path().stem().string();
+    if (file.path().extension() == ".bin") sinks.push_back({name, raw_bytes(file.path())});
+    if (file.path().extension() == ".txt")
+      sinks.push_back({name, test_support::bytes_of_hex_file(file.path().string())});
+  }
+  std::sort(sinks.begin(), sinks.end(), [](const sink_t &a, const sink_t &b) { return a.name < b.name; });
   return sinks;
 }
 
-sink_t sink_with_video(u32 count) {
-  return sink_of("video", count, 0);
+sink_t sink_of(const std::string &folder, const std::string &name) {
+  for (sink_t &sink : sinks_of(folder)) {
+    if (sink.name == name) return sink;
+  }
+  throw std::runtime_error("no sink " + name + " in " + folder);
 }
 
-sink_t sink_with_every_vic() {
-  return sink_of("every_vic", vic_count, 0);
+const std::vector<hostile_family_t> &hostile_families() {
+  constexpr u8 audio = 1;
+  constexpr u8 video = 2;
+  constexpr u8 longest = 31;
+  constexpr u8 unbounded = 0;
+  constexpr u8 timings_only = 4;
+  constexpr u8 first_vic_without_timing = 95;
+  // 3D is present with structures for all of a mask of modes; 30 bytes of 3D information.
+  const bytes_t full_hdmi_block =
+      test_support::hdmi_block({0x10, 0x00, 0xB8, 60,   0x20, 0xC0, 0x1E, 0xFF, 0xFF, 0xFF, 0xFF, 0x10, 0x20, 0x30,
+                                0x40, 0x50, 0x60, 0x70, 0x80, 0x80, 0x90, 0xA0, 0xB0, 0xC0, 0xD0, 0xE0, 0xF0, 0xF1});
+  static const std::vector<hostile_family_t> families = {
+      {"known_vics", "short video descriptors", unbounded, {}, test_support::video_block(ascending(1, longest, 1, {}))},
+      // The first block is shorter so that the last one begins at the last byte but one, and reads 30 bytes that are
+      // not there.
+      {"unknown_vics", "short video descriptors of a VIC without a timing", unbounded,
+       block_of(video, 25, {first_vic_without_timing}), block_of(video, longest, {first_vic_without_timing})},
+      {"audio_formats",
+       "short audio descriptors, of ten types",
+       unbounded,
+       {},
+       test_support::audio_block(ascending(0x0F, 10, 8, {0x07, 0x07}))},
+      {"malformed_audio", "short audio descriptors of type 0", unbounded, {}, block_of(audio, 30, {0x00, 0x07, 0x07})},
+      {"hdmi_blocks", "16 short video descriptors, then HDMI blocks that give all of them 3D", unbounded,
+       test_support::video_block(ascending(1, 16, 1, {})), full_hdmi_block},
+      {"overlapping_hdmi",
+       "HDMI blocks of 11 bytes, each with 31 bytes of 3D information after its end",
+       unbounded,
+       {},
+       test_support::hdmi_block({0x00, 0x00, 0x00, 0x00, 0x20, 0x80, 0x1F})},
+      {"empty_blocks", "data blocks without a payload", unbounded, {}, {0x00}},
+      {"timings", "detailed timings that no VIC has", timings_only, {}, timing_bytes(0x01, 0x01)},
+      {"malformed_timings",
+       "18 bytes that are neither a detailed timing nor a descriptor",
+       timings_only,
+       {},
+       timing_bytes(0x00, 0x00)},
+  };
+  return families;
 }
 
-sink_t sink_with_audio(u32 count) {
-  constexpr u32 video = 16;
-  return sink_of("audio", video, count);
+bytes_t hostile_sink(const hostile_family_t &family, std::size_t size) {
+  bytes_t extension{0x02, 0x03, family.timings_offset, 0x00};
+  extension.insert(extension.end(), family.begin.begin(), family.begin.end());
+  while (extension.size() < size - block_size)
+    extension.insert(extension.end(), family.pattern.begin(), family.pattern.end());
+  extension.resize(size - block_size);
+  test_support::mend_checksum(extension, 0);
+  const auto announced = static_cast<u8>(std::min<std::size_t>(size / block_size - 1, 255));
+  return test_support::join(test_support::base_block_builder_t().extensions(announced).build(), extension);
 }
 
 }  // namespace bench

@@ -1,4 +1,4 @@
-// The sinks that are measured.
+// The sinks that are measured: files, and made ones that take the library as long as possible.
 #pragma once
 
 #include <string>
@@ -13,21 +13,26 @@ using test_support::bytes_t;
 struct sink_t {
   std::string name;
   bytes_t bytes;
-
-  const u8 *data() const { return bytes.data(); }
-  u32 size() const { return static_cast<u32>(bytes.size()); }
 };
 
-/// Those of examples/sinks, by name.
-const std::vector<sink_t> &sample_sinks();
+/// The EDIDs of a folder, by name: raw ones (.bin) and hexadecimal texts (.txt).
+std::vector<sink_t> sinks_of(const std::string &folder);
 
-/// A sink with @p count short video descriptors, VICs 1 to 64 and over again; at most 80.
-sink_t sink_with_video(u32 count);
+/// The one of that name in a folder. Throws std::runtime_error when it is not there.
+sink_t sink_of(const std::string &folder, const std::string &name);
 
-/// A sink with 64 short video descriptors, one for each VIC.
-sink_t sink_with_every_vic();
+/// An extension that is filled with one pattern.
+struct hostile_family_t {
+  const char *name;
+  const char *what;   ///< What the pattern is, in words.
+  u8 timings_offset;  ///< Byte 2. Below 4, data blocks run through all the bytes there are.
+  bytes_t begin;      ///< Stands once before the pattern.
+  bytes_t pattern;
+};
 
-/// A sink with 16 short video and @p count short audio descriptors, of the types that take one each; at most 18.
-sink_t sink_with_audio(u32 count);
+const std::vector<hostile_family_t> &hostile_families();
+
+/// A sink of @p size bytes, a multiple of 128 and at least 256.
+bytes_t hostile_sink(const hostile_family_t &family, std::size_t size);
 
 }  // namespace bench

@@ -1,8 +1,6 @@
 #include "stack_meter.h"
 
 #include <pthread.h>
-#include <sys/wait.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <cstdint>
@@ -43,24 +41,7 @@ std::size_t touched(const std::function<void()> &operation) {
 }  // namespace
 
 std::size_t stack_use_of(const std::function<void()> &operation) {
-  // In a process of its own: the C library's heap is slower for good once a process has had a second thread.
-  int ends[2];
-  if (pipe(ends) != 0) throw std::runtime_error("cannot make a pipe");
-  const pid_t child = fork();
-  if (child < 0) throw std::runtime_error("cannot fork");
-  if (child == 0) {
-    const std::size_t use = touched(operation) - touched([] {});
-    _exit(write(ends[1], &use, sizeof use) == sizeof use ? 0 : 1);
-  }
-  close(ends[1]);
-  std::size_t use = 0;
-  const bool received = read(ends[0], &use, sizeof use) == sizeof use;
-  close(ends[0]);
-  int status = 0;
-  if (waitpid(child, &status, 0) != child || status != 0 || !received) {
-    throw std::runtime_error("the measuring process failed");
-  }
-  return use;
+  return touched(operation) - touched([] {});
 }
 
 }  // namespace bench

@@ -1,11 +1,15 @@
 // Makes blocks pass the first checks of the decoders, so that a fuzzer's bytes get behind them.
 #pragma once
 
+#include <cstddef>
+
 #include "edid_composer.h"
 
 namespace fuzz {
 
 inline constexpr u32 block_size = 128;
+/// A base block and the 255 extensions that it can announce.
+inline constexpr std::size_t longest_sink = 256 * block_size;
 
 inline void mend_checksum(u8 *block) {
   u32 sum = 0;

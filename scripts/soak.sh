@@ -17,12 +17,14 @@ cmake --preset fuzz
 for target in $targets; do
   cmake --build --preset fuzz --target "fuzz_$target"
 done
+# A sink of 32,768 bytes, and the settings and configuration before it.
+longest_input=36864
 corpus=build/fuzz/corpus
 findings=build/fuzz/findings
 for target in $targets; do
   mkdir -p "$corpus/$target" "$findings/$target"
   echo "fuzz_$target"
-  build/fuzz/bin/"fuzz_$target" -max_total_time="$seconds" -timeout=10 -max_len=2048 -print_final_stats=1 \
+  build/fuzz/bin/"fuzz_$target" -max_total_time="$seconds" -timeout=10 -max_len="$longest_input" -print_final_stats=1 \
     -artifact_prefix="$findings/$target/" "$corpus/$target" "fuzz/seeds/$target" 2>"$corpus/$target.log" || {
     tail -40 "$corpus/$target.log" >&2
     exit 1

@@ -93,7 +93,6 @@ compose_cfg_t settings(fuzz::fuzz_input_t *input, u8 *spa_offset) {
 }  // namespace
 
 int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
-  constexpr std::size_t longest_sink = 512;
   constexpr u32 edid_size = 256;
   fuzz::fuzz_input_t input(data, size);
   const u8 options = input.byte();
@@ -104,7 +103,7 @@ int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
   if ((options & 4) != 0) tree.fill_completely();
   if ((options & 8) != 0) add_modes(&input, &tree);
   add_anything(&input, &tree);
-  auto sink = input.rest(longest_sink);
+  auto sink = input.rest(fuzz::longest_sink);
   if ((options & 16) != 0 && sink.size >= fuzz::block_size) fuzz::mend_base_block(sink.bytes.get());
   if ((options & 32) != 0 && sink.size >= 2 * fuzz::block_size) {
     fuzz::mend_extension(sink.bytes.get() + fuzz::block_size);

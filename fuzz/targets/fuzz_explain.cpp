@@ -13,7 +13,6 @@
 #include "sink_bytes.h"
 
 int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
-  constexpr std::size_t longest_sink = 512;
   if (!config_store_load_default()) return 0;
   const edid_cli::platform_places_t places("default platform");
   fuzz::fuzz_input_t input(data, size);
@@ -22,7 +21,7 @@ int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
   options.settings.audio_mask = input.flag() ? edid_cli::all_audio_formats : input.number();
   options.settings.audio_sink_filter = input.below(2);
   options.settings.hdmi_3d_mode = static_cast<i32>(input.below(3));
-  auto bytes = input.rest(longest_sink);
+  auto bytes = input.rest(fuzz::longest_sink);
   if ((mended & 1) != 0 && bytes.size >= fuzz::block_size) fuzz::mend_base_block(bytes.bytes.get());
   if ((mended & 2) != 0 && bytes.size >= 2 * fuzz::block_size) {
     fuzz::mend_extension(bytes.bytes.get() + fuzz::block_size);

@@ -1,13 +1,12 @@
-// Extensions of any length from 0 to 512: byte 0 says what is mended, the rest is the extension.
+// Extensions of any length from 0 to that of the longest sink: byte 0 says what is mended, the rest is the extension.
 #include "fuzz_input.h"
 #include "fuzz_target.h"
 #include "sink_bytes.h"
 
 int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
-  constexpr std::size_t longest = 512;
   fuzz::fuzz_input_t input(data, size);
   const u8 options = input.byte();
-  auto extension = input.rest(longest);
+  auto extension = input.rest(fuzz::longest_sink - fuzz::block_size);
   if ((options & 1) != 0 && extension.size >= fuzz::block_size) fuzz::mend_extension(extension.bytes.get());
   debug_enable((options & 2) != 0);
 

@@ -4,10 +4,9 @@
 #include "sink_bytes.h"
 
 int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
-  constexpr std::size_t longest = 640;
   fuzz::fuzz_input_t input(data, size);
   const u8 options = input.byte();
-  auto edid = input.rest(longest);
+  auto edid = input.rest(fuzz::longest_sink);
   // The base block must be there whatever the size says.
   if (edid.size < fuzz::block_size) edid = input.block(fuzz::block_size);
   if ((options & 1) != 0) fuzz::mend_base_block(edid.bytes.get());
