@@ -55,8 +55,8 @@ void write_times(const bench::sink_t &sink, const char *what, const bench::platf
 }
 
 void measure(const char *folder, std::FILE *results) {
-  constexpr int rounds = 300;
-  constexpr int hostile_rounds = 20;
+  constexpr int rounds = 2000;
+  constexpr int hostile_rounds = 60;
   bench::platform_t platform;
   const char *separator = "";
   std::fprintf(results, "{\"sinks\": [");
