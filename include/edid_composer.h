@@ -964,7 +964,7 @@ enum compose_extension_status {
 };
 
 /**
- * What a composition works from. Zero-fill it, set @ref size, and set what is needed.
+ * What a composition works from. Zero-fill it, set size, and set what is needed.
  *
  * Later versions append members; one that is not there, because the caller was compiled earlier, counts as zero.
  */
@@ -986,7 +986,7 @@ typedef struct compose_request_t {
   void *configuration_observer_context;            /**< Goes to @ref configuration_observer as it is. */
 } compose_request_t;
 
-/** What a composition returns. Set @ref size; all other members are filled, on failure too. */
+/** What a composition returns. Set size; all other members are filled, on failure too. */
 typedef struct compose_result_t {
   u32 size;                    /**< sizeof(compose_result_t) of the caller. */
   u32 bytes_written;           /**< Bytes of the new EDID: 256; 0 when the composition failed. */

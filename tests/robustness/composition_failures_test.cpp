@@ -30,7 +30,8 @@ std::string diagnostics_in(const std::string &output) {
   std::string diagnostics;
   for (const std::string &line : test_support::lines_in(output)) {
     if (!test_support::matches(line, "\\w+:N:\\w+\\(\\) (ERROR|WARNING|BUG): .*")) continue;
-    diagnostics += test_support::replaced(line, "0x[0-9a-f]+|[0-9]+", "#") + "\n";
+    diagnostics +=
+        test_support::replaced(test_support::replaced(line, "0x[0-9a-f]+|[0-9]+", "#"), "Magic:-#", "Magic:#") + "\n";
   }
   return diagnostics;
 }
