@@ -12,7 +12,7 @@ cd "$(dirname "$0")/.."
 
 echo 'Building the library, the program and their tests, and running them.'
 install_packages build-essential cmake ninja-build git python3 libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev \
-  nlohmann-json3-dev libutfcpp-dev edid-decode
+  nlohmann-json3-dev libutfcpp-dev edid-decode v4l-utils shellcheck
 
 warnings_are_errors=OFF
 if [ "${CI:-}" = true ]; then

@@ -36,7 +36,7 @@ void print_mode(const char *indent, const short_video_desc_t &video) {
 }
 
 void print_modes(const char *indent, const edid_t *edid) {
-  for (const auto &video : walk<const short_video_desc_t>(LIST(&edid->video_list))) {
+  for (const auto &video : walk<const short_video_desc_t>(LIST(&edid->video_list, "&edid->video_list"))) {
     print_mode(indent, video);
     print(" %s\n", native(video.native));
   }
@@ -56,7 +56,7 @@ void print_hdmi_vics(const char *indent, const edid_t &edid) {
 }
 
 void print_audio(const char *indent, const edid_t *edid) {
-  for (const auto &audio : walk<const short_audio_desc_t>(LIST(&edid->audio_list))) {
+  for (const auto &audio : walk<const short_audio_desc_t>(LIST(&edid->audio_list, "&edid->audio_list"))) {
     print("%s", indent);
     print_audio_structure(&audio);
   }
@@ -132,7 +132,7 @@ void print_features(const edid_t &edid) {
 
 void print_standard_timings(const edid_t *edid) {
   print("\nStandard Timings: - %d timings\n", ll_size(&edid->std_timings));
-  for (const auto &timing : walk<const std_timing_t>(LIST(&edid->std_timings))) {
+  for (const auto &timing : walk<const std_timing_t>(LIST(&edid->std_timings, "&edid->std_timings"))) {
     print("\t%dx", timing.h_active);
     if (timing.aspect_ratio < std::size(aspect_ratios)) {
       const aspect_ratio_t &aspect = aspect_ratios[timing.aspect_ratio];
@@ -152,7 +152,7 @@ void print_detailed_timing(i32 number, const detailed_timing_t &timing) {
 void print_detailed_timings(const edid_t *edid) {
   print("\nDetailed Timing Descriptions: - %d timings\n", ll_size(&edid->dtd_list));
   i32 number = 0;
-  for (const auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list))) {
+  for (const auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list, "&edid->dtd_list"))) {
     if (timing.valid != 0) print_detailed_timing(number, timing);
     ++number;
   }

@@ -5,7 +5,7 @@ namespace edid_composer {
 const ll_entry_t *begin_checked_walk(const named_list_t &named, const char *type_name) {
   if (!ll_verify_list_type(named.list, type_name)) log_error(named.site, named.line, "The list types don't match.");
   if (named.list == nullptr) {
-    log_bug(named.site, named.line, "The list:%s of type:%s is NULL.", named.expression, type_name);
+    log_bug(named.site, named.line, "The list:%s of type:%s is NULL.", named.label, type_name);
     return nullptr;
   }
   return named.list->head;

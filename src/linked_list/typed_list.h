@@ -3,7 +3,7 @@
 // The walk over a list compares the list's tag with the element type's and the pointer with NULL, reports what is wrong
 // in the name of the scope's operation, and goes through the elements from front to back:
 //
-//   for (const auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list))) ...
+//   for (const auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list, "&edid->dtd_list"))) ...
 //
 // Elements are appended as copies, one or several:
 //
@@ -58,14 +58,14 @@ record_t *entry_at(const ll_list_t *list, i32 index) {
   return static_cast<record_t *>(payload);
 }
 
-/// A list as a walk is given it: with the text of the expression that stands for it, and the operation that walks.
+/// A list as a walk is given it: with its label in the log, and the operation that walks.
 struct named_list_t {
   const ll_list_t *list;
-  const char *expression;
+  const char *label;
   const site_t &site;
   int line;
 };
-#define LIST(list) (::edid_composer::named_list_t{(list), #list, site, __LINE__})
+#define LIST(list, label) (::edid_composer::named_list_t{(list), (label), site, __LINE__})
 
 /// Makes the two checks and reports; returns the first entry, or null when there is none.
 [[gnu::cold]] const ll_entry_t *begin_checked_walk(const named_list_t &named, const char *type_name);

@@ -56,11 +56,11 @@ void add_ignored_formats(const inputs_t &inputs, decisions_t *decisions) {
   };
   i32 index = 0;
   if (pass_through >= sink_only && is_walkable<i32>(platform_audio)) {
-    for (const i32 value : walk<const i32>(LIST(&platform_audio)))
+    for (const i32 value : walk<const i32>(LIST(&platform_audio, "&platform_audio")))
       ignore(COMPOSE_ORIGIN_PLATFORM_AUDIO, index++, type_of(value), COMPOSE_REASON_SINK_FORMATS_ONLY);
   }
   if (pass_through <= platform_only && is_walkable<short_audio_desc_t>(sink_audio)) {
-    for (const auto &audio : walk<const short_audio_desc_t>(LIST(&sink_audio)))
+    for (const auto &audio : walk<const short_audio_desc_t>(LIST(&sink_audio, "&sink_audio")))
       ignore(COMPOSE_ORIGIN_SINK_AUDIO, index++, audio.type, COMPOSE_REASON_PLATFORM_FORMATS_ONLY);
   }
 }

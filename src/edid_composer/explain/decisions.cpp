@@ -95,7 +95,7 @@ compose_decision_t *decisions_t::nominate(compose_subject subject, u32 code, com
 void decisions_t::nominate_modes(const ll_list_t &modes, compose_origin origin) {
   if (!is_walkable<short_video_desc_t>(modes)) return;
   i32 index = 0;
-  for (const auto &mode : walk<const short_video_desc_t>(LIST(&modes)))
+  for (const auto &mode : walk<const short_video_desc_t>(LIST(&modes, "&modes")))
     nominate(COMPOSE_SUBJECT_VIDEO_MODE, mode.vic, origin, index++);
 }
 

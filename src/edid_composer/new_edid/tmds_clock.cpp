@@ -61,7 +61,7 @@ u32 _maximum_pixel_clock(const ll_list_t *vic_list) {
     return 0;
   }
   u32 maximum = 0;
-  for (const auto &video : walk<const short_video_desc_t>(LIST(vic_list))) {
+  for (const auto &video : walk<const short_video_desc_t>(LIST(vic_list, "vic_list"))) {
     detailed_timing_t timing{};
     if (convert_vic_to_dtd(video.vic, &timing) != 1) {
       LOG_BUG("\tFailed converting VIC:%d to a DTD.", video.vic);

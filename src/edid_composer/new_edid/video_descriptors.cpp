@@ -42,7 +42,7 @@ bool add_detailed_timings(const ll_list_t &modes, ll_list_t *timings, entry_aren
 void trace_video_modes(const ll_list_t *video_list) {
   if (!is_tracing()) return;
   log_trace(site, __LINE__, "\tNew EDID List of VICs:");
-  for (const auto &video : walk<const short_video_desc_t>(LIST(video_list))) {
+  for (const auto &video : walk<const short_video_desc_t>(LIST(video_list, "video_list"))) {
     print("\t\tVIC:%d %s %s %s %s %s\n", video.vic, short_video_timing_string(video.vic),
           (video.stereo & STEREO_FRAME_PACKING) != 0 ? "FP" : "",
           (video.stereo & STEREO_SIDE_BY_SIDE_HALF) != 0 ? "SBSH" : "",

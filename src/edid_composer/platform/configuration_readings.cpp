@@ -49,6 +49,7 @@ bool is_taken(configuration_reason reason) {
 
 void configuration_readings_t::note(const configuration_key_t &key, const configuration_outcome_t &outcome,
                                     const char *text) const {
+  if (observer_ == nullptr) return;
   configuration_reading_t reading = reading_of(key, outcome);
   reading.text = text;
   pass_on(reading);
@@ -56,6 +57,7 @@ void configuration_readings_t::note(const configuration_key_t &key, const config
 
 void configuration_readings_t::note_entry(const configuration_entry_t &entry, const configuration_outcome_t &outcome,
                                           i32 place) const {
+  if (observer_ == nullptr) return;
   configuration_reading_t reading = reading_of(*entry.key, outcome);
   reading.entry = entry.index;
   reading.place = place;
@@ -66,6 +68,7 @@ void configuration_readings_t::note_entry(const configuration_entry_t &entry, co
 
 void configuration_readings_t::note_audio_format(const configuration_key_t &key, i32 letter, i32 value,
                                                  i32 place) const {
+  if (observer_ == nullptr) return;
   configuration_reading_t reading = reading_of(key, {.found = value, .used = value});
   reading.entry = letter;
   reading.place = place;
@@ -74,11 +77,12 @@ void configuration_readings_t::note_audio_format(const configuration_key_t &key,
 
 void configuration_readings_t::note_list(const configuration_key_t &key, configuration_reason reason, i32 entries,
                                          i32 counting) const {
+  if (observer_ == nullptr) return;
   pass_on(reading_of(key, {.reason = reason, .found = entries, .used = counting}));
 }
 
 void configuration_readings_t::pass_on(const configuration_reading_t &reading) const {
-  if (observer_ != nullptr) observer_(&reading, context_);
+  observer_(&reading, context_);
 }
 
 }  // namespace edid_composer

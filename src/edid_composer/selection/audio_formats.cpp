@@ -90,11 +90,10 @@ void note(compose_origin origin, i32 index, const format_outcome_t &outcome, jou
 }
 
 bool add_platform_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *journal) {
-  const platform_values_t *const platform_values = &inputs.platform;
   appender_t<short_audio_desc_t> chosen(formats, inputs.arena, site);
   i32 index = 0;
   LOG_TRACE("\tReading the platform audio modes:");
-  for (const auto &value : walk<const i32>(LIST(&platform_values->audio_list))) {
+  for (const auto &value : walk<const i32>(LIST(&inputs.platform.audio_list, "&platform_values->audio_list"))) {
     const format_outcome_t outcome = judge_platform_format(inputs, value, *formats);
     note(COMPOSE_ORIGIN_PLATFORM_AUDIO, index++, outcome, journal);
     if (outcome.chosen && !chosen.append(outcome.audio)) return false;
@@ -103,11 +102,10 @@ bool add_platform_formats(const inputs_t &inputs, ll_list_t *formats, journal_t 
 }
 
 bool add_sink_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *journal) {
-  const edid_t *const edid = &inputs.sink;
   appender_t<short_audio_desc_t> chosen(formats, inputs.arena, site);
   i32 index = 0;
   LOG_TRACE("\tExamining downstream audio formats:");
-  for (const auto &audio : walk<const short_audio_desc_t>(LIST(&edid->audio_list))) {
+  for (const auto &audio : walk<const short_audio_desc_t>(LIST(&inputs.sink.audio_list, "&edid->audio_list"))) {
     const format_outcome_t outcome = judge_sink_format(inputs, audio, *formats);
     note(COMPOSE_ORIGIN_SINK_AUDIO, index++, outcome, journal);
     if (outcome.chosen && !chosen.append(outcome.audio)) return false;
@@ -116,7 +114,7 @@ bool add_sink_formats(const inputs_t &inputs, ll_list_t *formats, journal_t *jou
 }
 
 bool ensure_basic_audio(ll_list_t *formats, entry_arena_t *arena, journal_t *journal) {
-  for (const auto &audio : walk<const short_audio_desc_t>(LIST(formats))) {
+  for (const auto &audio : walk<const short_audio_desc_t>(LIST(formats, "formats"))) {
     LOG_TRACE("\tEntry:%d Channels:%d", audio.type, audio.channels);
     if (is_basic_audio(audio)) {
       LOG_TRACE("\tFound a \"basic audio\" PCM 2-chan entry.");

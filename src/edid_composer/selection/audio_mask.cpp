@@ -14,7 +14,7 @@ u32 _audio_type_to_audio_mask(u32 type) {
 u32 _create_audio_mask(const ll_list_t *list) {
   REPORTS_AS(_create_audio_mask);
   u32 mask = 0;
-  for (const auto &audio : walk<const short_audio_desc_t>(LIST(list)))
+  for (const auto &audio : walk<const short_audio_desc_t>(LIST(list, "list")))
     mask |= _audio_type_to_audio_mask(audio.type);
   return mask;
 }

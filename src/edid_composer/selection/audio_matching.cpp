@@ -39,7 +39,7 @@ short_audio_desc_t narrowed(const short_audio_desc_t &audio, const short_audio_d
 std::optional<i32> _audio_format_in_list(const ll_list_t *audio_list, const short_audio_desc_t &audio) {
   REPORTS_AS(_audio_format_in_list);
   i32 place = 0;
-  for (const auto &entry : walk<const short_audio_desc_t>(LIST(audio_list))) {
+  for (const auto &entry : walk<const short_audio_desc_t>(LIST(audio_list, "audio_list"))) {
     if (covers(entry, audio)) return place;
     ++place;
   }
@@ -49,7 +49,7 @@ std::optional<i32> _audio_format_in_list(const ll_list_t *audio_list, const shor
 std::optional<short_audio_desc_t> _audio_format_in_downstream_sink(const edid_t *edid,
                                                                    const short_audio_desc_t &audio) {
   REPORTS_AS(_audio_format_in_downstream_sink);
-  for (const auto &sink : walk<const short_audio_desc_t>(LIST(&edid->audio_list))) {
+  for (const auto &sink : walk<const short_audio_desc_t>(LIST(&edid->audio_list, "&edid->audio_list"))) {
     if (matches(sink, audio)) return narrowed(audio, sink);
   }
   return std::nullopt;

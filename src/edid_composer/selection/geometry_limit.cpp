@@ -29,7 +29,7 @@ geometry_limit_t limit_geometry(const inputs_t &inputs, candidates_t *candidates
 u32 _find_largest_height(const ll_list_t *video_list) {
   REPORTS_AS(_find_largest_height);
   u32 largest = 0;
-  for (const auto &video : walk<const short_video_desc_t>(LIST(video_list))) {
+  for (const auto &video : walk<const short_video_desc_t>(LIST(video_list, "video_list"))) {
     const std::optional<u32> height = height_of<site>(video.vic);
     if (height > largest) largest = *height;
   }

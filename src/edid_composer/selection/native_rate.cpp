@@ -27,7 +27,7 @@ found_rate_t rate_of_timing(i32 index, const detailed_timing_t &timing, compose_
 
 found_rate_t rate_of_detailed_timings(const edid_t *edid) {
   i32 index = 0;
-  for (const auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list))) {
+  for (const auto &timing : walk<const detailed_timing_t>(LIST(&edid->dtd_list, "&edid->dtd_list"))) {
     const found_rate_t found = rate_of_timing(index++, timing, COMPOSE_REASON_RATE_OF_DETAILED_TIMING);
     if (found) return found;
   }
@@ -36,7 +36,7 @@ found_rate_t rate_of_detailed_timings(const edid_t *edid) {
 
 found_rate_t rate_of_standard_timings(const edid_t *edid) {
   i32 index = 0;
-  for (const auto &timing : walk<const std_timing_t>(LIST(&edid->std_timings))) {
+  for (const auto &timing : walk<const std_timing_t>(LIST(&edid->std_timings, "&edid->std_timings"))) {
     const u32 rate = timing.refresh_rate;
     if (rate == 60 || rate == 59) {
       LOG_TRACE("Found a standard timing number: index #%d had a %dHz refresh rate. Using %d as native rate.", index,
@@ -50,7 +50,7 @@ found_rate_t rate_of_standard_timings(const edid_t *edid) {
 
 found_rate_t rate_of_short_video_descriptors(const edid_t *edid) {
   i32 index = 0;
-  for (const auto &video : walk<const short_video_desc_t>(LIST(&edid->video_list))) {
+  for (const auto &video : walk<const short_video_desc_t>(LIST(&edid->video_list, "&edid->video_list"))) {
     detailed_timing_t timing{};
     if (convert_vic_to_dtd(video.vic, &timing) == 1) {
       const found_rate_t found = rate_of_timing(index, timing, COMPOSE_REASON_RATE_OF_SHORT_VIDEO);

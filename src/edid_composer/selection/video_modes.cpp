@@ -26,10 +26,10 @@ bool add_timings(const edid_t &sink, const named_list_t &timings, compose_origin
 }
 
 bool add_sink_modes(const edid_t *edid, candidates_t *candidates, journal_t *journal) {
-  if (!add_timings(*edid, LIST(&edid->dtd_list), COMPOSE_ORIGIN_DETAILED_TIMING, convert_dtd_to_vic, candidates,
-                   journal) ||
-      !add_timings(*edid, LIST(&edid->std_timings), COMPOSE_ORIGIN_STANDARD_TIMING, convert_std_to_vic, candidates,
-                   journal)) {
+  if (!add_timings(*edid, LIST(&edid->dtd_list, "&edid->dtd_list"), COMPOSE_ORIGIN_DETAILED_TIMING, convert_dtd_to_vic,
+                   candidates, journal) ||
+      !add_timings(*edid, LIST(&edid->std_timings, "&edid->std_timings"), COMPOSE_ORIGIN_STANDARD_TIMING,
+                   convert_std_to_vic, candidates, journal)) {
     return false;
   }
   if (_combine_lists(candidates, &edid->video_list, true)) return true;
@@ -56,12 +56,12 @@ bool prioritize(const ll_list_t *list, const candidates_t &candidates, appender_
                 journal_t *journal) {
   if (is_tracing()) {
     log_trace(site, __LINE__, "\tPrioritization List:");
-    for (const auto &video : walk<const short_video_desc_t>(LIST(list)))
+    for (const auto &video : walk<const short_video_desc_t>(LIST(list, "list")))
       print_mode(video);
     log_trace(site, __LINE__, "Prioritize the list of valid modes and remove duplicates. Modes:%d MasterList:%d",
               candidates.size(), ll_size(list));
   }
-  for (const auto &wanted : walk<const short_video_desc_t>(LIST(list))) {
+  for (const auto &wanted : walk<const short_video_desc_t>(LIST(list, "list"))) {
     const match_t match = candidates.match(wanted);
     if (!match.found) continue;
     if (!selected.append({.native = 0, .vic = wanted.vic, .stereo = match.stereo})) return false;
@@ -90,7 +90,7 @@ video_selection_t _filter_video_modes(const inputs_t &inputs, ll_list_t *modes, 
   selection.complete = selection.current_mode.complete;
   if (selection.complete && is_tracing()) {
     log_trace(site, __LINE__, "\tNew EDID List of VICs:");
-    for (const auto &video : walk<const short_video_desc_t>(LIST(modes)))
+    for (const auto &video : walk<const short_video_desc_t>(LIST(modes, "modes")))
       print_mode(video);
   }
   return selection;
@@ -104,7 +104,7 @@ bool _combine_lists(candidates_t *candidates, const ll_list_t *extra_list, bool 
     return false;
   }
   LOG_TRACE("Combine Lists:");
-  for (const auto &extra : walk<const short_video_desc_t>(LIST(extra_list))) {
+  for (const auto &extra : walk<const short_video_desc_t>(LIST(extra_list, "extra_list"))) {
     if (!candidates->add({.vic = extra.vic, .stereo = extra.stereo, .of_sink = of_sink}, site)) return false;
     LOG_TRACE("\tAdding video format:%d %s stereo:0x%03X", extra.vic, short_video_timing_string(extra.vic),
               extra.stereo);
