@@ -1,4 +1,3 @@
-
 #include "diagnostics.h"
 #include "edid_decode_encode/layout.h"
 #include "output.h"
