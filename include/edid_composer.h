@@ -473,6 +473,209 @@ EDID_COMPOSER_API bool platform_values_destroy(platform_values_t *values);
 EDID_COMPOSER_API void print_platform_node(u32 node, const char *label);
 /** @} */
 
+/** @defgroup hdmi2 What HDMI 2 adds
+ *
+ * What HDMI 1.4 has no words for: VICs above 64, YCbCr 4:2:0, HDR, wide colour, rates above 340 MHz, ALLM and VRR. It
+ * has records of its own beside @ref edid_t, plain ones: no lists, no pointers, free to be copied and moved.
+ *
+ * A composition uses it only when it is asked for twice: by @ref compose_edid_request, and by `enable`, either of the
+ * configuration's table `hdmi2` or of @ref compose_request_t::hdmi2.
+ *
+ * "HDMI 2.0" and "HDMI 2.1" are the High-Definition Multimedia Interface Specifications of these versions; "CTA-861" is
+ * CTA-861-G and later, which CEA-861 became.
+ * @{ */
+
+/** Most short video descriptors that are kept of a sink: 8 extensions of 123 bytes, headers of data blocks aside. */
+#define HDMI2_MOST_SVDS 952
+/** Most payload bytes of a data block (CTA-861, section 7.4). */
+#define HDMI2_MOST_BLOCK_BYTES 31
+
+/** A data block as it stands in a sink's EDID, which is passed on byte for byte. */
+typedef struct hdmi2_block_t {
+  u8 length; /**< Payload bytes, extended tag and OUI included; 0: the sink has no such block. */
+  u8 payload[HDMI2_MOST_BLOCK_BYTES]; /**< The bytes after the header byte; 0 after the first length of them. */
+} hdmi2_block_t;
+
+/** Bits of @ref hdmi2_t::eotfs (CTA-861, HDR static metadata data block, byte 2). */
+enum hdmi2_eotf {
+  HDMI2_EOTF_SDR = 0x01,   /**< Traditional gamma, standard dynamic range. */
+  HDMI2_EOTF_GAMMA = 0x02, /**< Traditional gamma, high dynamic range. */
+  HDMI2_EOTF_PQ = 0x04,    /**< SMPTE ST 2084, of HDR10. */
+  HDMI2_EOTF_HLG = 0x08    /**< Hybrid log-gamma. */
+};
+
+/** Bits of @ref hdmi2_t::colorimetry (CTA-861, colorimetry data block, byte 2). */
+enum hdmi2_colorimetry {
+  HDMI2_XVYCC601 = 0x01,    /**< xvYCC601. */
+  HDMI2_XVYCC709 = 0x02,    /**< xvYCC709. */
+  HDMI2_SYCC601 = 0x04,     /**< sYCC601. */
+  HDMI2_OPYCC601 = 0x08,    /**< opYCC601. */
+  HDMI2_OPRGB = 0x10,       /**< opRGB. */
+  HDMI2_BT2020_CYCC = 0x20, /**< BT.2020, constant luminance. */
+  HDMI2_BT2020_YCC = 0x40,  /**< BT.2020, YCbCr. */
+  HDMI2_BT2020_RGB = 0x80   /**< BT.2020, RGB. */
+};
+
+/**
+ * What the data blocks of all CTA-861 extensions of an EDID say of HDMI 2.
+ *
+ * Filled by @ref decode_hdmi2. Where a block comes more than once, the first that is long enough counts. Offsets below
+ * are bytes of the block, counted from its header byte.
+ */
+typedef struct hdmi2_t {
+  u32 size;                 /**< sizeof(hdmi2_t) of the caller; see @ref decode_hdmi2. */
+  u32 svd_count;            /**< Short video descriptors of all video data blocks. */
+  u8 svds[HDMI2_MOST_SVDS]; /**< Their bytes as stored, in block order; see @ref y420_map. */
+  /* HDMI Forum vendor-specific data block, or sink capability data structure (HDMI 2.1, section 10.3.2) */
+  u8 forum_present;  /**< 1 when the sink has one of at least 7 payload bytes. */
+  u8 forum_version;  /**< Its version (byte 4); 1. */
+  u32 max_tmds_rate; /**< Maximum TMDS character rate, MHz, a multiple of 5; 0: at most 340 (byte 5). */
+  u8 scdc;           /**< 1 when the status and control data channel is present (byte 6, bit 7). */
+  u8 read_request;   /**< 1 when it can ask to be read (byte 6, bit 6). */
+  u8 scramble_low;   /**< 1 when it takes scrambling at or below 340 MHz too (byte 6, bit 3). */
+  u8 frl_rate;       /**< Maximum fixed rate link code, 0 to 15 (byte 7, bits 7 to 4). */
+  u8 uhd_vic;        /**< 1 when it takes the VICs of the modes that have an HDMI_VIC (byte 7, bit 3). */
+  u8 dc_48bit_420;   /**< 1 when it takes 48-bit deep colour in YCbCr 4:2:0 (byte 7, bit 2). */
+  u8 dc_36bit_420;   /**< 1 when it takes 36-bit deep colour in YCbCr 4:2:0 (byte 7, bit 1). */
+  u8 dc_30bit_420;   /**< 1 when it takes 30-bit deep colour in YCbCr 4:2:0 (byte 7, bit 0). */
+  u8 allm_present;   /**< 1 when byte 8 is there. */
+  u8 allm;           /**< 1 when it takes the auto low-latency mode (byte 8, bit 1). */
+  u8 vrr_present;    /**< 1 when bytes 9 and 10 are there. */
+  u8 vrr_min;        /**< Lowest variable refresh rate, Hz, 0 to 63; 0: no VRR (byte 9, bits 5 to 0). */
+  u32 vrr_max;       /**< Highest variable refresh rate, Hz, 0 to 1023; 0: none said (bytes 9 and 10). */
+  /* Video capability data block (CTA-861, section 7.5.6) */
+  u8 video_capability_present; /**< 1 when the sink has one of at least 2 payload bytes. */
+  u8 ycc_quantization;         /**< 1 when the YCC quantization range is selectable (byte 2, bit 7). */
+  u8 rgb_quantization;         /**< 1 when the RGB quantization range is selectable (byte 2, bit 6). */
+  u8 preferred_scan;           /**< S_PT, behaviour for the preferred timing, 0 to 3 (byte 2, bits 5 and 4). */
+  u8 it_scan;                  /**< S_IT, behaviour for IT formats, 0 to 3 (byte 2, bits 3 and 2). */
+  u8 ce_scan;                  /**< S_CE, behaviour for CE formats, 0 to 3 (byte 2, bits 1 and 0). */
+  /* Colorimetry data block (CTA-861, section 7.5.5) */
+  u8 colorimetry_present; /**< 1 when the sink has one of at least 3 payload bytes. */
+  u8 colorimetry;         /**< Mask of @ref hdmi2_colorimetry (byte 2). */
+  u8 gamut_metadata;      /**< Gamut metadata profiles and what else stands there, as stored (byte 3). */
+  /* HDR static metadata data block (CTA-861, section 7.5.13) */
+  u8 hdr_static_present; /**< 1 when the sink has one of at least 3 payload bytes. */
+  u8 eotfs;              /**< Mask of @ref hdmi2_eotf, as stored (byte 2). */
+  u8 metadata_types;     /**< Static metadata descriptors, bit 0 for type 1, as stored (byte 3). */
+  u8 luminance_count;    /**< How many of the following three are there, 0 to 3 (bytes 4 to 6). */
+  u8 luminance[3];       /**< Codes of desired maximum, maximum frame-average and minimum luminance, as stored:
+                              50 x 2^(n / 32) cd/m2; the minimum is maximum x (n / 255)^2 / 100. */
+  /* YCbCr 4:2:0 (CTA-861, sections 7.5.10 and 7.5.11) */
+  u8 y420_count; /**< Modes of the 4:2:0 video data block: those that are taken in 4:2:0 only. */
+  u8 y420_vics[HDMI2_MOST_BLOCK_BYTES - 1]; /**< Their short video descriptors, as stored. */
+  u8 y420_map_present;                      /**< 1 when the sink has a 4:2:0 capability map data block. */
+  u8 y420_map_bytes; /**< Bytes of the map; 0: the block is there without one, and marks every descriptor. */
+  u8 y420_map[HDMI2_MOST_BLOCK_BYTES - 1]; /**< Bit i mod 8 of byte i / 8: @ref svds [i] is taken in 4:2:0 too. Bits
+                                                beyond @ref svd_count are 0. */
+  /* Blocks that can be passed on */
+  hdmi2_block_t hdr_dynamic;  /**< HDR dynamic metadata data block (CTA-861, section 7.5.14), at least 4 bytes. */
+  hdmi2_block_t hdr10plus;    /**< Vendor-specific video data block of HDR10+, at least 5 bytes. */
+  hdmi2_block_t dolby_vision; /**< Vendor-specific video data block of Dolby Vision, at least 9 bytes. */
+  hdmi2_block_t freesync;     /**< Vendor-specific data block of FreeSync, at least 8 bytes. */
+} hdmi2_t;
+
+/** Most entries of a list of @ref hdmi2_values_t. */
+#define HDMI2_MOST_LISTED_VICS 31
+
+/**
+ * What a platform says of HDMI 2: the keys of the configuration's table `hdmi2`, which have the same names.
+ *
+ * A host that has other sources than the configuration prepares one with @ref hdmi2_values_init, fills it and hands it
+ * over as @ref compose_request_t::hdmi2. "Tri-state" is 0 never, 1 always (the box does it itself), 2 as the sink,
+ * which without a sink is never. A value outside of its limits counts as the nearest limit, and a warning says so.
+ */
+typedef struct hdmi2_values_t {
+  u32 size;                                      /**< sizeof(hdmi2_values_t) of the caller. */
+  i32 enable;                                    /**< 1: compose with HDMI 2. 0: the other members have no effect. */
+  i32 vic_priority_list[HDMI2_MOST_LISTED_VICS]; /**< Modes that may be offered, best first: VICs from 65 to 127 and
+                                                      from 193 to 219; the first 0 ends the list. */
+  i32 vic_addition_list[HDMI2_MOST_LISTED_VICS]; /**< Modes that the box makes itself, whatever the sink takes; the
+                                                    first 0 ends the list. */
+  i32 tmds_limit;         /**< TMDS character rate that the box's receiver takes, MHz, 165 to 600. */
+  i32 preferred_extended; /**< 1: the first mode above VIC 64 becomes the first detailed timing. */
+  i32 scdc;               /**< 1: the receiver has the status and control data channel at any rate. */
+  i32 read_request;       /**< 1: the receiver can ask to be read. */
+  i32 scramble_low;       /**< 1: the receiver takes scrambling at or below 340 MHz. */
+  i32 y420;               /**< YCbCr 4:2:0, tri-state. */
+  i32 dc_30bit_420;       /**< 30-bit deep colour in 4:2:0, tri-state. */
+  i32 dc_36bit_420;       /**< 36-bit deep colour in 4:2:0, tri-state. */
+  i32 deep_color;         /**< 2: offer deep colour only where the sink has it too; 0: as the platform values say. */
+  i32 uhd_vic;            /**< 1: say that the VICs of the modes that have an HDMI_VIC are taken. */
+  i32 allm;               /**< Auto low-latency mode, tri-state. */
+  i32 vrr;                /**< Variable refresh rate, tri-state. */
+  i32 vrr_min;            /**< Lowest variable refresh rate, Hz, 1 to 48. */
+  i32 vrr_max;            /**< Highest variable refresh rate, Hz, 0 to 1023; 0: none said. */
+  i32 hdr_gamma;          /**< HDR with traditional gamma, tri-state. */
+  i32 hdr_pq;             /**< HDR with PQ (SMPTE ST 2084), tri-state. */
+  i32 hdr_hlg;            /**< HDR with hybrid log-gamma, tri-state. */
+  i32 hdr_luminance;      /**< Luminance: 0 none, 1 the three members below, 2 the sink's. */
+  i32 hdr_max;            /**< Desired maximum luminance, as coded in @ref hdmi2_t::luminance, 0 to 255. */
+  i32 hdr_average;        /**< Desired maximum frame-average luminance, likewise. */
+  i32 hdr_min;            /**< Desired minimum luminance, likewise. */
+  i32 bt2020_rgb;         /**< BT.2020 RGB, tri-state. */
+  i32 bt2020_ycc;         /**< BT.2020 YCbCr, tri-state. */
+  i32 bt2020_cycc;        /**< BT.2020 with constant luminance, tri-state. */
+  i32 rgb_quantization;   /**< Selectable RGB quantization range, tri-state. */
+  i32 ycc_quantization;   /**< Selectable YCC quantization range, tri-state. */
+  i32 pass_hdr_dynamic;   /**< 1: pass on the sink's HDR dynamic metadata data block. */
+  i32 pass_hdr10plus;     /**< 1: pass on the sink's HDR10+ block. */
+  i32 pass_dolby_vision;  /**< 1: pass on the sink's Dolby Vision block. */
+  i32 pass_freesync;      /**< 1: pass on the sink's FreeSync block. */
+} hdmi2_values_t;
+
+/**
+ * Fills a record with the defaults that the configuration's keys have (@ref configuration_key): nothing is offered.
+ *
+ * @param values its size is set by the caller; the other members receive their defaults.
+ * @return true; false with an error line when @p values is NULL or its size is too small for the record's first
+ * version.
+ */
+EDID_COMPOSER_API bool hdmi2_values_init(hdmi2_values_t *values);
+
+/**
+ * Decodes what the CTA-861 extensions of a whole EDID say of HDMI 2.
+ *
+ * Extensions that the base block announces and that are there count: of tag 2, revision 3, a right checksum and a
+ * timing offset of at most 127, the first 8 of them. A data block that would end after its collection ends the reading
+ * of that extension, with a warning; so do blocks that are too short and bits of a 4:2:0 map without descriptor give
+ * one. What
+ * @ref decode_edid_extensions reports is not reported again.
+ *
+ * @param edid the EDID, of which @p edid_bytes bytes are read.
+ * @param edid_bytes its size, bytes; a multiple of 128 other than 0.
+ * @param hdmi2 its size is set by the caller; the other members are cleared, then filled.
+ * @return true; false with an error line for a NULL argument, another size, or a base block with a wrong header or
+ *         checksum. The record then says that the EDID has none of it.
+ */
+EDID_COMPOSER_API bool decode_hdmi2(const u8 *edid, u32 edid_bytes, hdmi2_t *hdmi2);
+
+/**
+ * Encodes a record as data blocks, one after the other, in the order of its members. What @ref decode_hdmi2 has read of
+ * an EDID comes back from them, if they have room.
+ *
+ * @param hdmi2 the record. Values that their fields can't hold are cut to the nearest that they can.
+ * @param blocks receives the data blocks; nothing is written after @p size bytes.
+ * @param size its size, bytes; an extension has room for 123, 105 with a detailed timing.
+ * @param used receives the bytes that all blocks take, also when they are more than @p size.
+ * @return true when all blocks were written; false with an error line for a NULL argument or too little room.
+ */
+EDID_COMPOSER_API bool encode_hdmi2(const hdmi2_t *hdmi2, u8 *blocks, u32 size, u32 *used);
+
+/**
+ * Prints a record as a report on standard output: every field in words, values with units.
+ *
+ * @param hdmi2 the record.
+ * @param title first line, NUL-terminated; NULL prints as an empty one.
+ * @return true; false with an error line when @p hdmi2 is NULL.
+ */
+EDID_COMPOSER_API bool print_hdmi2(const hdmi2_t *hdmi2, const char *title);
+
+/** Name of a VIC above 64 (CTA-861, section 4), such as "3840x2160p60Hz16x9"; "Unknown Value" for any but 65 to 127 and
+ *  193 to 219. */
+EDID_COMPOSER_API const char *extended_vic_string(u32 vic);
+/** @} */
+
 /** @defgroup configuration What is read of the platform configuration
  *
  * The library's keys as data, and a record of what each composition reads of them: what counts, what was replaced or
@@ -489,7 +692,8 @@ enum configuration_kind {
   CONFIGURATION_HDMI_VICS = 5,        /**< A list of integers: HDMI_VICs (HDMI 1.4a, section 8.2.3.1). */
   CONFIGURATION_TIMING_BITS = 6,      /**< A list of integers: bit numbers of a byte of timings. */
   CONFIGURATION_STANDARD_TIMINGS = 7, /**< A list of texts: width, height and refresh rate, as in "1280 720 60". */
-  CONFIGURATION_AUDIO_FORMATS = 8     /**< 26 keys with an integer each: "a" to "z" in the place of the path's "?". */
+  CONFIGURATION_AUDIO_FORMATS = 8,    /**< 26 keys with an integer each: "a" to "z" in the place of the path's "?". */
+  CONFIGURATION_EXTENDED_VICS = 9     /**< A list of integers: VICs from 65 to 127 and from 193 to 219. */
 };
 
 /**
@@ -984,6 +1188,8 @@ typedef struct compose_request_t {
   configuration_observer_t configuration_observer; /**< Receives what is read of the configuration; may be NULL. Not
                                                         called where @ref platform_values is given. */
   void *configuration_observer_context;            /**< Goes to @ref configuration_observer as it is. */
+  const hdmi2_values_t *hdmi2; /**< What the platform says of HDMI 2. NULL: the configuration is read, unless
+                                    @ref platform_values is given, which leaves HDMI 2 off. */
 } compose_request_t;
 
 /** What a composition returns. Set size; all other members are filled, on failure too. */
