@@ -27,7 +27,7 @@ rank() {
 # The rooms that a room of the composer may include besides itself; compose, above them, all.
 allowed_rooms() {
   case $1 in
-    inputs | platform) ;;
+    inputs | platform | codec) ;;
     selection) echo inputs ;;
     new_edid) echo inputs selection ;;
     explain) echo inputs selection new_edid ;;

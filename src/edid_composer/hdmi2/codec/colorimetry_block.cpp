@@ -1,5 +1,4 @@
-// The colorimetry data block (CTA-861, section 7.5.5).
-#include "edid_composer/hdmi2/codec/hdmi2_blocks.h"
+#include "edid_composer/hdmi2/codec/colorimetry_block.h"
 
 namespace edid_composer {
 namespace {

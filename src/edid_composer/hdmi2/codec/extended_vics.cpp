@@ -123,13 +123,13 @@ static_assert([] {
   return true;
 }());
 
-constexpr u32 longest_name = sizeof "10240x4320p120Hz64x27";
+constexpr u32 longest_name = sizeof "4096x2160p120Hz256x135";
 
 struct name_t {
   char text[longest_name];
 };
 
-/// Writes a name from left to right. One that is too long is no constant expression.
+/// Writes a name from left to right. One that is too long for it does not compile.
 struct name_writer_t {
   name_t name{};
   u32 length = 0;
@@ -156,6 +156,7 @@ constexpr name_t name_of(const extended_timing_t &timing) {
   writer.put(u32{timing.aspect.width});
   writer.put('x');
   writer.put(u32{timing.aspect.height});
+  writer.put('\0');
   return writer.name;
 }
 

@@ -1,23 +1,15 @@
 // The data blocks of HDMI 2, but for the video data block (short_video_descriptors.h).
 #pragma once
 
-#include "edid_composer/hdmi2/codec/data_block_codec.h"
+#include "edid_composer/hdmi2/codec/colorimetry_block.h"
+#include "edid_composer/hdmi2/codec/hdmi_forum_block.h"
+#include "edid_composer/hdmi2/codec/hdr_static_block.h"
+#include "edid_composer/hdmi2/codec/passed_on_blocks.h"
+#include "edid_composer/hdmi2/codec/video_capability_block.h"
+#include "edid_composer/hdmi2/codec/ycbcr_420_map_block.h"
+#include "edid_composer/hdmi2/codec/ycbcr_420_video_block.h"
 
 namespace edid_composer {
-
-extern const block_codec_t hdmi_forum_block;
-extern const block_codec_t video_capability_block;
-extern const block_codec_t colorimetry_block;
-extern const block_codec_t hdr_static_block;
-extern const block_codec_t ycbcr_420_video_block;
-extern const block_codec_t ycbcr_420_map_block;
-extern const block_codec_t hdr_dynamic_block;
-extern const block_codec_t hdr10plus_block;
-extern const block_codec_t dolby_vision_block;
-extern const block_codec_t freesync_block;
-
-/// The sink capability data structure: what the HDMI Forum block holds, under an extended tag. It is only read.
-extern const block_identity_t sink_capability_structure;
 
 /// All of them, in the order in which they are written.
 inline constexpr const block_codec_t *hdmi2_blocks[] = {

@@ -1,8 +1,6 @@
-// The HDMI Forum vendor-specific data block, and the sink capability data structure, which holds the same from byte 4
-// on.
-#include <algorithm>
+#include "edid_composer/hdmi2/codec/hdmi_forum_block.h"
 
-#include "edid_composer/hdmi2/codec/hdmi2_blocks.h"
+#include <algorithm>
 
 namespace edid_composer {
 namespace {

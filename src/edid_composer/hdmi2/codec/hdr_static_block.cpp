@@ -1,8 +1,7 @@
-// The HDR static metadata data block (CTA-861, section 7.5.13).
+#include "edid_composer/hdmi2/codec/hdr_static_block.h"
+
 #include <algorithm>
 #include <iterator>
-
-#include "edid_composer/hdmi2/codec/hdmi2_blocks.h"
 
 namespace edid_composer {
 namespace {

@@ -1,7 +1,6 @@
-// The blocks that are kept as they stand, to be passed on byte for byte.
-#include <algorithm>
+#include "edid_composer/hdmi2/codec/passed_on_blocks.h"
 
-#include "edid_composer/hdmi2/codec/hdmi2_blocks.h"
+#include <algorithm>
 
 namespace edid_composer {
 namespace {
@@ -15,6 +14,12 @@ constexpr block_identity_t hdr10plus{
 constexpr block_identity_t dolby_vision{
     "Dolby Vision block", data_block::extended, {vendor_specific_video, 0x46, 0xD0, 0x00}, 4, 9};
 constexpr block_identity_t freesync{"FreeSync block", data_block::vendor_specific, {0x1A, 0x00, 0x00}, 3, 8};
+
+/// Dolby Vision: the byte after the OUI.
+constexpr u32 version_byte = 4;
+constexpr u32 version_shift = 5;
+constexpr u8 support_2160p60 = 0x02;
+constexpr u32 last_version_with_2160p60 = 1;
 
 /// The codec of a block that the record keeps in a member. A kept block that is too short counts as none.
 template <const block_identity_t &identity, hdmi2_block_t hdmi2_t::*member>
@@ -43,5 +48,14 @@ constinit const block_codec_t hdr_dynamic_block = passed_on_t<hdr_dynamic, &hdmi
 constinit const block_codec_t hdr10plus_block = passed_on_t<hdr10plus, &hdmi2_t::hdr10plus>::codec;
 constinit const block_codec_t dolby_vision_block = passed_on_t<dolby_vision, &hdmi2_t::dolby_vision>::codec;
 constinit const block_codec_t freesync_block = passed_on_t<freesync, &hdmi2_t::freesync>::codec;
+
+u32 dolby_vision_version(const hdmi2_block_t &block) {
+  return block.payload[version_byte] >> version_shift;
+}
+
+bool dolby_vision_has_2160p60(const hdmi2_block_t &block) {
+  return dolby_vision_version(block) <= last_version_with_2160p60 &&
+         (block.payload[version_byte] & support_2160p60) != 0;
+}
 
 }  // namespace edid_composer

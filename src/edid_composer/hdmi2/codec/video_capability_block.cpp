@@ -1,7 +1,6 @@
-// The video capability data block (CTA-861, section 7.5.6).
-#include <algorithm>
+#include "edid_composer/hdmi2/codec/video_capability_block.h"
 
-#include "edid_composer/hdmi2/codec/hdmi2_blocks.h"
+#include <algorithm>
 
 namespace edid_composer {
 namespace {

@@ -1,9 +1,7 @@
-// The YCbCr 4:2:0 capability map data block (CTA-861, section 7.5.11): which short video descriptors are taken in 4:2:0
-// too. Without a map it stands for all of them.
+#include "edid_composer/hdmi2/codec/ycbcr_420_map_block.h"
+
 #include <algorithm>
 #include <iterator>
-
-#include "edid_composer/hdmi2/codec/hdmi2_blocks.h"
 
 namespace edid_composer {
 namespace {

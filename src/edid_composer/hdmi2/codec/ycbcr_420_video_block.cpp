@@ -1,8 +1,7 @@
-// The YCbCr 4:2:0 video data block (CTA-861, section 7.5.10): the modes that are taken in 4:2:0 only.
+#include "edid_composer/hdmi2/codec/ycbcr_420_video_block.h"
+
 #include <algorithm>
 #include <iterator>
-
-#include "edid_composer/hdmi2/codec/hdmi2_blocks.h"
 
 namespace edid_composer {
 namespace {
