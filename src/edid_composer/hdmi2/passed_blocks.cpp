@@ -1,19 +1,12 @@
 #include "edid_composer/hdmi2/passed_blocks.h"
 
+#include "edid_composer/hdmi2/codec/passed_on_blocks.h"
+
 namespace edid_composer {
 namespace {
 
 /// What 2160p60 takes, MHz.
 constexpr u32 rate_of_2160p60 = 594;
-
-/// True when a Dolby Vision block announces 2160p60, which those of version 0 and 1 do by a bit.
-bool announces_2160p60(const hdmi2_block_t &dolby_vision) {
-  constexpr u32 version_byte = 4;
-  constexpr u32 version_shift = 5;
-  constexpr u8 supports_2160p60 = 0x02;
-  const u8 byte = dolby_vision.payload[version_byte];
-  return byte >> version_shift <= 1 && (byte & supports_2160p60) != 0;
-}
 
 }  // namespace
 
@@ -24,7 +17,7 @@ compose_reason judge_passed_block(const layer_inputs_t &inputs, passed_block_t w
   const hdmi2_block_t &block = inputs.sink.*row.block;
   if (block.length == 0) return COMPOSE_REASON_SINK_WITHOUT;
   if (inputs.platform.*row.key == 0) return COMPOSE_REASON_OFF;
-  if (which == passed_dolby_vision && rate < rate_of_2160p60 && announces_2160p60(block)) {
+  if (which == passed_dolby_vision && rate < rate_of_2160p60 && dolby_vision_has_2160p60(block)) {
     return COMPOSE_REASON_RATE_BELOW_BLOCK;
   }
   if (which == passed_freesync && (inputs.platform.vrr != as_sink || !is_vrr_of_sink(inputs, vrr))) {
