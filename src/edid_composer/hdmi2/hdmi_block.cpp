@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "edid_decode_encode/hdmi_vendor_block_layout.h"
 #include "linked_list/typed_list.h"
 #include "utility/vic_timings.h"
 
@@ -63,14 +64,16 @@ tmds_clock_t tmds_clock_with_extended(const layer_inputs_t &inputs, const base_o
   if (clock.wanted_mhz == 0 && extended_khz <= undeclared_to_khz) return clock;
 
   const u32 base_khz = up_to_multiple(largest_pixel_clock(modes, plan.base_modes), hertz_per_khz) / hertz_per_khz;
-  const u32 of_today_khz = clock.wanted_mhz != 0 ? clock.held_mhz() * khz_per_mhz : base_khz;
+  // As it is told: a platform's own clock is cut to a multiple of 5, not rounded up.
+  const u32 told_mhz = hdmi_vendor_block::declared_tmds_clock(clock.held_mhz());
+  const u32 of_today_khz = clock.wanted_mhz != 0 ? told_mhz * khz_per_mhz : base_khz;
   const u32 needed = rate_for_clock(std::max({base_khz, has_4k_modes ? khz_of_4k_x_2k : 0, extended_khz}));
   u32 most = std::min(largest_hdmi_rate, std::max(rates.platform, needed));
   if (is_as_sink(inputs) && inputs.base.sink.max_tmds_clock != 0) {
     most = std::min(most, std::max(inputs.base.sink.max_tmds_clock, needed));
   }
   const u32 wanted = rate_for_clock(std::max(of_today_khz, extended_khz));
-  if (std::min(wanted, most) != clock.held_mhz()) {
+  if (std::min(wanted, most) != told_mhz) {
     clock.reason = wanted > most ? COMPOSE_REASON_TMDS_LIMITED : COMPOSE_REASON_TMDS_OF_EXTENDED_MODES;
   }
   clock.wanted_mhz = std::min(wanted, most);
