@@ -46,7 +46,6 @@ configuration_outcome_t number_of(const platform_key_t &row) {
       LOG_WARNING("The value for platform path:%s is not an integer. Defaulting to:%d", key.path, outcome.used);
     }
   }
-  LOG_TRACE("Platform config read. Path:%s val:%d", key.path, outcome.used);
   return outcome;
 }
 
@@ -94,6 +93,7 @@ void read_vics(const platform_key_t &row, hdmi2_values_t *values, const configur
 
 void read_number(const platform_key_t &row, hdmi2_values_t *values, const configuration_readings_t &readings) {
   const configuration_outcome_t outcome = number_of(row);
+  LOG_TRACE("Platform config read. Path:%s val:%d", row.key.path, outcome.used);
   *member_of<i32>(values, row) = outcome.used;
   readings.note(row.key, outcome);
 }
@@ -138,6 +138,7 @@ constexpr u32 size_with_enable = offsetof(hdmi2_values_t, enable) + sizeof(hdmi2
 
 }  // namespace
 
+// Not a word where HDMI 2 is off.
 bool is_hdmi2_configured(const configuration_readings_t &readings) {
   const configuration_outcome_t outcome = number_of(key_of_enable());
   readings.note(key_of_enable().key, outcome);
