@@ -877,7 +877,47 @@ enum compose_subject {
   /** Modes added to reach the fewest an EDID has; code: how many. */
   COMPOSE_SUBJECT_PADDING = 13,
   /** Room in the CEA extension; code: bytes needed before the checksum. */
-  COMPOSE_SUBJECT_EXTENSION_ROOM = 14
+  COMPOSE_SUBJECT_EXTENSION_ROOM = 14,
+  /* HDMI 2, where the composition has it */
+  /** A mode above VIC 64; code: its VIC (CTA-861, section 4). */
+  COMPOSE_SUBJECT_EXTENDED_MODE = 15,
+  /** The rate of the link to the box, told above 340 MHz; code: MHz. */
+  COMPOSE_SUBJECT_LINK_RATE = 16,
+  /** A transfer function of HDR; code: its bit of @ref hdmi2_eotf. */
+  COMPOSE_SUBJECT_HDR = 17,
+  /** A colour space; code: its bit of @ref hdmi2_colorimetry. */
+  COMPOSE_SUBJECT_COLORIMETRY = 18,
+  /** YCbCr 4:2:0; code: how many modes may be sent in it. */
+  COMPOSE_SUBJECT_YCBCR_420 = 19,
+  /** A colour depth in 4:2:0; code: bits per pixel, 30 or 36. */
+  COMPOSE_SUBJECT_DEEP_COLOR_420 = 20,
+  /** The auto low-latency mode; code: 1 or 0. */
+  COMPOSE_SUBJECT_ALLM = 21,
+  /** The variable refresh rate; code: its lowest rate in Hz, 0 when it is not offered. */
+  COMPOSE_SUBJECT_VRR = 22,
+  /** A quantization range that sources may select; code: 0 of RGB, 1 of YCbCr. */
+  COMPOSE_SUBJECT_QUANTIZATION = 23,
+  /** A block of the sink that can be passed on; code: @ref compose_room_item of it, 1 to 4. */
+  COMPOSE_SUBJECT_PASSED_BLOCK = 24,
+  /** That the VICs of 4Kx2K modes are taken as well as their HDMI_VICs; code: 1 or 0. */
+  COMPOSE_SUBJECT_UHD_VIC = 25,
+  /** A mode above VIC 64 as first detailed timing; code: its VIC, 0 for none. */
+  COMPOSE_SUBJECT_PREFERRED_TIMING = 26,
+  /** Something that was left out for room; code: @ref compose_room_item. None when everything has room. */
+  COMPOSE_SUBJECT_ROOM_ITEM = 27
+};
+
+/** What is left out for room, in this order, until the rest fits. */
+enum compose_room_item {
+  COMPOSE_ROOM_FREESYNC = 1,       /**< The FreeSync block. */
+  COMPOSE_ROOM_HDR_DYNAMIC = 2,    /**< The HDR dynamic metadata data block. */
+  COMPOSE_ROOM_HDR10PLUS = 3,      /**< The HDR10+ block. */
+  COMPOSE_ROOM_DOLBY_VISION = 4,   /**< The Dolby Vision block. */
+  COMPOSE_ROOM_3D_STRUCTURES = 5,  /**< 3D structures beyond the mandatory ones, all of them. */
+  COMPOSE_ROOM_MODES = 6,          /**< Modes up to VIC 64, from the last on. */
+  COMPOSE_ROOM_MODES_IN_420 = 7,   /**< Modes that are offered in 4:2:0 only, from the last on. */
+  COMPOSE_ROOM_EXTENDED_MODES = 8, /**< Other modes above VIC 64, from the last on. */
+  COMPOSE_ROOM_SERIAL_TEXT = 9     /**< The serial number text, which comes after all of these. */
 };
 
 /** What was decided; @ref compose_decision_t::verdict. */
@@ -911,7 +951,8 @@ enum compose_reason {
   COMPOSE_REASON_OTHER_REFRESH_FAMILY = 7,
   /** Above the geometry limit {lines of the mode, limit}. */
   COMPOSE_REASON_TALLER_THAN_SINK = 8,
-  /** Chosen, but the extension holds no more of its kind {descriptors of its kind there}. */
+  /** Chosen, but the extension holds no more of its kind {descriptors of its kind there; of what HDMI 2 leaves out for
+   *  room: how many}. */
   COMPOSE_REASON_NO_ROOM = 9,
   /** No VIC has it {active pixels, active lines of a frame or 0, Hz, 1 interlaced}. */
   COMPOSE_REASON_TIMING_WITHOUT_VIC = 10,
@@ -1014,32 +1055,54 @@ enum compose_reason {
   /* HDMI 2 */
   /** In 4:2:0 only, as it is too fast otherwise {its kHz, its kHz in 4:2:0, limit in kHz}. */
   COMPOSE_REASON_ONLY_IN_420 = 59,
-  /** Above the rate of the link {its kHz, limit in kHz, 1 the sink's or 2 the box's}. */
+  /** Above the rate of the link {its kHz, limit in kHz, 1 when it is the box's, 0 when it is that of box and sink}. */
   COMPOSE_REASON_ABOVE_RATE = 60,
-  /** The sink has it in 4:2:0 only, in which it is not offered {setting of y420}. */
+  /** The sink has it in 4:2:0 only, in which it is not offered {setting}. */
   COMPOSE_REASON_SINK_HAS_IT_IN_420 = 61,
-  /** The platform does not offer it. */
+  /** The platform does not offer it {setting, 1 when the sink has it}. */
   COMPOSE_REASON_OFF = 62,
-  /** The box does it itself. */
+  /** The box does it itself {as above}. */
   COMPOSE_REASON_BOX_ITSELF = 63,
-  /** As the sink, which has it. */
+  /** As the sink, which has it {as above}. */
   COMPOSE_REASON_AS_SINK = 64,
-  /** As the sink, which doesn't have it. */
+  /** As the sink, which doesn't have it {as above}. */
   COMPOSE_REASON_SINK_WITHOUT = 65,
-  /** No range that a source may use {minimum, maximum in Hz, as worked out}. */
+  /** No range that a source may use {minimum, maximum, the sink's minimum, its maximum, Hz}. */
   COMPOSE_REASON_VRR_RANGE_INVALID = 66,
-  /** 340 MHz, the most that the HDMI block tells, as the link carries more. */
+  /** 340 MHz, the most that the HDMI block tells, as the link carries more {its MHz}. */
   COMPOSE_REASON_TMDS_OF_LINK = 67,
-  /** What the modes above VIC 64 need. */
+  /** What the modes above VIC 64 need {kHz of the fastest on the link}. */
   COMPOSE_REASON_TMDS_OF_EXTENDED_MODES = 68,
-  /** Cut to what box and sink take. */
+  /** Cut to what box and sink take, or to what the modes need {MHz wanted, MHz}. */
   COMPOSE_REASON_TMDS_LIMITED = 69,
-  /** The sink's block, byte for byte. */
+  /** The sink's block, byte for byte {its bytes}. */
   COMPOSE_REASON_PASSED_ON = 70,
-  /** The sink's block announces a mode above the rate of the link. */
+  /** The sink's block announces a mode above the rate of the link {MHz of the mode, MHz of the link}. */
   COMPOSE_REASON_RATE_BELOW_BLOCK = 71,
   /** The sink's range of refresh rates is not offered unchanged. */
-  COMPOSE_REASON_VRR_CHANGED = 72
+  COMPOSE_REASON_VRR_CHANGED = 72,
+  /** What the box's receiver takes {its MHz, the sink's MHz}. */
+  COMPOSE_REASON_LINK_RATE_OF_BOX = 73,
+  /** What the sink takes {as above}. */
+  COMPOSE_REASON_LINK_RATE_OF_SINK = 74,
+  /** What modes that the box makes itself need {as above}. */
+  COMPOSE_REASON_LINK_RATE_OF_ADDED_MODES = 75,
+  /** No offered mode is fast enough for it, or none that the sink takes in it {setting, 1 when the sink has any}. */
+  COMPOSE_REASON_NO_MODE_IN_420 = 76,
+  /** No offered mode in 4:2:0 leaves room for it on the link {MHz of the link, setting}. */
+  COMPOSE_REASON_RATE_BELOW_DEPTH = 77,
+  /** HDMI requires 30 bit where 36 bit is offered. */
+  COMPOSE_REASON_DEEP_COLOR_420_REQUIRED = 78,
+  /** A 4Kx2K mode is offered by its HDMI_VIC and by its VIC. */
+  COMPOSE_REASON_UHD_VIC_OF_MODES = 79,
+  /** No 4Kx2K mode is offered by both. */
+  COMPOSE_REASON_NO_UHD_VIC = 80,
+  /** Nothing else calls for the HDMI Forum block, which would say so. */
+  COMPOSE_REASON_NO_FORUM_BLOCK = 81,
+  /** The first mode above VIC 64 that a detailed timing can hold. */
+  COMPOSE_REASON_FIRST_EXTENDED_MODE = 82,
+  /** No offered mode above VIC 64 fits a detailed timing. */
+  COMPOSE_REASON_NO_EXTENDED_TIMING = 83
 };
 
 /** Who named a candidate; bits of @ref compose_decision_t::origins. */
@@ -1067,7 +1130,9 @@ enum compose_origin {
   /** The caller's current mode. */
   COMPOSE_ORIGIN_CURRENT_MODE = 0x0400,
   /** The library itself: padding and basic audio. */
-  COMPOSE_ORIGIN_LIBRARY = 0x0800
+  COMPOSE_ORIGIN_LIBRARY = 0x0800,
+  /** The sink's 4:2:0 video block; place in sink_index. */
+  COMPOSE_ORIGIN_SINK_420 = 0x1000
 };
 
 /** One decision of a composition. It holds no pointers: a copy of it keeps its meaning. */
@@ -1229,10 +1294,12 @@ typedef struct compose_result_t {
                                     them for each input; 0 when the composition failed. */
   u32 sink_status;             /**< What became of the sink's base block; @ref compose_sink_status. 0 when the call was
                                     refused before the sink was looked at. */
-  u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. */
+  u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. With HDMI 2, of the first
+                                    CTA-861 extension that can be read, of block 1 where there is none. */
   u32 sink_malformed_at; /**< The byte, when @ref sink_extension_status is COMPOSE_EXTENSION_MALFORMED, of block 1, from
                             0, at which the data block begins that overruns; else 0. */
-  u32 sink_blocks_unread; /**< Extension blocks after block 1 that are announced and given, but not read. */
+  u32 sink_blocks_unread; /**< Extension blocks after block 1 that are announced and given, but not read. With HDMI 2,
+                               those of all blocks. */
 } compose_result_t;
 
 /**
