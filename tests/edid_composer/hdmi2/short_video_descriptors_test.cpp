@@ -39,8 +39,11 @@ TEST(ShortVideoDescriptor, IsMarkedByAnEmptyMap) {
   EXPECT_TRUE(is_marked_420(record, 0));
   EXPECT_TRUE(is_marked_420(record, 299));
   EXPECT_FALSE(is_marked_420(record, 300));
-  record.y420_map_bytes = 30;
-  EXPECT_FALSE(is_marked_420(record, 250));
+  // More bytes than there can be.
+  record.y420_map_bytes = 255;
+  std::memset(record.y420_map, 0xFF, sizeof record.y420_map);
+  EXPECT_TRUE(is_marked_420(record, 239));
+  EXPECT_FALSE(is_marked_420(record, 240));
 }
 
 }  // namespace hdmi2_test
