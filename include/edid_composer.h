@@ -481,13 +481,13 @@ EDID_COMPOSER_API void print_platform_node(u32 node, const char *label);
  * A composition uses it only when it is asked for twice: by @ref compose_edid_request, and by `enable`, either of the
  * configuration's table `hdmi2` or of @ref compose_request_t::hdmi2.
  *
- * "HDMI 2.0" and "HDMI 2.1" are the High-Definition Multimedia Interface Specifications of these versions; "CTA-861" is
- * CTA-861-G and later, which CEA-861 became.
+ * "HDMI 2.1" is the High-Definition Multimedia Interface Specification of that version, which has all of HDMI 2.0;
+ * "CTA-861" is CTA-861-G and later, which CEA-861 became.
  * @{ */
 
 /** Most short video descriptors that are kept of a sink: 8 extensions of 123 bytes, headers of data blocks aside. */
 #define HDMI2_MOST_SVDS 952
-/** Most payload bytes of a data block (CTA-861, section 7.4). */
+/** Most payload bytes of a data block (CTA-861, section 7.5). */
 #define HDMI2_MOST_BLOCK_BYTES 31
 
 /** A data block as it stands in a sink's EDID, which is passed on byte for byte. */
@@ -496,7 +496,7 @@ typedef struct hdmi2_block_t {
   u8 payload[HDMI2_MOST_BLOCK_BYTES]; /**< The bytes after the header byte; 0 after the first length of them. */
 } hdmi2_block_t;
 
-/** Bits of @ref hdmi2_t::eotfs (CTA-861, HDR static metadata data block, byte 2). */
+/** Bits of @ref hdmi2_t::eotfs (CTA-861, section 7.5.13). */
 enum hdmi2_eotf {
   HDMI2_EOTF_SDR = 0x01,   /**< Traditional gamma, standard dynamic range. */
   HDMI2_EOTF_GAMMA = 0x02, /**< Traditional gamma, high dynamic range. */
@@ -504,7 +504,7 @@ enum hdmi2_eotf {
   HDMI2_EOTF_HLG = 0x08    /**< Hybrid log-gamma. */
 };
 
-/** Bits of @ref hdmi2_t::colorimetry (CTA-861, colorimetry data block, byte 2). */
+/** Bits of @ref hdmi2_t::colorimetry (CTA-861, section 7.5.5). */
 enum hdmi2_colorimetry {
   HDMI2_XVYCC601 = 0x01,    /**< xvYCC601. */
   HDMI2_XVYCC709 = 0x02,    /**< xvYCC709. */
@@ -526,7 +526,7 @@ typedef struct hdmi2_t {
   u32 size;                 /**< sizeof(hdmi2_t) of the caller; see @ref decode_hdmi2. */
   u32 svd_count;            /**< Short video descriptors of all video data blocks. */
   u8 svds[HDMI2_MOST_SVDS]; /**< Their bytes as stored, in block order; see @ref y420_map. */
-  /* HDMI Forum vendor-specific data block, or sink capability data structure (HDMI 2.1, section 10.3.2) */
+  /* HDMI Forum vendor-specific data block or, without one, sink capability data structure (HDMI 2.1) */
   u8 forum_present;  /**< 1 when the sink has one of at least 7 payload bytes. */
   u8 forum_version;  /**< Its version (byte 4); 1. */
   u32 max_tmds_rate; /**< Maximum TMDS character rate, MHz, a multiple of 5; 0: at most 340 (byte 5). */
@@ -538,7 +538,7 @@ typedef struct hdmi2_t {
   u8 dc_48bit_420;   /**< 1 when it takes 48-bit deep colour in YCbCr 4:2:0 (byte 7, bit 2). */
   u8 dc_36bit_420;   /**< 1 when it takes 36-bit deep colour in YCbCr 4:2:0 (byte 7, bit 1). */
   u8 dc_30bit_420;   /**< 1 when it takes 30-bit deep colour in YCbCr 4:2:0 (byte 7, bit 0). */
-  u8 allm_present;   /**< 1 when byte 8 is there. */
+  u8 allm_present;   /**< 1 when byte 8 is there, as it is where bytes 9 and 10 are. */
   u8 allm;           /**< 1 when it takes the auto low-latency mode (byte 8, bit 1). */
   u8 vrr_present;    /**< 1 when bytes 9 and 10 are there. */
   u8 vrr_min;        /**< Lowest variable refresh rate, Hz, 0 to 63; 0: no VRR (byte 9, bits 5 to 0). */
@@ -636,38 +636,42 @@ EDID_COMPOSER_API bool hdmi2_values_init(hdmi2_values_t *values);
 /**
  * Decodes what the CTA-861 extensions of a whole EDID say of HDMI 2.
  *
- * Extensions that the base block announces and that are there count: of tag 2, revision 3, a right checksum and a
- * timing offset of at most 127, the first 8 of them. A data block that would end after its collection ends the reading
- * of that extension, with a warning; so do blocks that are too short and bits of a 4:2:0 map without descriptor give
- * one. What
+ * Extensions count that the base block announces and that are there: those of tag 2, revision 3, a right checksum and a
+ * timing offset of at most 127, the first 8 of them. Others are passed over without a line. A warning is given for a
+ * data block that ends after its collection, which ends the reading of that extension; for a block that is too short,
+ * which counts as none; and for bits of a 4:2:0 map that no descriptor belongs to, which are cleared. What
  * @ref decode_edid_extensions reports is not reported again.
  *
  * @param edid the EDID, of which @p edid_bytes bytes are read.
  * @param edid_bytes its size, bytes; a multiple of 128 other than 0.
- * @param hdmi2 its size is set by the caller; the other members are cleared, then filled.
- * @return true; false with an error line for a NULL argument, another size, or a base block with a wrong header or
- *         checksum. The record then says that the EDID has none of it.
+ * @param hdmi2 its size is set by the caller; the other members are cleared, then filled. A record that is larger than
+ *        this version's keeps what it has after that, and its size becomes this version's.
+ * @return true; false with an error line for a NULL argument, a record or an EDID of another size, or a base block with
+ *         a wrong header, checksum or version. The record, if there is one, then says that the EDID has none of it.
  */
 EDID_COMPOSER_API bool decode_hdmi2(const u8 *edid, u32 edid_bytes, hdmi2_t *hdmi2);
 
 /**
- * Encodes a record as data blocks, one after the other, in the order of its members. What @ref decode_hdmi2 has read of
- * an EDID comes back from them, if they have room.
+ * Encodes a record as data blocks, one after the other: video data blocks of up to 31 descriptors, then the others in
+ * the order of the record's members. What @ref decode_hdmi2 has read of an EDID comes back when it reads these blocks.
  *
- * @param hdmi2 the record. Values that their fields can't hold are cut to the nearest that they can.
- * @param blocks receives the data blocks; nothing is written after @p size bytes.
- * @param size its size, bytes; an extension has room for 123, 105 with a detailed timing.
- * @param used receives the bytes that all blocks take, also when they are more than @p size.
- * @return true when all blocks were written; false with an error line for a NULL argument or too little room.
+ * @param hdmi2 the record. A number that is too large for its field is written as the largest that it holds, a rate
+ * that is no multiple of 5 MHz as the next lower one; a block to be passed on that is too short is left out.
+ * @param blocks receives the data blocks; not NULL.
+ * @param size its size, bytes; an extension has room for 123, for 105 beside a detailed timing.
+ * @param used receives the bytes that all blocks need, also when they are more than @p size; not NULL.
+ * @return true when all blocks were written; false with an error line, and nothing written, for a NULL argument or too
+ *         little room.
  */
 EDID_COMPOSER_API bool encode_hdmi2(const hdmi2_t *hdmi2, u8 *blocks, u32 size, u32 *used);
 
 /**
- * Prints a record as a report on standard output: every field in words, values with units.
+ * Prints a record as a report on standard output: every field in words, values with units; "none" for each block that
+ * the EDID doesn't have. Bits without a name are printed by their number.
  *
  * @param hdmi2 the record.
  * @param title first line, NUL-terminated; NULL prints as an empty one.
- * @return true; false with an error line when @p hdmi2 is NULL.
+ * @return true; false with an error line when @p hdmi2 is NULL or its size too small.
  */
 EDID_COMPOSER_API bool print_hdmi2(const hdmi2_t *hdmi2, const char *title);
 

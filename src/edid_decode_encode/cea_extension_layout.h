@@ -14,6 +14,7 @@ inline constexpr u32 data_blocks = 4;
 
 inline constexpr u8 cea_tag = 0x02;
 inline constexpr u8 supported_revision = 3;
+// kept: CEA-861 allows up to 127, where no detailed timing follows.
 inline constexpr u32 largest_timings_offset = 110;
 
 inline constexpr u8 underscan = 0x80;
