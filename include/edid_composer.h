@@ -768,8 +768,8 @@ typedef struct configuration_reading_t {
 /**
  * Receives what was read.
  *
- * Called on the thread that composes while the configuration is read: once for each key, and before a list's key for
- * each of its entries. Audio formats that are absent are passed over.
+ * Called on the thread that composes: once for each key that is read, and before a list's key for each of its entries.
+ * Passed over are audio formats that are absent, and, where HDMI 2 is off, the keys of its table but `enable`.
  *
  * @param reading the record; it is gone when the call returns.
  * @param context @ref compose_request_t::configuration_observer_context.
@@ -1309,9 +1309,9 @@ typedef struct compose_result_t {
 /**
  * Composes as @ref compose_edid_internal does, from a request record into a result record.
  *
- * What is written, and every line, is the same as from @ref compose_edid_internal, in whose name the lines are, with an
- * observer or a log callback and without. An observed composition needs list entries of its own; when one cannot be
- * had, that is reported, the composition goes on, and no decision is passed on.
+ * What is written, and every line, is the same as from @ref compose_edid_internal, in whose name the lines are, unless
+ * HDMI 2 is asked for (@ref hdmi2); with observer or log callback and without. An observed composition needs list
+ * entries of its own; when one cannot be had, that is reported and no decision is passed on, but the EDID is written.
  *
  * Several threads may compose at once, each with its own request, result and buffers; each call's lines go to its own
  * callback.

@@ -20,7 +20,12 @@ const std::string domain = "platform.software.drivers.vorex.edid.";
 /// A composition without sink, from a complete configuration.
 class Hdmi2Configuration : public testing::Test {
  protected:
-  Hdmi2Configuration() { tree_.fill_completely(); }
+  Hdmi2Configuration() {
+    tree_.fill_completely();
+    tree_.set("geometry_limit", 0);
+    for (const char *mode : {"31", "19", "20", "17"})
+      tree_.add("50_hz_addition_list", std::string(mode));
+  }
 
   composed_t compose() {
     test_support::request_t request({}, test_support::plain_settings(), nullptr);
