@@ -41,6 +41,26 @@ def run(command, log, timeout):
             return -1
 
 
+def files_of(tree):
+    """The paths below a tree, without what git and builds keep there."""
+    for folder, folders, names in os.walk(tree):
+        folders[:] = [name for name in folders if name not in (".git", "build")]
+        yield from (pathlib.Path(folder, name).relative_to(tree) for name in names)
+
+
+def bring_up_to_date(copy):
+    """Makes a folder a copy of the tree. Files that are right already keep their times, so that they need no compiler;
+    what a run that was broken off left broken is made right."""
+    names = set(files_of(TREE))
+    for name in names:
+        content = (TREE / name).read_bytes()
+        if not (copy / name).is_file() or (copy / name).read_bytes() != content:
+            (copy / name).parent.mkdir(parents=True, exist_ok=True)
+            shutil.copy(TREE / name, copy / name)
+    for name in set(files_of(copy)) - names:
+        (copy / name).unlink()
+
+
 def applicable(mutation, tree):
     """What keeps a mutation from being applied; empty: nothing."""
     path = tree / mutation["file"]
@@ -59,9 +79,7 @@ class Workshop:
         self.seconds = {}
         folder.mkdir(parents=True, exist_ok=True)
         self.log.write_bytes(b"")
-        shutil.rmtree(self.tree, ignore_errors=True)
-        # Files as new as the copy: what a run that was broken off compiled of a broken file is compiled again.
-        shutil.copytree(TREE, self.tree, ignore=shutil.ignore_patterns("build", ".git"), copy_function=shutil.copy)
+        bring_up_to_date(self.tree)
         configure = ["cmake", "-S", self.tree, "-B", self.build, "-G", "Ninja", "-DCMAKE_BUILD_TYPE=RelWithDebInfo",
                      "-DEDID_COMPOSER_SANITIZED_TESTS=ON"]
         if run(configure, self.log, 300) != 0:
