@@ -7,12 +7,14 @@
 #include <set>
 
 #include "composition.h"
+#include "support/configuration_keys.h"
 #include "support/configuration_tree.h"
 #include "support/output_capture.h"
 #include "support/records.h"
 
 namespace {
 
+using test_support::configuration_keys;
 using test_support::configuration_tree_t;
 using test_support::output_of;
 using test_support::traced_output_of;
@@ -94,15 +96,8 @@ class ConfigurationReadings : public testing::Test {
   std::string output_;
 };
 
-std::vector<const configuration_key_t *> all_keys() {
-  std::vector<const configuration_key_t *> keys;
-  for (u32 index = 0; const configuration_key_t *key = configuration_key(index); ++index)
-    keys.push_back(key);
-  return keys;
-}
-
 const configuration_key_t *key_named(const std::string &name) {
-  for (const configuration_key_t *key : all_keys()) {
+  for (const configuration_key_t *key : configuration_keys()) {
     if (key->name == name) return key;
   }
   return nullptr;
@@ -110,7 +105,7 @@ const configuration_key_t *key_named(const std::string &name) {
 
 TEST(ConfigurationKeys, HoldEachKeyOnceWithWhatItsKindHas) {
   std::set<std::string> names;
-  for (const configuration_key_t *key : all_keys()) {
+  for (const configuration_key_t *key : configuration_keys()) {
     SCOPED_TRACE(key->name);
     EXPECT_EQ(key->size, sizeof *key);
     EXPECT_TRUE(names.insert(key->name).second);
@@ -134,7 +129,7 @@ TEST_F(ConfigurationReadings, CoverEachKeyOnceInTheOrderOfTheTable) {
     if (reading.entry == -1) read.push_back(reading.key);
   }
   std::vector<std::string> keys;
-  for (const configuration_key_t *key : all_keys())
+  for (const configuration_key_t *key : configuration_keys())
     keys.emplace_back(key->name);
   EXPECT_EQ(read, keys);
 }
@@ -152,7 +147,7 @@ TEST_F(ConfigurationReadings, AnEmptyConfigurationGivesTheDefaultsOfTheTable) {
 }
 
 TEST_F(ConfigurationReadings, NumbersStopAtTheLimitsOfTheTable) {
-  for (const configuration_key_t *key : all_keys()) {
+  for (const configuration_key_t *key : configuration_keys()) {
     const bool is_signed = key->kind == CONFIGURATION_INTEGER;
     if (!is_signed && key->kind != CONFIGURATION_UNSIGNED) continue;
     SCOPED_TRACE(key->name);

@@ -261,8 +261,9 @@ TEST_F(FailingComposition, SurvivesWithoutAnyMemoryFromAnyAllocationOn) {
 // Nothing configured, no sink: the first entry is that of basic audio.
 TEST(FailingPoorComposition, IsRefused) {
   const test_support::configuration_tree_t tree;
+  const situation_t situation{{}, nullptr, true, false};
   for (int nth = 1; nth <= 2; ++nth)
-    EXPECT_EQ(situation_t({}, nullptr, true, false).run(nth).words, refusal);
+    EXPECT_EQ(situation.run(nth).words, refusal);
 }
 
 }  // namespace

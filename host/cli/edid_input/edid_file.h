@@ -12,7 +12,7 @@ namespace edid_cli {
 
 inline constexpr u32 edid_block_size = 128;
 /// The base block counts the blocks that follow it in one byte.
-inline constexpr std::size_t max_edid_size = 256 * edid_block_size;
+inline constexpr std::size_t max_edid_size = std::size_t{256} * edid_block_size;
 
 /// A file that could be read, but holds no EDID in any form.
 class not_an_edid_t : public bad_input_t {

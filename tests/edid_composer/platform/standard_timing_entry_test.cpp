@@ -75,6 +75,11 @@ TEST_F(StandardTimingEntry, HoldsWidthHeightAndRate) {
   EXPECT_EQ(timings(), (timings_t{{1920, 3, 60}, {1280, 2, 75}, {1024, 1, 123}, {800, 0, 100}}));
 }
 
+TEST_F(StandardTimingEntry, IsReadToTheEndOfTheLongestText) {
+  EXPECT_EQ(read("00000000000000001280 1024 75"), "");
+  EXPECT_EQ(timings(), (timings_t{{1280, 2, 75}}));
+}
+
 TEST_F(StandardTimingEntry, FractionOfZeroIsWhole) {
   EXPECT_EQ(read("1280 960 60.00"), "");
   EXPECT_EQ(timings(), (timings_t{{1280, 1, 60}}));
