@@ -473,6 +473,213 @@ EDID_COMPOSER_API bool platform_values_destroy(platform_values_t *values);
 EDID_COMPOSER_API void print_platform_node(u32 node, const char *label);
 /** @} */
 
+/** @defgroup hdmi2 What HDMI 2 adds
+ *
+ * What HDMI 1.4 has no words for: VICs above 64, YCbCr 4:2:0, HDR, wide colour, rates above 340 MHz, ALLM and VRR. It
+ * has records of its own beside @ref edid_t, plain ones: no lists, no pointers, free to be copied and moved.
+ *
+ * A composition uses it only when it is asked for twice: by @ref compose_edid_request, and by `enable`, either of the
+ * configuration's table `hdmi2` or of @ref compose_request_t::hdmi2.
+ *
+ * "HDMI 2.1" is the High-Definition Multimedia Interface Specification of that version, which has all of HDMI 2.0;
+ * "CTA-861" is CTA-861-G and later, which CEA-861 became.
+ * @{ */
+
+/** Most short video descriptors that are kept of a sink: 8 extensions of 123 bytes, headers of data blocks aside. */
+#define HDMI2_MOST_SVDS 952
+/** Most payload bytes of a data block (CTA-861, section 7.5). */
+#define HDMI2_MOST_BLOCK_BYTES 31
+
+/** A data block as it stands in a sink's EDID, which is passed on byte for byte. */
+typedef struct hdmi2_block_t {
+  u8 length; /**< Payload bytes, extended tag and OUI included; 0: the sink has no such block. */
+  u8 payload[HDMI2_MOST_BLOCK_BYTES]; /**< The bytes after the header byte; 0 after the first length of them. */
+} hdmi2_block_t;
+
+/** Bits of @ref hdmi2_t::eotfs (CTA-861, section 7.5.13). */
+enum hdmi2_eotf {
+  HDMI2_EOTF_SDR = 0x01,   /**< Traditional gamma, standard dynamic range. */
+  HDMI2_EOTF_GAMMA = 0x02, /**< Traditional gamma, high dynamic range. */
+  HDMI2_EOTF_PQ = 0x04,    /**< SMPTE ST 2084, of HDR10. */
+  HDMI2_EOTF_HLG = 0x08    /**< Hybrid log-gamma. */
+};
+
+/** Bits of @ref hdmi2_t::colorimetry (CTA-861, section 7.5.5). */
+enum hdmi2_colorimetry {
+  HDMI2_XVYCC601 = 0x01,    /**< xvYCC601. */
+  HDMI2_XVYCC709 = 0x02,    /**< xvYCC709. */
+  HDMI2_SYCC601 = 0x04,     /**< sYCC601. */
+  HDMI2_OPYCC601 = 0x08,    /**< opYCC601. */
+  HDMI2_OPRGB = 0x10,       /**< opRGB. */
+  HDMI2_BT2020_CYCC = 0x20, /**< BT.2020, constant luminance. */
+  HDMI2_BT2020_YCC = 0x40,  /**< BT.2020, YCbCr. */
+  HDMI2_BT2020_RGB = 0x80   /**< BT.2020, RGB. */
+};
+
+/**
+ * What the data blocks of all CTA-861 extensions of an EDID say of HDMI 2.
+ *
+ * Filled by @ref decode_hdmi2. Where a block comes more than once, the first that is long enough counts. Offsets below
+ * are bytes of the block, counted from its header byte.
+ */
+typedef struct hdmi2_t {
+  u32 size;                 /**< sizeof(hdmi2_t) of the caller; see @ref decode_hdmi2. */
+  u32 svd_count;            /**< Short video descriptors of all video data blocks. */
+  u8 svds[HDMI2_MOST_SVDS]; /**< Their bytes as stored, in block order; see @ref y420_map. */
+  /* HDMI Forum vendor-specific data block or, without one, sink capability data structure (HDMI 2.1) */
+  u8 forum_present;  /**< 1 when the sink has one of at least 7 payload bytes. */
+  u8 forum_version;  /**< Its version (byte 4); 1. */
+  u32 max_tmds_rate; /**< Maximum TMDS character rate, MHz, a multiple of 5; 0: at most 340 (byte 5). */
+  u8 scdc;           /**< 1 when the status and control data channel is present (byte 6, bit 7). */
+  u8 read_request;   /**< 1 when it can ask to be read (byte 6, bit 6). */
+  u8 scramble_low;   /**< 1 when it takes scrambling at or below 340 MHz too (byte 6, bit 3). */
+  u8 frl_rate;       /**< Maximum fixed rate link code, 0 to 15 (byte 7, bits 7 to 4). */
+  u8 uhd_vic;        /**< 1 when it takes the VICs of the modes that have an HDMI_VIC (byte 7, bit 3). */
+  u8 dc_48bit_420;   /**< 1 when it takes 48-bit deep colour in YCbCr 4:2:0 (byte 7, bit 2). */
+  u8 dc_36bit_420;   /**< 1 when it takes 36-bit deep colour in YCbCr 4:2:0 (byte 7, bit 1). */
+  u8 dc_30bit_420;   /**< 1 when it takes 30-bit deep colour in YCbCr 4:2:0 (byte 7, bit 0). */
+  u8 allm_present;   /**< 1 when byte 8 is there, as it is where bytes 9 and 10 are. */
+  u8 allm;           /**< 1 when it takes the auto low-latency mode (byte 8, bit 1). */
+  u8 vrr_present;    /**< 1 when bytes 9 and 10 are there. */
+  u8 vrr_min;        /**< Lowest variable refresh rate, Hz, 0 to 63; 0: no VRR (byte 9, bits 5 to 0). */
+  u32 vrr_max;       /**< Highest variable refresh rate, Hz, 0 to 1023; 0: none said (bytes 9 and 10). */
+  /* Video capability data block (CTA-861, section 7.5.6) */
+  u8 video_capability_present; /**< 1 when the sink has one of at least 2 payload bytes. */
+  u8 ycc_quantization;         /**< 1 when the YCC quantization range is selectable (byte 2, bit 7). */
+  u8 rgb_quantization;         /**< 1 when the RGB quantization range is selectable (byte 2, bit 6). */
+  u8 preferred_scan;           /**< S_PT, behaviour for the preferred timing, 0 to 3 (byte 2, bits 5 and 4). */
+  u8 it_scan;                  /**< S_IT, behaviour for IT formats, 0 to 3 (byte 2, bits 3 and 2). */
+  u8 ce_scan;                  /**< S_CE, behaviour for CE formats, 0 to 3 (byte 2, bits 1 and 0). */
+  /* Colorimetry data block (CTA-861, section 7.5.5) */
+  u8 colorimetry_present; /**< 1 when the sink has one of at least 3 payload bytes. */
+  u8 colorimetry;         /**< Mask of @ref hdmi2_colorimetry (byte 2). */
+  u8 gamut_metadata;      /**< Gamut metadata profiles and what else stands there, as stored (byte 3). */
+  /* HDR static metadata data block (CTA-861, section 7.5.13) */
+  u8 hdr_static_present; /**< 1 when the sink has one of at least 3 payload bytes. */
+  u8 eotfs;              /**< Mask of @ref hdmi2_eotf, as stored (byte 2). */
+  u8 metadata_types;     /**< Static metadata descriptors, bit 0 for type 1, as stored (byte 3). */
+  u8 luminance_count;    /**< How many of the following three are there, 0 to 3 (bytes 4 to 6). */
+  u8 luminance[3];       /**< Codes of desired maximum, maximum frame-average and minimum luminance, as stored:
+                              50 x 2^(n / 32) cd/m2; the minimum is maximum x (n / 255)^2 / 100. */
+  /* YCbCr 4:2:0 (CTA-861, sections 7.5.10 and 7.5.11) */
+  u8 y420_count; /**< Modes of the 4:2:0 video data block: those that are taken in 4:2:0 only. */
+  u8 y420_vics[HDMI2_MOST_BLOCK_BYTES - 1]; /**< Their short video descriptors, as stored. */
+  u8 y420_map_present;                      /**< 1 when the sink has a 4:2:0 capability map data block. */
+  u8 y420_map_bytes; /**< Bytes of the map; 0: the block is there without one, and marks every descriptor. */
+  u8 y420_map[HDMI2_MOST_BLOCK_BYTES - 1]; /**< Bit i mod 8 of byte i / 8: @ref svds [i] is taken in 4:2:0 too. Bits
+                                                beyond @ref svd_count are 0. */
+  /* Blocks that can be passed on */
+  hdmi2_block_t hdr_dynamic;  /**< HDR dynamic metadata data block (CTA-861, section 7.5.14), at least 4 bytes. */
+  hdmi2_block_t hdr10plus;    /**< Vendor-specific video data block of HDR10+, at least 5 bytes. */
+  hdmi2_block_t dolby_vision; /**< Vendor-specific video data block of Dolby Vision, at least 9 bytes. */
+  hdmi2_block_t freesync;     /**< Vendor-specific data block of FreeSync, at least 8 bytes. */
+} hdmi2_t;
+
+/** Most entries of a list of @ref hdmi2_values_t. */
+#define HDMI2_MOST_LISTED_VICS 31
+
+/**
+ * What a platform says of HDMI 2: the keys of the configuration's table `hdmi2`, which have the same names.
+ *
+ * A host that has other sources than the configuration prepares one with @ref hdmi2_values_init, fills it and hands it
+ * over as @ref compose_request_t::hdmi2. "Tri-state" is 0 never, 1 always (the box does it itself), 2 as the sink,
+ * which without a sink is never. A value outside of its limits counts as the nearest limit, and a warning says so.
+ */
+typedef struct hdmi2_values_t {
+  u32 size;                                      /**< sizeof(hdmi2_values_t) of the caller. */
+  i32 enable;                                    /**< 1: compose with HDMI 2. 0: the other members have no effect. */
+  i32 vic_priority_list[HDMI2_MOST_LISTED_VICS]; /**< Modes that may be offered, best first: VICs from 65 to 127 and
+                                                      from 193 to 219; the first 0 ends the list. */
+  i32 vic_addition_list[HDMI2_MOST_LISTED_VICS]; /**< Modes that the box makes itself, whatever the sink takes; the
+                                                    first 0 ends the list. */
+  i32 tmds_limit;         /**< TMDS character rate that the box's receiver takes, MHz, 165 to 600. */
+  i32 preferred_extended; /**< 1: the first mode above VIC 64 becomes the first detailed timing. */
+  i32 scdc;               /**< 1: the receiver has the status and control data channel at any rate. */
+  i32 read_request;       /**< 1: the receiver can ask to be read. */
+  i32 scramble_low;       /**< 1: the receiver takes scrambling at or below 340 MHz. */
+  i32 y420;               /**< YCbCr 4:2:0, tri-state. */
+  i32 dc_30bit_420;       /**< 30-bit deep colour in 4:2:0, tri-state. */
+  i32 dc_36bit_420;       /**< 36-bit deep colour in 4:2:0, tri-state. */
+  i32 deep_color;         /**< 2: offer deep colour only where the sink has it too; 0: as the platform values say. */
+  i32 uhd_vic;            /**< 1: say that the VICs of the modes that have an HDMI_VIC are taken. */
+  i32 allm;               /**< Auto low-latency mode, tri-state. */
+  i32 vrr;                /**< Variable refresh rate, tri-state. */
+  i32 vrr_min;            /**< Lowest variable refresh rate, Hz, 1 to 48. */
+  i32 vrr_max;            /**< Highest variable refresh rate, Hz, 0 to 1023; 0: none said. */
+  i32 hdr_gamma;          /**< HDR with traditional gamma, tri-state. */
+  i32 hdr_pq;             /**< HDR with PQ (SMPTE ST 2084), tri-state. */
+  i32 hdr_hlg;            /**< HDR with hybrid log-gamma, tri-state. */
+  i32 hdr_luminance;      /**< Luminance: 0 none, 1 the three members below, 2 the sink's. */
+  i32 hdr_max;            /**< Desired maximum luminance, as coded in @ref hdmi2_t::luminance, 0 to 255. */
+  i32 hdr_average;        /**< Desired maximum frame-average luminance, likewise. */
+  i32 hdr_min;            /**< Desired minimum luminance, likewise. */
+  i32 bt2020_rgb;         /**< BT.2020 RGB, tri-state. */
+  i32 bt2020_ycc;         /**< BT.2020 YCbCr, tri-state. */
+  i32 bt2020_cycc;        /**< BT.2020 with constant luminance, tri-state. */
+  i32 rgb_quantization;   /**< Selectable RGB quantization range, tri-state. */
+  i32 ycc_quantization;   /**< Selectable YCC quantization range, tri-state. */
+  i32 pass_hdr_dynamic;   /**< 1: pass on the sink's HDR dynamic metadata data block. */
+  i32 pass_hdr10plus;     /**< 1: pass on the sink's HDR10+ block. */
+  i32 pass_dolby_vision;  /**< 1: pass on the sink's Dolby Vision block. */
+  i32 pass_freesync;      /**< 1: pass on the sink's FreeSync block. */
+} hdmi2_values_t;
+
+/**
+ * Fills a record with the defaults that the configuration's keys have (@ref configuration_key): nothing is offered.
+ *
+ * @param values its size is set by the caller; the other members receive their defaults.
+ * @return true; false with an error line when @p values is NULL or its size is too small for the record's first
+ * version.
+ */
+EDID_COMPOSER_API bool hdmi2_values_init(hdmi2_values_t *values);
+
+/**
+ * Decodes what the CTA-861 extensions of a whole EDID say of HDMI 2.
+ *
+ * Extensions count that the base block announces and that are there: those of tag 2, revision 3, a right checksum and a
+ * timing offset of at most 127, the first 8 of them. Others are passed over without a line. A warning is given for a
+ * data block that ends after its collection, which ends the reading of that extension; for a block that is too short,
+ * which counts as none; and for bits of a 4:2:0 map that no descriptor belongs to, which are cleared. What
+ * @ref decode_edid_extensions reports is not reported again.
+ *
+ * @param edid the EDID, of which @p edid_bytes bytes are read.
+ * @param edid_bytes its size, bytes; a multiple of 128 other than 0.
+ * @param hdmi2 its size is set by the caller; the other members are cleared, then filled. A record that is larger than
+ *        this version's keeps what it has after that, and its size becomes this version's.
+ * @return true; false with an error line for a NULL argument, a record or an EDID of another size, or a base block with
+ *         a wrong header, checksum or version. The record, if there is one, then says that the EDID has none of it.
+ */
+EDID_COMPOSER_API bool decode_hdmi2(const u8 *edid, u32 edid_bytes, hdmi2_t *hdmi2);
+
+/**
+ * Encodes a record as data blocks, one after the other: video data blocks of up to 31 descriptors, then the others in
+ * the order of the record's members. What @ref decode_hdmi2 has read of an EDID comes back when it reads these blocks.
+ *
+ * @param hdmi2 the record. A number that is too large for its field is written as the largest that it holds, a rate
+ * that is no multiple of 5 MHz as the next lower one; a block to be passed on that is too short is left out.
+ * @param blocks receives the data blocks; not NULL.
+ * @param size its size, bytes; an extension has room for 123, for 105 beside a detailed timing.
+ * @param used receives the bytes that all blocks need, also when they are more than @p size; not NULL.
+ * @return true when all blocks were written; false with an error line, and nothing written, for a NULL argument or too
+ *         little room.
+ */
+EDID_COMPOSER_API bool encode_hdmi2(const hdmi2_t *hdmi2, u8 *blocks, u32 size, u32 *used);
+
+/**
+ * Prints a record as a report on standard output: every field in words, values with units; "none" for each block that
+ * the EDID doesn't have. Bits without a name are printed by their number.
+ *
+ * @param hdmi2 the record.
+ * @param title first line, NUL-terminated; NULL prints as an empty one.
+ * @return true; false with an error line when @p hdmi2 is NULL or its size too small.
+ */
+EDID_COMPOSER_API bool print_hdmi2(const hdmi2_t *hdmi2, const char *title);
+
+/** Name of a VIC above 64 (CTA-861, section 4), such as "3840x2160p60Hz16x9"; "Unknown Value" for any but 65 to 127 and
+ *  193 to 219. */
+EDID_COMPOSER_API const char *extended_vic_string(u32 vic);
+/** @} */
+
 /** @defgroup configuration What is read of the platform configuration
  *
  * The library's keys as data, and a record of what each composition reads of them: what counts, what was replaced or
@@ -489,7 +696,8 @@ enum configuration_kind {
   CONFIGURATION_HDMI_VICS = 5,        /**< A list of integers: HDMI_VICs (HDMI 1.4a, section 8.2.3.1). */
   CONFIGURATION_TIMING_BITS = 6,      /**< A list of integers: bit numbers of a byte of timings. */
   CONFIGURATION_STANDARD_TIMINGS = 7, /**< A list of texts: width, height and refresh rate, as in "1280 720 60". */
-  CONFIGURATION_AUDIO_FORMATS = 8     /**< 26 keys with an integer each: "a" to "z" in the place of the path's "?". */
+  CONFIGURATION_AUDIO_FORMATS = 8,    /**< 26 keys with an integer each: "a" to "z" in the place of the path's "?". */
+  CONFIGURATION_EXTENDED_VICS = 9     /**< A list of integers: VICs from 65 to 127 and from 193 to 219. */
 };
 
 /**
@@ -560,8 +768,8 @@ typedef struct configuration_reading_t {
 /**
  * Receives what was read.
  *
- * Called on the thread that composes while the configuration is read: once for each key, and before a list's key for
- * each of its entries. Audio formats that are absent are passed over.
+ * Called on the thread that composes: once for each key that is read, and before a list's key for each of its entries.
+ * Passed over are audio formats that are absent, and, where HDMI 2 is off, the keys of its table but `enable`.
  *
  * @param reading the record; it is gone when the call returns.
  * @param context @ref compose_request_t::configuration_observer_context.
@@ -673,7 +881,47 @@ enum compose_subject {
   /** Modes added to reach the fewest an EDID has; code: how many. */
   COMPOSE_SUBJECT_PADDING = 13,
   /** Room in the CEA extension; code: bytes needed before the checksum. */
-  COMPOSE_SUBJECT_EXTENSION_ROOM = 14
+  COMPOSE_SUBJECT_EXTENSION_ROOM = 14,
+  /* HDMI 2, where the composition has it */
+  /** A mode above VIC 64; code: its VIC (CTA-861, section 4). */
+  COMPOSE_SUBJECT_EXTENDED_MODE = 15,
+  /** The rate of the link to the box, told above 340 MHz; code: MHz. */
+  COMPOSE_SUBJECT_LINK_RATE = 16,
+  /** A transfer function of HDR; code: its bit of @ref hdmi2_eotf. */
+  COMPOSE_SUBJECT_HDR = 17,
+  /** A colour space; code: its bit of @ref hdmi2_colorimetry. */
+  COMPOSE_SUBJECT_COLORIMETRY = 18,
+  /** YCbCr 4:2:0; code: how many modes may be sent in it. */
+  COMPOSE_SUBJECT_YCBCR_420 = 19,
+  /** A colour depth in 4:2:0; code: bits per pixel, 30 or 36. */
+  COMPOSE_SUBJECT_DEEP_COLOR_420 = 20,
+  /** The auto low-latency mode; code: 1 or 0. */
+  COMPOSE_SUBJECT_ALLM = 21,
+  /** The variable refresh rate; code: its lowest rate in Hz, 0 when it is not offered. */
+  COMPOSE_SUBJECT_VRR = 22,
+  /** A quantization range that sources may select; code: 0 of RGB, 1 of YCbCr. */
+  COMPOSE_SUBJECT_QUANTIZATION = 23,
+  /** A block of the sink that can be passed on; code: @ref compose_room_item of it, 1 to 4. */
+  COMPOSE_SUBJECT_PASSED_BLOCK = 24,
+  /** That the VICs of 4Kx2K modes are taken as well as their HDMI_VICs; code: 1 or 0. */
+  COMPOSE_SUBJECT_UHD_VIC = 25,
+  /** A mode above VIC 64 as first detailed timing; code: its VIC, 0 for none. */
+  COMPOSE_SUBJECT_PREFERRED_TIMING = 26,
+  /** Something that was left out for room; code: @ref compose_room_item. None when everything has room. */
+  COMPOSE_SUBJECT_ROOM_ITEM = 27
+};
+
+/** What is left out for room, in this order, until the rest fits. */
+enum compose_room_item {
+  COMPOSE_ROOM_FREESYNC = 1,       /**< The FreeSync block. */
+  COMPOSE_ROOM_HDR_DYNAMIC = 2,    /**< The HDR dynamic metadata data block. */
+  COMPOSE_ROOM_HDR10PLUS = 3,      /**< The HDR10+ block. */
+  COMPOSE_ROOM_DOLBY_VISION = 4,   /**< The Dolby Vision block. */
+  COMPOSE_ROOM_3D_STRUCTURES = 5,  /**< 3D structures beyond the mandatory ones, all of them. */
+  COMPOSE_ROOM_MODES = 6,          /**< Modes up to VIC 64, from the last on. */
+  COMPOSE_ROOM_MODES_IN_420 = 7,   /**< Modes that are offered in 4:2:0 only, from the last on. */
+  COMPOSE_ROOM_EXTENDED_MODES = 8, /**< Other modes above VIC 64, from the last on. */
+  COMPOSE_ROOM_SERIAL_TEXT = 9     /**< The serial number text, which comes after all of these. */
 };
 
 /** What was decided; @ref compose_decision_t::verdict. */
@@ -707,7 +955,8 @@ enum compose_reason {
   COMPOSE_REASON_OTHER_REFRESH_FAMILY = 7,
   /** Above the geometry limit {lines of the mode, limit}. */
   COMPOSE_REASON_TALLER_THAN_SINK = 8,
-  /** Chosen, but the extension holds no more of its kind {descriptors of its kind there}. */
+  /** Chosen, but the extension holds no more of its kind {descriptors of its kind there; of what HDMI 2 leaves out for
+   *  room: how many}. */
   COMPOSE_REASON_NO_ROOM = 9,
   /** No VIC has it {active pixels, active lines of a frame or 0, Hz, 1 interlaced}. */
   COMPOSE_REASON_TIMING_WITHOUT_VIC = 10,
@@ -806,7 +1055,58 @@ enum compose_reason {
   /** A data block is too long for its length field, and read as shorter {as above}. */
   COMPOSE_REASON_BLOCK_TOO_LONG = 57,
   /** The base block doesn't announce the extension, as without a monitor name {as above}. */
-  COMPOSE_REASON_NOT_ANNOUNCED = 58
+  COMPOSE_REASON_NOT_ANNOUNCED = 58,
+  /* HDMI 2 */
+  /** In 4:2:0 only, as it is too fast otherwise {its kHz, its kHz in 4:2:0, limit in kHz}. */
+  COMPOSE_REASON_ONLY_IN_420 = 59,
+  /** Above the rate of the link {its kHz, limit in kHz, 1 when it is the box's, 0 when it is that of box and sink}. */
+  COMPOSE_REASON_ABOVE_RATE = 60,
+  /** The sink has it in 4:2:0 only, in which it is not offered {setting}. */
+  COMPOSE_REASON_SINK_HAS_IT_IN_420 = 61,
+  /** The platform does not offer it {setting, 1 when the sink has it}. */
+  COMPOSE_REASON_OFF = 62,
+  /** The box does it itself {as above}. */
+  COMPOSE_REASON_BOX_ITSELF = 63,
+  /** As the sink, which has it {as above}. */
+  COMPOSE_REASON_AS_SINK = 64,
+  /** As the sink, which doesn't have it {as above}. */
+  COMPOSE_REASON_SINK_WITHOUT = 65,
+  /** No range that a source may use {minimum, maximum, the sink's minimum, its maximum, Hz}. */
+  COMPOSE_REASON_VRR_RANGE_INVALID = 66,
+  /** 340 MHz, the most that the HDMI block tells, as the link carries more {its MHz}. */
+  COMPOSE_REASON_TMDS_OF_LINK = 67,
+  /** What the modes above VIC 64 need {kHz of the fastest on the link}. */
+  COMPOSE_REASON_TMDS_OF_EXTENDED_MODES = 68,
+  /** Cut to what box and sink take, or to what the modes need {MHz wanted, MHz}. */
+  COMPOSE_REASON_TMDS_LIMITED = 69,
+  /** The sink's block, byte for byte {its bytes}. */
+  COMPOSE_REASON_PASSED_ON = 70,
+  /** The sink's block announces a mode above the rate of the link {MHz of the mode, MHz of the link}. */
+  COMPOSE_REASON_RATE_BELOW_BLOCK = 71,
+  /** The sink's range of refresh rates is not offered unchanged. */
+  COMPOSE_REASON_VRR_CHANGED = 72,
+  /** What the box's receiver takes {its MHz, the sink's MHz}. */
+  COMPOSE_REASON_LINK_RATE_OF_BOX = 73,
+  /** What the sink takes {as above}. */
+  COMPOSE_REASON_LINK_RATE_OF_SINK = 74,
+  /** What modes that the box makes itself need {as above}. */
+  COMPOSE_REASON_LINK_RATE_OF_ADDED_MODES = 75,
+  /** No offered mode is fast enough for it, or none that the sink takes in it {setting, 1 when the sink has any}. */
+  COMPOSE_REASON_NO_MODE_IN_420 = 76,
+  /** No offered mode in 4:2:0 leaves room for it on the link {MHz of the link, setting}. */
+  COMPOSE_REASON_RATE_BELOW_DEPTH = 77,
+  /** HDMI requires 30 bit where 36 bit is offered. */
+  COMPOSE_REASON_DEEP_COLOR_420_REQUIRED = 78,
+  /** A 4Kx2K mode is offered by its HDMI_VIC and by its VIC. */
+  COMPOSE_REASON_UHD_VIC_OF_MODES = 79,
+  /** No 4Kx2K mode is offered by both. */
+  COMPOSE_REASON_NO_UHD_VIC = 80,
+  /** Nothing else calls for the HDMI Forum block, which would say so. */
+  COMPOSE_REASON_NO_FORUM_BLOCK = 81,
+  /** The first mode above VIC 64 that a detailed timing can hold. */
+  COMPOSE_REASON_FIRST_EXTENDED_MODE = 82,
+  /** No offered mode above VIC 64 fits a detailed timing. */
+  COMPOSE_REASON_NO_EXTENDED_TIMING = 83
 };
 
 /** Who named a candidate; bits of @ref compose_decision_t::origins. */
@@ -834,7 +1134,9 @@ enum compose_origin {
   /** The caller's current mode. */
   COMPOSE_ORIGIN_CURRENT_MODE = 0x0400,
   /** The library itself: padding and basic audio. */
-  COMPOSE_ORIGIN_LIBRARY = 0x0800
+  COMPOSE_ORIGIN_LIBRARY = 0x0800,
+  /** The sink's 4:2:0 video block; place in sink_index. */
+  COMPOSE_ORIGIN_SINK_420 = 0x1000
 };
 
 /** One decision of a composition. It holds no pointers: a copy of it keeps its meaning. */
@@ -984,6 +1286,8 @@ typedef struct compose_request_t {
   configuration_observer_t configuration_observer; /**< Receives what is read of the configuration; may be NULL. Not
                                                         called where @ref platform_values is given. */
   void *configuration_observer_context;            /**< Goes to @ref configuration_observer as it is. */
+  const hdmi2_values_t *hdmi2; /**< What the platform says of HDMI 2. NULL: the configuration is read, unless
+                                    @ref platform_values is given, which leaves HDMI 2 off. */
 } compose_request_t;
 
 /** What a composition returns. Set size; all other members are filled, on failure too. */
@@ -994,18 +1298,20 @@ typedef struct compose_result_t {
                                     them for each input; 0 when the composition failed. */
   u32 sink_status;             /**< What became of the sink's base block; @ref compose_sink_status. 0 when the call was
                                     refused before the sink was looked at. */
-  u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. */
+  u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. With HDMI 2, of the first
+                                    CTA-861 extension that can be read, of block 1 where there is none. */
   u32 sink_malformed_at; /**< The byte, when @ref sink_extension_status is COMPOSE_EXTENSION_MALFORMED, of block 1, from
                             0, at which the data block begins that overruns; else 0. */
-  u32 sink_blocks_unread; /**< Extension blocks after block 1 that are announced and given, but not read. */
+  u32 sink_blocks_unread; /**< Extension blocks after block 1 that are announced and given, but not read. With HDMI 2,
+                               those of all blocks. */
 } compose_result_t;
 
 /**
  * Composes as @ref compose_edid_internal does, from a request record into a result record.
  *
- * What is written, and every line, is the same as from @ref compose_edid_internal, in whose name the lines are, with an
- * observer or a log callback and without. An observed composition needs list entries of its own; when one cannot be
- * had, that is reported, the composition goes on, and no decision is passed on.
+ * What is written, and every line, is the same as from @ref compose_edid_internal, in whose name the lines are, unless
+ * HDMI 2 is asked for (@ref hdmi2); with observer or log callback and without. An observed composition needs list
+ * entries of its own; when one cannot be had, that is reported and no decision is passed on, but the EDID is written.
  *
  * Several threads may compose at once, each with its own request, result and buffers; each call's lines go to its own
  * callback.

@@ -58,11 +58,9 @@ void decode_identity(const byte_view_t &block, edid_t *edid) {
 }
 
 bool verify_version(const edid_t &edid) {
-  constexpr u8 version = 1;
-  constexpr u8 revision = 3;
-  if (edid.version == version && edid.revision >= revision) return true;
-  LOG_ERROR("Failed EDID Version/Revision check. Expected:%d.%d Recieved:%d.%d", version, revision, edid.version,
-            edid.revision);
+  if (base_block::is_supported(edid.version, edid.revision)) return true;
+  LOG_ERROR("Failed EDID Version/Revision check. Expected:%d.%d Recieved:%d.%d", base_block::supported_version,
+            base_block::least_revision, edid.version, edid.revision);
   return false;
 }
 

@@ -35,6 +35,13 @@ inline constexpr u32 letter_base = 0x40;
 inline constexpr u32 letter_mask = 0x1F;
 inline constexpr u32 letter_shifts[3] = {10, 5, 0};
 
+inline constexpr u8 supported_version = 1;
+inline constexpr u8 least_revision = 3;
+
+constexpr bool is_supported(u8 version_byte, u8 revision_byte) {
+  return version_byte == supported_version && revision_byte >= least_revision;
+}
+
 inline constexpr u32 year_base = 1990;
 inline constexpr u8 digital_input = 0x80;
 

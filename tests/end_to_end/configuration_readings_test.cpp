@@ -111,18 +111,19 @@ TEST(ConfigurationKeys, HoldEachKeyOnceWithWhatItsKindHas) {
     EXPECT_TRUE(names.insert(key->name).second);
     EXPECT_EQ(key->path, "platform.software.drivers.vorex.edid." + std::string(key->name));
     EXPECT_GE(key->kind, CONFIGURATION_INTEGER);
-    EXPECT_LE(key->kind, CONFIGURATION_AUDIO_FORMATS);
+    EXPECT_LE(key->kind, CONFIGURATION_EXTENDED_VICS);
     EXPECT_LE(key->minimum, key->maximum);
     EXPECT_STRNE(key->meaning, "");
     const bool has_text_entries = key->kind == CONFIGURATION_VIDEO_MODES || key->kind == CONFIGURATION_STANDARD_TIMINGS;
     EXPECT_EQ(key->entry_characters, has_text_entries ? 28U : 0U);
   }
-  EXPECT_EQ(names.size(), 36U);
-  EXPECT_EQ(configuration_key(36), nullptr);
+  EXPECT_EQ(names.size(), 69U);
+  EXPECT_EQ(configuration_key(69), nullptr);
   EXPECT_EQ(configuration_key(0xFFFFFFFF), nullptr);
 }
 
 TEST_F(ConfigurationReadings, CoverEachKeyOnceInTheOrderOfTheTable) {
+  tree_.set("hdmi2.enable", 1);
   std::vector<std::string> read;
   for (const kept_reading_t &reading : observe()) {
     if (reading.entry == -1) read.push_back(reading.key);

@@ -27,11 +27,12 @@ rank() {
 # The rooms that a room of the composer may include besides itself; compose, above them, all.
 allowed_rooms() {
   case $1 in
-    inputs | platform) ;;
+    inputs | platform | codec) ;;
     selection) echo inputs ;;
     new_edid) echo inputs selection ;;
     explain) echo inputs selection new_edid ;;
-    compose) echo inputs platform selection new_edid explain ;;
+    hdmi2) echo inputs platform selection new_edid explain codec ;;
+    compose) echo inputs platform selection new_edid explain hdmi2 codec ;;
     *) return 1 ;;
   esac
 }

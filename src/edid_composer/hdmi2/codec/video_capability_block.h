@@ -1,0 +1,10 @@
+// The video capability data block (CTA-861, section 7.5.6).
+#pragma once
+
+#include "edid_composer/hdmi2/codec/data_block_codec.h"
+
+namespace edid_composer {
+
+extern const block_codec_t video_capability_block;
+
+}  // namespace edid_composer
