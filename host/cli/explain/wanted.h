@@ -17,7 +17,7 @@ struct wanted_t {
 
 /// "16", "vic 95", "1080p60", "1920x1080p60", "4k30", "4k:1", "ac3", "pcm8", "audio:2", "3d", "deep-color". More than
 /// one where modes differ in their aspect ratio only. Throws bad_input_t.
-std::vector<wanted_t> parse_wanted(std::string_view text);
+std::vector<wanted_t> parse_wanted(std::string_view original);
 
 /// "1920x1080p60 16:9 (VIC 16)".
 std::string wanted_name(const wanted_t &wanted);

@@ -72,7 +72,6 @@ constexpr std::size_t most_modes() {
 
 std::vector<u8> made_sink(u32 family, std::span<const u32> vics) {
   std::vector<u8> edid;
-  edid.reserve(2 * edid_block_size);
   append(edid, base_block_begin);
   family == 50 ? append(edid, timing_50) : append(edid, timing_60);
   append(edid, dummy_descriptor);
