@@ -157,7 +157,8 @@ const settings = (() => {
 
   const row = description => {
     const id = `setting-${description.name}`;
-    const label = element("label", { for: id }, description.name.replaceAll("-", " "));
+    const words = description.name.replaceAll("-", " ");
+    const label = element("label", { for: id }, words.length < 3 ? words.toUpperCase() : words);
     return element("div", { class: description.is_flag ? "setting flag" : "setting" }, label,
       control(description, id, `${id}-help`),
       element("p", { class: "quiet", id: `${id}-help` }, description.description),

@@ -28,12 +28,16 @@ const show = result => {
   tabs.show(result);
 };
 
+/** Whoever waits for the page hears of each composition. */
+const announce = () => document.dispatchEvent(new CustomEvent("composed"));
+
 const compose = async () => {
   try {
     show(await core.ask("compose", composition()));
   } catch (failure) {
     show({ findings: [], problems: [{ place: "page", text: failure.message }] });
   }
+  announce();
 };
 
 /** The fragment follows what is composed, so that the address can be copied as well. */
@@ -101,7 +105,7 @@ const start = async () => {
 };
 
 // For scripts in the browser's console, and for tests.
-window.edidComposer = { ask: core.ask, state };
+window.edidComposer = Object.freeze({ ask: core.ask, state });
 
 start().catch(failure => {
   byId("title").textContent = "This browser cannot run the page";

@@ -25,7 +25,7 @@ const showSummary = explanation => {
       fact("Best video", summary.best_video || "none", "big"),
       fact("Preferred video", summary.preferred_video || "none", "big"),
       fact("Audio", lines(summary.audio)),
-      explanation.sink ? fact("Lost: the display has it, the box does not show it", lostOf(summary.lost), "lost") : null,
+      explanation.sink ? fact("Lost: the display has it, the box does not show it", lostOf(summary.lost), summary.lost.length ? "lost" : "") : null,
       summary.reasons.length ? fact("Most common reasons", lines(summary.reasons.map(({ reason, count }) => `${count} × ${reason}`))) : null),
     element("ul", { class: "counts" }, summary.counts.map(({ title, offered, left_out: leftOutCount }) => element("li", {},
       title, ": ", element("b", {}, `${offered} offered`), `, ${leftOutCount} left out`))));
