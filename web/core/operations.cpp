@@ -53,7 +53,7 @@ class transcript_t {
   std::string text() const { return valid_utf8(edid_cli::printable_lines(text_)); }
 
  private:
-  static constexpr std::size_t most_characters = 500'000;
+  static constexpr std::size_t most_characters = 200'000;
   std::string text_;
   bool is_cut_ = false;
 };
@@ -66,18 +66,26 @@ json_t json_finding(const edid_cli::finding_t &finding) {
           {"text", valid_utf8(finding.text)}};
 }
 
-json_t findings_of(const inputs_t &inputs) {
-  json_t list = json_t::array();
+/// Nobody reads more of them.
+constexpr std::size_t most_findings = 500;
+
+edid_cli::findings_t findings_of(const inputs_t &inputs) {
   if (!inputs.is_platform_loaded) {
-    return list;
+    return {};
   }
   std::vector<edid_cli::named_sink_t> sinks;
   if (!inputs.sink.bytes.empty()) {
     sinks.push_back({inputs.sink.name, inputs.sink.bytes});
   }
-  const auto findings = edid_cli::check_platform_with_settings(sinks).findings;
-  std::transform(findings.begin(), findings.end(), std::back_inserter(list), json_finding);
-  return list;
+  return edid_cli::check_platform_with_settings(sinks).findings;
+}
+
+/// The first of the findings, and how many there are.
+json_t json_findings(const edid_cli::findings_t &findings) {
+  json_t list = json_t::array();
+  const auto shown = std::span(findings).first(std::min(findings.size(), most_findings));
+  std::transform(shown.begin(), shown.end(), std::back_inserter(list), json_finding);
+  return {{"findings", std::move(list)}, {"findings_in_all", findings.size()}};
 }
 
 /// Composes, and complains where the library refuses.
@@ -91,7 +99,7 @@ observation_t observe(inputs_t &inputs, transcript_t &transcript) {
 
 std::string compose(const json_t &request, std::string_view) {
   inputs_t inputs(request);
-  json_t members{{"findings", findings_of(inputs)}};
+  json_t members = json_findings(findings_of(inputs));
   std::string explanation;
   if (inputs.are_usable()) {
     transcript_t transcript;

@@ -21,6 +21,17 @@ const run = (request, content) => {
   }
 };
 
+/** The page shows no more of a list than that, and to send it takes longer than to make it. */
+const MOST_ENTRIES = 2000;
+
+const bounded = value => {
+  if (Array.isArray(value)) {
+    return value.slice(0, MOST_ENTRIES).map(bounded);
+  }
+  return value !== null && typeof value === "object"
+    ? Object.fromEntries(Object.entries(value).map(([name, member]) => [name, bounded(member)])) : value;
+};
+
 const start = module => createCore({
   instantiateWasm: (imports, done) => {
     const instance = new WebAssembly.Instance(module, imports);
@@ -40,7 +51,7 @@ onmessage = async event => {
   }
   const begin = performance.now();
   try {
-    const answer = run(request, content || new Uint8Array());
+    const answer = bounded(run(request, content || new Uint8Array()));
     postMessage({ id, answer, milliseconds: performance.now() - begin });
   } catch (problem) {
     // What the core is after that is unknown: the page starts another.

@@ -1,5 +1,7 @@
 // Two EDIDs side by side, and all displays in front of the same platform.
 
+const NO_DISPLAY = "There is no display to compare with: open the EDID of one, or take a sample.";
+
 const differences = { left: "sink", right: "new", changesOnly: true };
 let lastHex = "";  // The new EDID as text.
 
@@ -23,6 +25,10 @@ const differenceTable = (rows, left, right) => {
 
 const showDifferences = ({ explanation, hex }) => {
   lastHex = hex;
+  if (!state.sinks.length) {
+    fill(byId("differences"), element("h3", {}, "Field by field"), element("p", {}, NO_DISPLAY));
+    return;
+  }
   const choices = comparable();
   const keys = choices.map(([key]) => key);
   differences.left = keys.includes(differences.left) ? differences.left : keys[0];
@@ -73,5 +79,5 @@ const showDisplays = async () => {
   };
   const rows = await Promise.all(state.sinks.map(row));
   fill(byId("displays"), element("h3", {}, "The same box in front of each display"),
-    rows.length ? table(headers, rows) : element("p", {}, "Open a display's EDID first."));
+    rows.length ? table(headers, rows) : element("p", {}, NO_DISPLAY));
 };

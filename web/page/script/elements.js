@@ -34,7 +34,7 @@ const tableRow = (headers, cells, named, attributes = {}) => element("tr", attri
     : element("td", { "data-label": headers[index] }, cell)));
 
 /** The first of many: a hostile input has no end of rows, which a browser would choke on. */
-const MOST_ROWS = 1000;
+const MOST_ROWS = 500;
 const limited = (list, most = MOST_ROWS) => list.slice(0, most);
 const leftOut = (list, most = MOST_ROWS) => list.length <= most ? null
   : element("p", { class: "quiet" }, `${list.length - most} more are not shown.`);

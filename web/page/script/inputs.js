@@ -194,6 +194,7 @@ const settings = (() => {
 const platform = (() => {
   const DEFAULT_NAME = "default platform";
   const OWN_NAME = "platform.toml";
+  const MOST_FINDINGS = 100;
   const select = byId("platforms");
   let defaultText = "";
   let undone = null;  // What "Undo" brings back.
@@ -253,15 +254,16 @@ const platform = (() => {
   };
 
   /** What check-platform finds, at its lines and in a list. */
-  const showFindings = list => {
+  const showFindings = (list, inAll) => {
     editor.show(list);
     const number = severity => list.filter(finding => finding.severity === severity).length;
     const parts = ["error", "warning", "note"].filter(number).map(severity => counted(number(severity), severity));
-    byId("finding-count").textContent = parts.join(", ") || "No findings.";
-    fill(byId("findings"), limited(list, 100).map(({ severity, line, key, text }) => element("li", { class: severity },
+    byId("finding-count").textContent = inAll > list.length ? `${inAll} findings, of which the first are shown.`
+      : parts.join(", ") || "No findings.";
+    fill(byId("findings"), limited(list, MOST_FINDINGS).map(({ severity, line, key, text }) => element("li", { class: severity },
       line ? element("button", { type: "button", onclick: () => editor.goTo(line) }, `line ${line}`) : null,
       element("b", {}, severity), " ", key ? element("code", {}, key) : null, key ? ": " : "", text)),
-    list.length > 100 ? element("li", {}, `and ${list.length - 100} more`) : null);
+    list.length > MOST_FINDINGS ? element("li", {}, "and more") : null);
   };
 
   return { draw, listen, open, take, showFindings, get text() { return editor.text; }, ownName: OWN_NAME };

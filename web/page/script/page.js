@@ -11,7 +11,7 @@ const show = result => {
     .map(problem => ({ severity: "error", key: "", ...problem }));
   // What is wrong with the settings' table of a platform is among the findings already.
   const isFound = problem => result.findings.some(finding => finding.line === problem.line && finding.severity === "error");
-  platform.showFindings([...ofPlatform.filter(problem => !isFound(problem)), ...result.findings]);
+  platform.showFindings([...ofPlatform.filter(problem => !isFound(problem)), ...result.findings], result.findings_in_all || 0);
   settings.complain(problems);
   showProblems(problems);
   byId("results").classList.toggle("old", !explanation);
