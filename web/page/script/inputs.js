@@ -219,6 +219,10 @@ const platform = (() => {
   const open = async file => {
     try {
       const text = new TextDecoder("utf-8", { fatal: true }).decode(await bytesOf(file));
+      const problem = editor.refusal(text);
+      if (problem) {
+        throw new Error(`${file.name} has ${problem}.`);
+      }
       take({ name: file.name, text });
     } catch (failure) {
       tell(failure instanceof TypeError ? `${file.name}: is no text in UTF-8` : failure.message);

@@ -77,7 +77,12 @@ const readLink = async () => {
     return;
   }
   try {
-    Object.assign(state, await link.read(fragment));
+    const given = await link.read(fragment);
+    const problem = given.platform && editor.refusal(given.platform.text);
+    if (problem) {
+      throw new Error(`its platform has ${problem}`);
+    }
+    Object.assign(state, given);
   } catch (failure) {
     tell(`The link cannot be read: ${failure.message}.`);
   }

@@ -1,10 +1,17 @@
 // The parts of a result behind tabs. One that is not seen is drawn when it is opened, or printed.
 
 const tabs = (() => {
-  const draws = {
-    decisions: showDecisions, bytes: showBytes, differences: showDifferences, displays: showDisplays,
-    report: showReport, keys: showKeys, messages: showMessages,
+  /** How each is drawn, and from what: while that is the same, what is drawn stays, with its scroll bar and the focus in it. */
+  const parts = {
+    decisions: [showDecisions, ({ explanation }) => explanation.decisions],
+    bytes: [showBytes, ({ explanation }) => explanation.edid],
+    differences: [showDifferences, ({ explanation, hex }) => [explanation.comparison, hex, state.sinks, state.active]],
+    displays: [showDisplays, () => [state.sinks, state.platform, state.settings]],
+    report: [showReport, ({ report, sink_report: sinkReport }) => [report, sinkReport]],
+    keys: [showKeys, ({ explanation }) => explanation.keys],
+    messages: [showMessages, ({ messages }) => messages],
   };
+  const drawn = {};
   const panels = [...document.querySelectorAll("[role=tabpanel]")];
   let result = null;
   let stale = new Set();
@@ -12,8 +19,14 @@ const tabs = (() => {
   let buttons = [];
 
   const draw = id => {
-    if (result && stale.delete(id)) {
-      draws[id](result);
+    if (!result || !stale.delete(id)) {
+      return;
+    }
+    const [show, from] = parts[id];
+    const content = JSON.stringify(from(result));
+    if (drawn[id] !== content) {
+      drawn[id] = content;
+      show(result);
     }
   };
 
@@ -53,7 +66,7 @@ const tabs = (() => {
     },
     show: given => {
       result = given;
-      stale = new Set(Object.keys(draws));
+      stale = new Set(Object.keys(parts));
       draw(open);
     },
   };
