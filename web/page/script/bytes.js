@@ -55,8 +55,10 @@ const showBytes = ({ explanation }) => {
   const rows = fields.map(field => [hexNumber(field.offset),
     element("code", {}, bytes.slice(field.offset, field.offset + field.size).map(byte => byte.toString(16).toUpperCase().padStart(2, "0")).join(" ")),
     colored(element("span", { class: "part" }, field.part), field.part), field.name, field.meaning]);
+  const fieldTable = table(["Offset", "Bytes", "Part", "Field", "Meaning"], rows);
+  fieldTable.className = "bytewise";
   fill(byId("bytes"), element("h3", {}, `The ${bytes.length} bytes`),
     element("p", { class: "quiet hint" }, "Point at, tap or move to a byte with the arrow keys: what it means stands below."),
-    blocks, now, element("h4", {}, "Byte by byte"), table(["Offset", "Bytes", "Part", "Field", "Meaning"], rows));
+    blocks, now, element("h4", {}, "Byte by byte"), fieldTable);
   tell(0);
 };

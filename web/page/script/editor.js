@@ -110,6 +110,7 @@ const editor = (() => {
       draw();
     },
     goTo: line => {
+      field.closest("details").open = true;
       const begin = lines.slice(0, line - 1).reduce((length, text) => length + text.length + 1, 0);
       field.focus();
       field.setSelectionRange(begin, begin + (lines[line - 1] || "").length);
