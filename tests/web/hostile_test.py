@@ -115,7 +115,7 @@ class Hostile(page.PageTest):
             print(f"{name}: the page stood for {self.browser.run('return window.longest') / 1000:.2f} s")
             self.lives(name)
         self.type_platform(page.default_platform())
-        self.assertEqual(self.text("#title"), "EDID for no sink behind platform.toml")
+        self.assertEqual(self.text("#title"), "EDID of platform.toml for no sink")
 
     def test_a_worker_that_does_not_return_is_stopped_and_the_page_goes_on(self):
         said = self.browser.run("""
@@ -128,7 +128,7 @@ class Hostile(page.PageTest):
         self.assertEqual(said, "This took longer than 5 s and was stopped.")
         self.assertEqual(self.browser.run("return window.stopped"), 1)
         self.drop("tv.bin", sinks.sink(vics=[16], name=b"after it"))
-        self.assertEqual(self.text("#title"), "EDID for after it behind default platform")
+        self.assertEqual(self.text("#title"), "EDID of default platform for after it")
         self.lives("a silent worker")
 
     def test_a_request_that_makes_no_sense_ends_in_an_error(self):

@@ -14,7 +14,7 @@ LIMIT = 50  # Milliseconds.
 
 class Composing(page.PageTest):
     def test_it_begins_without_a_display(self):
-        self.assertEqual(self.text("#title"), "EDID for no sink behind default platform")
+        self.assertEqual(self.text("#title"), "EDID of default platform for no sink")
         self.assertEqual(self.platform(), page.default_platform())
         self.assertEqual(self.text("#finding-count"), "No findings.")
 
@@ -64,7 +64,7 @@ class Composing(page.PageTest):
         self.browser.click("#sinks .sink:last-child .remove")
         self.assertEqual(self.texts("#sinks label"), ["no display", page.SINKS[0].name])
         self.browser.click("#sinks .sink:last-child .remove")
-        self.wait("document.querySelector('#title').textContent.startsWith('EDID for no sink')")
+        self.wait("document.querySelector('#title').textContent === 'EDID of default platform for no sink'")
 
     def test_settings_are_those_of_the_program_and_their_mistakes_stand_below_them(self):
         settings = self.ask("about")["settings"]
@@ -108,7 +108,7 @@ class Composing(page.PageTest):
         self.assertEqual(self.platform(), (page.SOURCE / "examples/platforms/minimal.toml").read_text())
         self.drop("mine.toml", b"# mine\n" + page.default_platform().encode())
         self.assertTrue(self.platform().startswith("# mine"))
-        self.assertEqual(self.text("#title"), "EDID for no sink behind mine.toml")
+        self.assertEqual(self.text("#title"), "EDID of mine.toml for no sink")
         self.changed("document.querySelector('#platform-undo').click()")
         self.assertEqual(self.platform(), (page.SOURCE / "examples/platforms/minimal.toml").read_text())
         self.browser.run("const data = new DataTransfer(); data.items.add(new File([new Uint8Array([255, 0])], 'b.toml'));"
@@ -315,6 +315,18 @@ class Accessible(page.PageTest):
                                               "!table.querySelector('thead th[scope=col]') || "
                                               "table.querySelector('th:not([scope])')).length"), 0)
         self.assertEqual(self.browser.run("return document.documentElement.lang"), "en")
+
+    def test_what_changes_is_said_once(self):
+        """Screen readers say what is replaced in these; typing must not make them repeat it."""
+        self.assertEqual(self.browser.run("return document.querySelector('#heard').textContent"),
+                         "EDID of platform.toml for SAMPLE AVR: at best 1920x1080p60 16:9 (VIC 16), 6 lost.")
+        self.type_platform("[a\n")
+        self.browser.run("window.changes = 0; const watch = new MutationObserver(list => { window.changes += list.length; });"
+                         "for (const name of ['heard', 'problems']) watch.observe(document.getElementById(name), { childList: true })")
+        self.type_platform("[a\n\n")
+        self.assertEqual(self.browser.run("return window.changes"), 0)
+        self.type_platform(page.default_platform())
+        self.assertEqual(self.browser.run("return window.changes"), 1)
 
     def test_nothing_is_wider_than_a_phone(self):
         for width in (320, 390, 768, 1100, 1400):

@@ -23,6 +23,15 @@ const element = (tag, attributes = {}, ...children) => {
   return fill(node, ...children);
 };
 
+/** Replaces what an element says where it is something else: a screen reader says again what is replaced. */
+const fillAnew = (node, content, make) => {
+  const key = JSON.stringify(content);
+  if (node.dataset.content !== key) {
+    node.dataset.content = key;
+    fill(node, make());
+  }
+};
+
 /** A table with headers. Each row is a list of cells, the first of which names it where @p named; a cell is a text or an element. */
 const table = (headers, rows, named = true) => element("table", {},
   element("thead", {}, element("tr", {}, headers.map(header => element("th", { scope: "col" }, header)))),

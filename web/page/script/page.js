@@ -25,6 +25,7 @@ const show = result => {
   byId("footer").firstChild.data = `${explanation.program}, composed in ${Math.max(1, Math.round(result.milliseconds))} ms. ` +
     "One file, no requests: save this page, and it works without a network.";
   showSummary(explanation);
+  announceSummary(explanation);
   tabs.show(result);
 };
 

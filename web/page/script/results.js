@@ -3,8 +3,12 @@
 
 const SHOWN_LOST = 6;
 
-const showProblems = problems => fill(byId("problems"), problems.map(({ place, line, text }) => element("p", { class: "problem" },
-  element("b", {}, line ? `${place}, line ${line}` : place), ": ", text)));
+const showProblems = problems => fillAnew(byId("problems"), problems, () => problems.map(({ place, line, text }) =>
+  element("p", { class: "problem" }, element("b", {}, line ? `${place}, line ${line}` : place), ": ", text)));
+
+/** For those who hear the page: what has changed at the top of it. */
+const announceSummary = ({ title, summary }) => fillAnew(byId("heard"), [title, summary], () =>
+  `${title}: at best ${summary.best_video || "no video"}, ${summary.lost.length || "nothing"} lost.`);
 
 const warningsOf = ({ sink, warnings }) => [
   ...(sink ? sink.status.gaps : []).map(text => element("p", { class: "warning" }, element("b", {}, "Display: "), text)),

@@ -22,10 +22,11 @@ const want = (() => {
       const { name } = state.platform || { name: platform.ownName };
       if (result.platform !== platform.text) {
         platform.take({ name, text: result.platform });
+        tell("Done. “Undo” takes back what has changed in the platform.");
       } else {
         changed();
+        tell("Done: the settings have changed.");
       }
-      tell("The steps are done. “Undo” beside the platform takes them back.");
     } catch (failure) {
       tell(failure.message);
     }
