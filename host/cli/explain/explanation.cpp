@@ -2,7 +2,6 @@
 
 #include <string_view>
 
-#include "edid_text/alignment.h"
 #include "edid_text/edid_fields.h"
 #include "io/program_name.h"
 #include "io/standard_output.h"
@@ -75,16 +74,6 @@ std::vector<fact_t> platform_facts(const platform_check_t &check, const std::str
   }
   facts.push_back({"findings", {check.findings.empty() ? "none" : std::to_string(check.findings.size())}});
   return facts;
-}
-
-std::vector<compared_t> comparison_of(const edid_t &sink, const edid_t &new_edid) {
-  std::vector<compared_t> rows;
-  for (const edid_field_t &field : edid_fields()) {
-    for (const aligned_row_t &row : align(field.values(sink), field.values(new_edid))) {
-      rows.push_back({std::string(field.name), row.left.value_or("-"), row.right.value_or("-")});
-    }
-  }
-  return rows;
 }
 
 }  // namespace
