@@ -1010,7 +1010,36 @@ enum compose_reason {
   /** A data block is too long for its length field, and read as shorter {as above}. */
   COMPOSE_REASON_BLOCK_TOO_LONG = 57,
   /** The base block doesn't announce the extension, as without a monitor name {as above}. */
-  COMPOSE_REASON_NOT_ANNOUNCED = 58
+  COMPOSE_REASON_NOT_ANNOUNCED = 58,
+  /* HDMI 2 */
+  /** In 4:2:0 only, as it is too fast otherwise {its kHz, its kHz in 4:2:0, limit in kHz}. */
+  COMPOSE_REASON_ONLY_IN_420 = 59,
+  /** Above the rate of the link {its kHz, limit in kHz, 1 the sink's or 2 the box's}. */
+  COMPOSE_REASON_ABOVE_RATE = 60,
+  /** The sink has it in 4:2:0 only, in which it is not offered {setting of y420}. */
+  COMPOSE_REASON_SINK_HAS_IT_IN_420 = 61,
+  /** The platform does not offer it. */
+  COMPOSE_REASON_OFF = 62,
+  /** The box does it itself. */
+  COMPOSE_REASON_BOX_ITSELF = 63,
+  /** As the sink, which has it. */
+  COMPOSE_REASON_AS_SINK = 64,
+  /** As the sink, which doesn't have it. */
+  COMPOSE_REASON_SINK_WITHOUT = 65,
+  /** No range that a source may use {minimum, maximum in Hz, as worked out}. */
+  COMPOSE_REASON_VRR_RANGE_INVALID = 66,
+  /** 340 MHz, the most that the HDMI block tells, as the link carries more. */
+  COMPOSE_REASON_TMDS_OF_LINK = 67,
+  /** What the modes above VIC 64 need. */
+  COMPOSE_REASON_TMDS_OF_EXTENDED_MODES = 68,
+  /** Cut to what box and sink take. */
+  COMPOSE_REASON_TMDS_LIMITED = 69,
+  /** The sink's block, byte for byte. */
+  COMPOSE_REASON_PASSED_ON = 70,
+  /** The sink's block announces a mode above the rate of the link. */
+  COMPOSE_REASON_RATE_BELOW_BLOCK = 71,
+  /** The sink's range of refresh rates is not offered unchanged. */
+  COMPOSE_REASON_VRR_CHANGED = 72
 };
 
 /** Who named a candidate; bits of @ref compose_decision_t::origins. */

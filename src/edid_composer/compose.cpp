@@ -3,6 +3,9 @@
 #include "diagnostics.h"
 #include "edid_composer/edid_reading.h"
 #include "edid_composer/explain/explain.h"
+#include "edid_composer/hdmi2/layer.h"
+#include "edid_composer/hdmi2/layer_encoder.h"
+#include "edid_composer/hdmi2/platform_values.h"
 #include "edid_composer/journal.h"
 #include "edid_composer/new_edid/population.h"
 #include "edid_composer/platform/platform_values_reader.h"
@@ -67,11 +70,14 @@ bool is_output_valid(const compose_request_t &request) {
   return true;
 }
 
+configuration_readings_t readings_of(const compose_request_t &request) {
+  return {request.configuration_observer, request.configuration_observer_context};
+}
+
 /// The caller's platform values, else those of the configuration; null when that can't be read.
 const platform_values_t *platform_of(const compose_request_t &request, workspace_t *work) {
   if (request.platform_values != nullptr) return request.platform_values;
-  const configuration_readings_t readings(request.configuration_observer, request.configuration_observer_context);
-  if (_read_platform_values(&work->platform, &work->arena, readings)) return &work->platform;
+  if (_read_platform_values(&work->platform, &work->arena, readings_of(request))) return &work->platform;
   LOG_ERROR("Failed trying to read the platform config file.");
   return nullptr;
 }
@@ -104,13 +110,11 @@ bool run_stages(const inputs_t &inputs, edid_t *new_edid, journal_t *journal, ou
   return true;
 }
 
-/// Encodes the new record into the caller's buffer.
-bool write(const compose_request_t &request, const platform_values_t &platform, edid_t *new_edid, encoding_t *encoding,
-           compose_result_t *result) {
-  *encoding = encode(request.new_edid, static_cast<i32>(request.new_edid_bytes), new_edid, &platform);
-  const u8 offset = encoding->physical_address_offset;
+/// Takes over what became of the encoding.
+bool keep_encoding(const compose_request_t &request, const encoding_t &encoding, compose_result_t *result) {
+  const u8 offset = encoding.physical_address_offset;
   if (offset != 0 && request.settings->spa_offset != nullptr) *request.settings->spa_offset = offset;
-  if (!encoding->complete) {
+  if (!encoding.complete) {
     LOG_ERROR("Failed encoding the new edid.");
     return false;
   }
@@ -119,14 +123,24 @@ bool write(const compose_request_t &request, const platform_values_t &platform, 
   return true;
 }
 
-void read_sink_into(workspace_t *work, const compose_request_t &request, compose_sink_status status,
+/// Encodes the new record into the caller's buffer.
+bool write(const compose_request_t &request, const platform_values_t &platform, edid_t *new_edid, encoding_t *encoding,
+           compose_result_t *result) {
+  *encoding = encode(request.new_edid, static_cast<i32>(request.new_edid_bytes), new_edid, &platform);
+  return keep_encoding(request, *encoding, result);
+}
+
+/// Reads the sink, with HDMI 2 into @p hdmi2 too, which is null without.
+void read_sink_into(workspace_t *work, const compose_request_t &request, compose_sink_status status, hdmi2_t *hdmi2,
                     compose_result_t *result) {
   sink_reading_t reading{.status = status};
-  if (status == COMPOSE_SINK_READ) {
-    reading = read_sink(request.sink, request.sink_bytes, &work->sink, &work->arena);
-  } else {
+  if (status != COMPOSE_SINK_READ) {
     LOG_TRACE("Valid edid not available. Continuing composing edid. Passed in edid:%s size:%d bytes",
               address(request.sink).text, request.sink_bytes);
+  } else if (hdmi2 != nullptr) {
+    reading = read_sink_with_hdmi2(request.sink, request.sink_bytes, &work->sink, hdmi2, &work->arena);
+  } else {
+    reading = read_sink(request.sink, request.sink_bytes, &work->sink, &work->arena);
   }
   result->sink_status = reading.status;
   result->sink_extension_status = reading.extension_status;
@@ -143,15 +157,77 @@ void pass_on_decisions(const compose_request_t &request, const inputs_t &inputs,
   decisions.pass_on(request.observer, request.observer_context);
 }
 
+/// What is at hand once the platform's values are.
+struct preparation_t {
+  const compose_request_t &request;
+  const platform_values_t &platform;
+  compose_sink_status status;  ///< Of the sink, before it is read.
+};
+
+bool compose_plain(const preparation_t &preparation, workspace_t *work, compose_result_t *result) {
+  const auto &[request, platform, status] = preparation;
+  read_sink_into(work, request, status, nullptr, result);
+  const inputs_t inputs{work->sink, platform, *request.settings, &work->arena};
+  outcomes_t outcomes;
+  journal_t journal(request.observer != nullptr, &work->arena);
+  if (!run_stages(inputs, &work->new_edid, &journal, &outcomes) ||
+      !write(request, platform, &work->new_edid, &outcomes.encoding, result)) {
+    return false;
+  }
+  trace_new_edid(request.new_edid);
+  pass_on_decisions(request, inputs, outcomes, journal, work->new_edid);
+  return true;
+}
+
+/// The same road, with HDMI 2 between the stages and the encoder.
+// A frame of its own: its records are needed only here.
+[[gnu::noinline]] bool compose_with_hdmi2(const preparation_t &preparation, workspace_t *work,
+                                          compose_result_t *result) {
+  const auto &[request, platform, status] = preparation;
+  hdmi2_values_t values;
+  if (request.hdmi2 != nullptr) {
+    take_hdmi2_values(*request.hdmi2, &values);
+  } else {
+    read_hdmi2_values(&values, readings_of(request));
+  }
+  hdmi2_t sink{};
+  sink.size = sizeof sink;
+  read_sink_into(work, request, status, &sink, result);
+  const inputs_t inputs{work->sink, platform, *request.settings, &work->arena};
+  outcomes_t outcomes;
+  journal_t journal(request.observer != nullptr, &work->arena);
+  if (!run_stages(inputs, &work->new_edid, &journal, &outcomes)) return false;
+
+  const layer_inputs_t layer_inputs{inputs, values, sink, status != COMPOSE_SINK_NONE};
+  layer_outcome_t layer;
+  if (!add_hdmi2(layer_inputs, outcomes.population, &work->new_edid, &layer)) {
+    LOG_ERROR("Failed adding HDMI 2 to the new edid.");
+    return false;
+  }
+  outcomes.encoding = encode_with_hdmi2(request.new_edid, static_cast<i32>(request.new_edid_bytes), &work->new_edid,
+                                        layer.offer.blocks, platform);
+  if (!keep_encoding(request, outcomes.encoding, result)) return false;
+  trace_new_edid(request.new_edid);
+  pass_on_decisions(request, inputs, outcomes, journal, work->new_edid);
+  return true;
+}
+
+/// Whether request or configuration ask for HDMI 2. A caller that has platform values has all of them.
+bool is_hdmi2_wanted(const compose_request_t &request) {
+  if (request.hdmi2 != nullptr) return is_hdmi2_enabled(*request.hdmi2);
+  return request.platform_values == nullptr && is_hdmi2_configured(readings_of(request));
+}
+
 }  // namespace
 
-bool compose(const compose_request_t &request, compose_result_t *result) {
+bool compose(const compose_request_t &request, hdmi2_access_t access, compose_result_t *result) {
   const compose_sink_status status = look_at_sink(request);
   if (!is_output_valid(request)) return false;
   if (request.platform_values != nullptr && !ll_is_initialized(&request.platform_values->audio_list)) {
     LOG_ERROR("The passed in platform_values has not been initialized.");
     return false;
   }
+  if (request.hdmi2 != nullptr && !has_enable(*request.hdmi2)) return false;
   workspace_t work;
   platform_values_init(&work.platform);
   const platform_values_t *const platform = platform_of(request, &work);
@@ -159,20 +235,11 @@ bool compose(const compose_request_t &request, compose_result_t *result) {
     destroy_unprepared(&work);
     return false;
   }
+  const bool with_hdmi2 = access == hdmi2_access_t::on_demand && is_hdmi2_wanted(request);
   edid_prepare(&work.sink);
   edid_prepare(&work.new_edid);
-  read_sink_into(&work, request, status, result);
-
-  const inputs_t inputs{work.sink, *platform, *request.settings, &work.arena};
-  outcomes_t outcomes;
-  journal_t journal(request.observer != nullptr, &work.arena);
-  if (!run_stages(inputs, &work.new_edid, &journal, &outcomes) ||
-      !write(request, *platform, &work.new_edid, &outcomes.encoding, result)) {
-    return false;
-  }
-  trace_new_edid(request.new_edid);
-  pass_on_decisions(request, inputs, outcomes, journal, work.new_edid);
-  return true;
+  const preparation_t preparation{request, *platform, status};
+  return with_hdmi2 ? compose_with_hdmi2(preparation, &work, result) : compose_plain(preparation, &work, result);
 }
 
 }  // namespace edid_composer

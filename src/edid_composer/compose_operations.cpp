@@ -40,7 +40,7 @@ void copy_members(record_t *target, const record_t &source, u32 size) {
 // A frame of its own for the redirection's line.
 [[gnu::noinline]] bool compose_redirected(const compose_request_t &request, compose_result_t *result) {
   const log_redirection_t redirection(request.log, request.log_context);
-  return compose(request, result);
+  return compose(request, hdmi2_access_t::on_demand, result);
 }
 
 }  // namespace
@@ -64,7 +64,7 @@ bool compose_edid_internal(const u8 *edid_block, u32 edid_bytes, u8 *new_edid_bl
   request.settings = cfg;
   request.platform_values = platform_values;
   compose_result_t result{};
-  return compose(request, &result);
+  return compose(request, hdmi2_access_t::none, &result);
 }
 
 bool compose_edid_request(const compose_request_t *request, compose_result_t *result) {
@@ -73,7 +73,8 @@ bool compose_edid_request(const compose_request_t *request, compose_result_t *re
   copy_members(&known, *request, request->size);
   compose_result_t filled{};
   filled.size = static_cast<u32>(std::min<std::size_t>(result->size, sizeof filled));
-  const bool composed = known.log == nullptr ? compose(known, &filled) : compose_redirected(known, &filled);
+  const bool composed =
+      known.log == nullptr ? compose(known, hdmi2_access_t::on_demand, &filled) : compose_redirected(known, &filled);
   if (!composed) filled.bytes_written = filled.physical_address_offset = 0;
   copy_members(result, filled, filled.size);
   return composed;

@@ -82,7 +82,15 @@ bool encode_timings(const edid_t &edid, byte_writer_t *block) {
   return true;
 }
 
-/// Range limits (EDID 1.3, section 3.10.3), when all five are known.
+}  // namespace
+
+bool encode_up_to_timings(const edid_t &edid, u8 *block, byte_writer_t *writer) {
+  encode_identity(edid, writer);
+  encode_features(edid, block);
+  encode_standard_timings(edid, writer);
+  return encode_timings(edid, writer);
+}
+
 void encode_range_limits(const edid_t &edid, byte_writer_t *block) {
   namespace layout = display_descriptor;
   if (edid.min_v_rate == 0 || edid.max_v_rate == 0 || edid.min_h_rate == 0 || edid.max_h_rate == 0 ||
@@ -112,14 +120,9 @@ void encode_range_limits(const edid_t &edid, byte_writer_t *block) {
   block->put(descriptor, descriptor_size);
 }
 
-}  // namespace
-
 bool encode_base_block(const edid_t &edid, u8 *block) {
   byte_writer_t writer(block, block_size);
-  encode_identity(edid, &writer);
-  encode_features(edid, block);
-  encode_standard_timings(edid, &writer);
-  if (!encode_timings(edid, &writer)) return false;
+  if (!encode_up_to_timings(edid, block, &writer)) return false;
   put_text_descriptor(&writer, display_descriptor::name_text, edid.monitor_name);
   encode_range_limits(edid, &writer);
   // kept: both bytes follow the last descriptor. They stand at 126 and 127 when name and range limits were written.

@@ -18,25 +18,26 @@ namespace layout = cea_extension;
 
 constexpr new_entry_texts_t video_texts{"Failed creating new entry.", "Failed adding entry to the back."};
 
-compose_extension_status verify(const byte_view_t &extension) {
-  if (extension[layout::tag] != layout::cea_tag) {
-    LOG_ERROR("The extension is not a CEA extension. Expected=0x2 Received=0x%X", extension[layout::tag]);
-    return COMPOSE_EXTENSION_NOT_CEA;
+compose_extension_status verify(const byte_view_t &extension, u32 largest_timings_offset) {
+  const compose_extension_status status = status_of_extension(extension, largest_timings_offset);
+  switch (status) {
+    case COMPOSE_EXTENSION_NOT_CEA:
+      LOG_ERROR("The extension is not a CEA extension. Expected=0x2 Received=0x%X", extension[layout::tag]);
+      break;
+    case COMPOSE_EXTENSION_REVISION_UNSUPPORTED:
+      LOG_ERROR("Extension is the wrong version. Expected=0x3 Received=0x%X", extension[layout::revision]);
+      break;
+    case COMPOSE_EXTENSION_CHECKSUM_INVALID:
+      LOG_ERROR("Edid failed the checksum. Calculated:0x%02X Received:0x%02X", _calculate_checksum(extension),
+                extension[checksum_offset]);
+      break;
+    case COMPOSE_EXTENSION_OFFSET_UNSUPPORTED:
+      LOG_ERROR("EDID DTD offset value is larger than the block. Offset:%d\n", extension[layout::timings_offset]);
+      break;
+    default:
+      break;
   }
-  if (extension[layout::revision] != layout::supported_revision) {
-    LOG_ERROR("Extension is the wrong version. Expected=0x3 Received=0x%X", extension[layout::revision]);
-    return COMPOSE_EXTENSION_REVISION_UNSUPPORTED;
-  }
-  const u8 calculated = _calculate_checksum(extension);
-  if (calculated != extension[checksum_offset]) {
-    LOG_ERROR("Edid failed the checksum. Calculated:0x%02X Received:0x%02X", calculated, extension[checksum_offset]);
-    return COMPOSE_EXTENSION_CHECKSUM_INVALID;
-  }
-  if (extension[layout::timings_offset] > layout::largest_timings_offset) {
-    LOG_ERROR("EDID DTD offset value is larger than the block. Offset:%d\n", extension[layout::timings_offset]);
-    return COMPOSE_EXTENSION_OFFSET_UNSUPPORTED;
-  }
-  return COMPOSE_EXTENSION_READ;
+  return status;
 }
 
 /// Decodes the detailed timings after the data blocks. A malformed one only logs.
@@ -148,9 +149,18 @@ extension_outcome_t decode_data_blocks(const byte_view_t &extension, edid_t *edi
 
 }  // namespace
 
-extension_outcome_t decode_cea_extension(const u8 *edid_extension, u32 length, edid_t *edid, entry_arena_t *arena) {
+compose_extension_status status_of_extension(const byte_view_t &extension, u32 largest_timings_offset) {
+  if (extension[layout::tag] != layout::cea_tag) return COMPOSE_EXTENSION_NOT_CEA;
+  if (extension[layout::revision] != layout::supported_revision) return COMPOSE_EXTENSION_REVISION_UNSUPPORTED;
+  if (_calculate_checksum(extension) != extension[checksum_offset]) return COMPOSE_EXTENSION_CHECKSUM_INVALID;
+  if (extension[layout::timings_offset] > largest_timings_offset) return COMPOSE_EXTENSION_OFFSET_UNSUPPORTED;
+  return COMPOSE_EXTENSION_READ;
+}
+
+extension_outcome_t decode_cea_extension(const u8 *edid_extension, u32 length, edid_t *edid, entry_arena_t *arena,
+                                         u32 largest_timings_offset) {
   const byte_view_t extension(edid_extension, length);
-  const compose_extension_status status = verify(extension);
+  const compose_extension_status status = verify(extension, largest_timings_offset);
   if (status != COMPOSE_EXTENSION_READ) return {status, 0};
   decode_flags(layout::support_flags, extension[layout::flags], edid);
   decode_timings(extension, edid, arena);

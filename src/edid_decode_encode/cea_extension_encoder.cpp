@@ -93,8 +93,25 @@ void encode_colorimetry_block(const edid_t &edid, byte_writer_t *extension) {
   extension->put(metadata_profile_0);
 }
 
-/// The extension's detailed timing is that of VIC 1, whatever the record holds.
-void encode_timing(byte_writer_t *extension) {
+}  // namespace
+
+bool encode_up_to_hdmi_block(edid_t *edid, bool native_bit, byte_writer_t *extension, encoding_t *encoding) {
+  extension->put(layout::cea_tag);
+  extension->put(layout::supported_revision);
+  extension->seek(layout::data_blocks);
+  encode_speaker_block(*edid, extension);
+  const u32 video_block = extension->position();
+  encode_video_block(*edid, native_bit, extension);
+  const u32 audio_block = extension->position();
+  if (!encode_audio_block(*edid, extension)) return false;
+  const u32 hdmi_block = extension->position();
+  encoding->physical_address_offset = low_byte(block_size + hdmi_block + hdmi_vendor_block::physical_address);
+  encode_hdmi_vendor_block(edid, extension);
+  encoding->longest_block = std::max(audio_block - video_block, extension->position() - hdmi_block) - 1;
+  return true;
+}
+
+void encode_extension_timing(byte_writer_t *extension) {
   constexpr u32 vic = 1;
   detailed_timing_t timing{};
   convert_vic_to_dtd(vic, &timing);
@@ -103,28 +120,15 @@ void encode_timing(byte_writer_t *extension) {
   extension->put(descriptor, descriptor_size);
 }
 
-void encode_flags_byte(const edid_t &edid, byte_writer_t *extension) {
+void encode_extension_flags(const edid_t &edid, byte_writer_t *extension) {
   constexpr u32 native_timings = base_block_timings + 1;
   const u32 support = layout::basic_audio | layout::ycbcr_444 | layout::ycbcr_422;
   extension->put_at(layout::flags, low_byte((edid.underscan != 0 ? layout::underscan : 0U) | support | native_timings));
 }
 
-}  // namespace
-
 bool encode_cea_extension(edid_t *edid, bool native_bit, u8 *extension, encoding_t *encoding) {
   byte_writer_t writer(extension, block_size);
-  writer.put(layout::cea_tag);
-  writer.put(layout::supported_revision);
-  writer.seek(layout::data_blocks);
-  encode_speaker_block(*edid, &writer);
-  const u32 video_block = writer.position();
-  encode_video_block(*edid, native_bit, &writer);
-  const u32 audio_block = writer.position();
-  if (!encode_audio_block(*edid, &writer)) return false;
-  const u32 hdmi_block = writer.position();
-  encoding->physical_address_offset = low_byte(block_size + hdmi_block + hdmi_vendor_block::physical_address);
-  encode_hdmi_vendor_block(edid, &writer);
-  encoding->longest_block = std::max(audio_block - video_block, writer.position() - hdmi_block) - 1;
+  if (!encode_up_to_hdmi_block(edid, native_bit, &writer, encoding)) return false;
   encode_colorimetry_block(*edid, &writer);
   writer.put_at(layout::timings_offset, low_byte(writer.position()));
 
@@ -132,9 +136,9 @@ bool encode_cea_extension(edid_t *edid, bool native_bit, u8 *extension, encoding
     LOG_BUG("This function is only designed to handle up to 2 DTDs. num of dtds:%d", timings);
     return false;
   }
-  encode_timing(&writer);
+  encode_extension_timing(&writer);
   put_text_descriptor(&writer, display_descriptor::serial_text, edid->serial_string);
-  encode_flags_byte(*edid, &writer);
+  encode_extension_flags(*edid, &writer);
   encoding->extension_bytes = writer.position();
   if (writer.position() > checksum_offset) {
     LOG_ERROR("The CEA extension needs %d bytes, but has %d before its checksum. The rest is left out.",

@@ -9,10 +9,14 @@
 
 namespace edid_composer {
 
-encoding_t encode(u8 *edid_blocks, i32 size, edid_t *edid, const platform_values_t *values) {
+namespace {
+
+constexpr i32 edid_size = 2 * block_size;
+
+}  // namespace
+
+bool clear_for_encoding(u8 *edid_blocks, i32 size, const edid_t *edid, const platform_values_t *values) {
   REPORTS_AS(encode_edid);
-  constexpr i32 edid_size = 2 * block_size;
-  encoding_t encoding;
   if (edid_blocks == nullptr) {
     LOG_ERROR("Function called with edid_blocks set to NULL.");
   } else if (edid == nullptr) {
@@ -23,9 +27,15 @@ encoding_t encode(u8 *edid_blocks, i32 size, edid_t *edid, const platform_values
     LOG_ERROR("Function called with an unsupported block size. val:%d expected:%d", size, edid_size);
   } else {
     std::memset(edid_blocks, 0, edid_size);
-    encoding.complete = encode_base_block(*edid, edid_blocks) &&
-                        encode_cea_extension(edid, values->native_bit != 0, edid_blocks + block_size, &encoding);
+    return true;
   }
+  return false;
+}
+
+encoding_t encode(u8 *edid_blocks, i32 size, edid_t *edid, const platform_values_t *values) {
+  encoding_t encoding;
+  encoding.complete = clear_for_encoding(edid_blocks, size, edid, values) && encode_base_block(*edid, edid_blocks) &&
+                      encode_cea_extension(edid, values->native_bit != 0, edid_blocks + block_size, &encoding);
   return encoding;
 }
 

@@ -16,4 +16,7 @@ struct encoding_t {
 /// encode_edid(), in whose name it reports.
 encoding_t encode(u8 *edid_blocks, i32 size, edid_t *edid, const platform_values_t *values);
 
+/// The first step of that: fills the blocks with 0. False, reported, for arguments that can't be encoded.
+bool clear_for_encoding(u8 *edid_blocks, i32 size, const edid_t *edid, const platform_values_t *values);
+
 }  // namespace edid_composer

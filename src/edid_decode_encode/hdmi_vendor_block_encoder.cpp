@@ -14,14 +14,12 @@ REPORTS_AS(encode_edid);
 
 namespace layout = hdmi_vendor_block;
 
-/// Clears the structures that 3D_present implies for the mode, so that they aren't written one by one.
-void clear_mandatory_structures(short_video_desc_t *video) {
+/// The structures of a mode without those that 3D_present implies, which aren't written one by one.
+u32 written_structures(const short_video_desc_t &video) {
   for (const auto &mandatory : _3d_man_modes) {
-    if (mandatory.vic == video->vic) {
-      video->stereo &= ~mandatory.stereo;
-      return;
-    }
+    if (mandatory.vic == video.vic) return video.stereo & ~mandatory.stereo;
   }
+  return video.stereo;
 }
 
 /// Writes the 2D_VIC_order entries of one mode.
@@ -44,7 +42,7 @@ void encode_3d_modes(edid_t *edid, byte_writer_t *block) {
   u32 index = 0;
   for (auto &video : counted_elements<short_video_desc_t>(edid->video_list)) {
     if (index == layout::most_3d_modes) break;
-    clear_mandatory_structures(&video);
+    video.stereo = written_structures(video);
     encode_3d_structures(index, video.stereo, block);
     ++index;
   }
@@ -83,6 +81,27 @@ void encode_video(edid_t *edid, byte_writer_t *block) {
 }
 
 }  // namespace
+
+u32 written_3d_bytes(const edid_t &edid, u32 modes) {
+  if (edid.hdmi_3d_present == 0) return 0;
+  u32 bytes = 0;
+  u32 index = 0;
+  for (const auto &video : elements<const short_video_desc_t>(edid.video_list.head)) {
+    if (index == layout::most_3d_modes || index++ == modes) break;
+    const u32 stereo = written_structures(video);
+    for (const auto &structure : layout::structures_3d) {
+      if ((stereo & structure.stereo) != 0) bytes += structure.code == layout::side_by_side_half ? 2 : 1;
+    }
+  }
+  return bytes;
+}
+
+u32 hdmi_vendor_block_length(const edid_t &edid, u32 bytes_3d) {
+  constexpr u32 before_vics = 2;
+  const u32 latencies = layout::video_fields(layout::latency_fields(edid)) - 1;
+  if (edid.hdmi_video_present == 0) return latencies;
+  return latencies + before_vics + std::min<u32>(edid.hdmi_vic_len, layout::most_vics) + bytes_3d;
+}
 
 void encode_hdmi_vendor_block(edid_t *edid, byte_writer_t *extension) {
   const u32 header = extension->reserve();

@@ -31,7 +31,8 @@ allowed_rooms() {
     selection) echo inputs ;;
     new_edid) echo inputs selection ;;
     explain) echo inputs selection new_edid ;;
-    compose) echo inputs platform selection new_edid explain ;;
+    hdmi2) echo inputs platform selection new_edid explain codec ;;
+    compose) echo inputs platform selection new_edid explain hdmi2 codec ;;
     *) return 1 ;;
   esac
 }

@@ -87,6 +87,20 @@ constexpr text_t reason_texts[] = {
     {COMPOSE_REASON_ROOM_EXCEEDED, "the extension is full: what comes last is left out"},
     {COMPOSE_REASON_BLOCK_TOO_LONG, "a data block is too long for its length field"},
     {COMPOSE_REASON_NOT_ANNOUNCED, "without a monitor name the extension is not announced"},
+    {COMPOSE_REASON_ONLY_IN_420, "in 4:2:0 only, as it is too fast for the link otherwise"},
+    {COMPOSE_REASON_ABOVE_RATE, "it is too fast for the link"},
+    {COMPOSE_REASON_SINK_HAS_IT_IN_420, "the sink takes it in 4:2:0 only, in which it is not offered"},
+    {COMPOSE_REASON_OFF, "the platform does not offer it"},
+    {COMPOSE_REASON_BOX_ITSELF, "the platform does it itself"},
+    {COMPOSE_REASON_AS_SINK, "as the sink, which has it"},
+    {COMPOSE_REASON_SINK_WITHOUT, "as the sink, which does not have it"},
+    {COMPOSE_REASON_VRR_RANGE_INVALID, "its range of refresh rates is not valid"},
+    {COMPOSE_REASON_TMDS_OF_LINK, "the link carries more than the HDMI block tells"},
+    {COMPOSE_REASON_TMDS_OF_EXTENDED_MODES, "the offered modes above VIC 64 need it"},
+    {COMPOSE_REASON_TMDS_LIMITED, "cut to what the platform and the sink take"},
+    {COMPOSE_REASON_PASSED_ON, "passed on from the sink"},
+    {COMPOSE_REASON_RATE_BELOW_BLOCK, "it announces a mode that is too fast for the link"},
+    {COMPOSE_REASON_VRR_CHANGED, "the sink's range of refresh rates is not offered unchanged"},
 };
 
 constexpr text_t sink_status_texts[] = {

@@ -26,6 +26,11 @@ u32 percent_of_pixel_clock(const deep_color_t &deep_color) {
   return deep_color.bits_30 ? 125 : 100;
 }
 
+bool is_overridden(const platform_values_t &platform) {
+  constexpr i32 lowest_override = 25;
+  return platform.tmds_override >= lowest_override;
+}
+
 }  // namespace
 
 u32 tmds_clock_t::held_mhz() const {
@@ -33,17 +38,15 @@ u32 tmds_clock_t::held_mhz() const {
   return std::min(wanted_mhz, highest);
 }
 
-tmds_clock_t declare_tmds_clock(const inputs_t &inputs, const ll_list_t &modes, bool has_4k_modes,
-                                const deep_color_t &deep_color) {
-  constexpr i32 lowest_override = 25;
+tmds_clock_t tmds_clock_for(const platform_values_t &platform, u32 pixel_clock, bool has_4k_modes,
+                            const deep_color_t &deep_color) {
   constexpr std::int64_t undeclared_below = 165 * megahertz;
   constexpr std::int64_t clock_of_4k_x_2k = 297 * megahertz;
-  const i32 own = inputs.platform.tmds_override;
-  if (own >= lowest_override) return {static_cast<u32>(own), COMPOSE_REASON_TMDS_OVERRIDE, 0, 0};
-
+  if (is_overridden(platform)) {
+    return {static_cast<u32>(platform.tmds_override), COMPOSE_REASON_TMDS_OVERRIDE, 0, 0};
+  }
   const u32 percent = percent_of_pixel_clock(deep_color);
-  const u32 pixel_clock = _maximum_pixel_clock(&modes);
-  if (percent == 100 && pixel_clock < undeclared_below && !has_4k_modes && own == 0) {
+  if (percent == 100 && pixel_clock < undeclared_below && !has_4k_modes && platform.tmds_override == 0) {
     return {0, COMPOSE_REASON_TMDS_NOT_NEEDED, pixel_clock, percent};
   }
   const std::int64_t of_modes = std::int64_t{pixel_clock} * percent / 100;
@@ -52,6 +55,16 @@ tmds_clock_t declare_tmds_clock(const inputs_t &inputs, const ll_list_t &modes, 
   const auto mhz = static_cast<u32>(clock / megahertz);
   return {mhz + 5 - mhz % 5, clock > of_modes ? COMPOSE_REASON_TMDS_OF_4K_MODES : COMPOSE_REASON_TMDS_OF_MODES,
           pixel_clock, percent};
+}
+
+tmds_clock_t declare_tmds_clock(const inputs_t &inputs, const ll_list_t &modes, bool has_4k_modes,
+                                const deep_color_t &deep_color) {
+  const u32 pixel_clock = is_overridden(inputs.platform) ? 0 : _maximum_pixel_clock(&modes);
+  return tmds_clock_for(inputs.platform, pixel_clock, has_4k_modes, deep_color);
+}
+
+u32 pixel_clock_with_3d(u32 pixel_clock, u32 stereo) {
+  return pixel_clock * stereo_factor(stereo);
 }
 
 u32 _maximum_pixel_clock(const ll_list_t *vic_list) {
@@ -67,7 +80,7 @@ u32 _maximum_pixel_clock(const ll_list_t *vic_list) {
       LOG_BUG("\tFailed converting VIC:%d to a DTD.", video.vic);
       continue;
     }
-    maximum = std::max(maximum, timing.pixel_clock * stereo_factor(video.stereo));
+    maximum = std::max(maximum, pixel_clock_with_3d(timing.pixel_clock, video.stereo));
   }
   return maximum;
 }

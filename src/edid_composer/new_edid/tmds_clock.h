@@ -21,6 +21,13 @@ struct tmds_clock_t {
 tmds_clock_t declare_tmds_clock(const inputs_t &inputs, const ll_list_t &modes, bool has_4k_modes,
                                 const deep_color_t &deep_color);
 
+/// The same for modes of which the most demanding has @p pixel_clock, Hz.
+tmds_clock_t tmds_clock_for(const platform_values_t &platform, u32 pixel_clock, bool has_4k_modes,
+                            const deep_color_t &deep_color);
+
+/// A pixel clock with the factor that the most demanding of the mode's 3D structures needs.
+u32 pixel_clock_with_3d(u32 pixel_clock, u32 stereo);
+
 /// The largest pixel clock of the modes, Hz, with the factor that their 3D structures need; 0 for an empty list.
 u32 _maximum_pixel_clock(const ll_list_t *vic_list);
 

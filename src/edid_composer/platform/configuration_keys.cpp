@@ -3,79 +3,13 @@
 #include <algorithm>
 #include <iterator>
 
-#include "edid_composer/platform/configuration_list.h"
+#include "edid_composer/platform/hdmi2_keys.h"
+#include "edid_composer/platform/key_builders.h"
 #include "edid_composer/platform/meaningless_numbers.h"
 
 namespace edid_composer {
 namespace {
 
-struct limits_t {
-  u32 minimum;
-  u32 maximum;
-  u32 default_number = 0;
-};
-
-/// @p path is the whole one; it ends with the name.
-constexpr configuration_key_t key_of(configuration_kind kind, const char *path, const limits_t &limits,
-                                     const char *meaning) {
-  return {.size = sizeof(configuration_key_t),
-          .kind = kind,
-          .path = path,
-          .name = path + sizeof CONFIGURATION_DOMAIN - 1,
-          .minimum = limits.minimum,
-          .maximum = limits.maximum,
-          .default_number = limits.default_number,
-          .default_text = "",
-          .entry_characters = 0,
-          .most_entries = 0,
-          .meaning = meaning};
-}
-
-constexpr configuration_key_t integer(const char *path, const limits_t &limits, const char *meaning) {
-  return key_of(CONFIGURATION_INTEGER, path, limits, meaning);
-}
-
-constexpr configuration_key_t unsigned_integer(const char *path, const limits_t &limits, const char *meaning) {
-  return key_of(CONFIGURATION_UNSIGNED, path, limits, meaning);
-}
-
-constexpr configuration_key_t text(const char *path, const limits_t &characters, const char *default_text,
-                                   const char *meaning) {
-  configuration_key_t key = key_of(CONFIGURATION_TEXT, path, characters, meaning);
-  key.default_text = default_text;
-  return key;
-}
-
-constexpr configuration_key_t video_modes(const char *path, const char *meaning) {
-  configuration_key_t key = key_of(CONFIGURATION_VIDEO_MODES, path, {1, 64}, meaning);
-  key.entry_characters = entry_text_size - 2;
-  return key;
-}
-
-constexpr configuration_key_t hdmi_vics(const char *path, const char *meaning) {
-  configuration_key_t key = key_of(CONFIGURATION_HDMI_VICS, path, {1, 4}, meaning);
-  key.most_entries = std::size(platform_values_t{}.modes_4k_x_2k_priority);
-  return key;
-}
-
-constexpr configuration_key_t timing_bits(const char *path, const char *meaning) {
-  return key_of(CONFIGURATION_TIMING_BITS, path, {0, 7}, meaning);
-}
-
-constexpr configuration_key_t standard_timings(const char *path, const char *meaning) {
-  configuration_key_t key = key_of(CONFIGURATION_STANDARD_TIMINGS, path, {60, 123}, meaning);
-  key.entry_characters = entry_text_size - 2;
-  key.most_entries = 8;
-  return key;
-}
-
-constexpr configuration_key_t audio_formats(const char *path, const char *meaning) {
-  configuration_key_t key = key_of(CONFIGURATION_AUDIO_FORMATS, path, {0, 0xFFFFFF}, meaning);
-  key.most_entries = 10;
-  return key;
-}
-
-#define PATH(name) CONFIGURATION_DOMAIN name
 #define FIELD(member) offsetof(platform_values_t, member)
 
 constexpr platform_key_t keys[] = {
@@ -156,12 +90,6 @@ constexpr platform_key_t keys[] = {
      FIELD(std_timings)},
 };
 
-constexpr bool is_sound(const platform_key_t &row) {
-  const configuration_key_t &key = row.key;
-  const bool is_number = key.kind == CONFIGURATION_INTEGER || key.kind == CONFIGURATION_UNSIGNED;
-  return key.minimum <= key.maximum &&
-         (!is_number || (key.minimum <= key.default_number && key.default_number <= key.maximum));
-}
 static_assert(std::all_of(std::begin(keys), std::end(keys), is_sound));
 
 }  // namespace
@@ -174,5 +102,8 @@ std::span<const platform_key_t> platform_keys() {
 
 const configuration_key_t *configuration_key(u32 index) {
   const auto keys = edid_composer::platform_keys();
-  return index < keys.size() ? &keys[index].key : nullptr;
+  if (index < keys.size()) return &keys[index].key;
+  const auto further_keys = edid_composer::hdmi2_keys();
+  const auto further = index - keys.size();
+  return further < further_keys.size() ? &further_keys[further].key : nullptr;
 }

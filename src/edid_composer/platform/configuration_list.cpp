@@ -7,10 +7,9 @@ namespace {
 
 REPORTS_AS(_get_generic_platform_list);
 
-constexpr int not_found = 2;
-
 constexpr bool holds_numbers(const configuration_key_t &key) {
-  return key.kind == CONFIGURATION_HDMI_VICS || key.kind == CONFIGURATION_TIMING_BITS;
+  return key.kind == CONFIGURATION_HDMI_VICS || key.kind == CONFIGURATION_TIMING_BITS ||
+         key.kind == CONFIGURATION_EXTENDED_VICS;
 }
 
 }  // namespace

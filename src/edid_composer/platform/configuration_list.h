@@ -7,6 +7,9 @@
 
 namespace edid_composer {
 
+/// What the host's node operations return where nothing is found; any other status counts as found.
+inline constexpr int not_found = 2;
+
 /// Size of the buffer that holds the text of an entry.
 inline constexpr u32 entry_text_size = 30;
 

@@ -32,4 +32,13 @@ void settle_week(configuration_outcome_t *week) {
   if (week->used > last_week && week->used != model_year) replace(week, last_week);
 }
 
+void settle_deep_color(configuration_outcome_t *deep_color) {
+  constexpr i32 of_platform = 0;
+  constexpr i32 as_sink = 2;
+  if (deep_color->used == of_platform || deep_color->used == as_sink) return;
+  LOG_WARNING("hdmi2.deep_color has an unrecognized value:%d. Valid values: 0,2. Using:%d", deep_color->used,
+              of_platform);
+  replace(deep_color, of_platform);
+}
+
 }  // namespace edid_composer
