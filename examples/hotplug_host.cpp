@@ -58,14 +58,15 @@ void mend_extension_checksum(edid_bytes_t *edid) {
 }
 
 // Makes the EDID of input 0 that of another input. An input's number, counted from 1, is the last level in use of its
-// address: 2.1.0.0 is input 0 behind 2.0.0.0, and 2.3.0.0 input 2. Without an address, all inputs show the same.
+// address: 2.1.0.0 is input 0 of a box at 2.0.0.0, and 2.3.0.0 its input 2. Without an address, all inputs show the
+// same.
 void patch_for_input(edid_bytes_t *edid, u8 spa_offset, unsigned input) {
   const unsigned address = address_at(*edid, spa_offset);
   if (address == no_address) return;
   unsigned shift = 0;
   while (shift < 12 && (address >> shift & 0xF) == 0)
     shift += 4;
-  // The address f.f.f.f stands for none: input 14 behind f.f.f.0 has no address left. Composing gives the same.
+  // The address f.f.f.f means none: input 14 of a box at f.f.f.0 has no address left. Composing gives the same.
   const unsigned patched = (address & ~(0xFu << shift)) | (input + 1) << shift;
   (*edid)[spa_offset] = static_cast<u8>(patched >> 8);
   (*edid)[spa_offset + 1] = static_cast<u8>(patched);

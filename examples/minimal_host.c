@@ -11,11 +11,11 @@
 
 #define EDID "platform.software.drivers.vorex.edid."
 
-/* What the operations answer. The library takes every other answer of find and first_child than 2 for "found". */
+/* What the operations return. Of find and first_child, the library takes every status but 2 for "found". */
 enum { is_found = 0, has_other_type = 1, is_missing = 2 };
 enum kind { integer, text, list };
 
-/* The configuration. A node's handle is its row; a list's entries stand behind it. Every key that is missing here takes
+/* The configuration. A node's handle is its row; the entries of a list follow it. Every key that is missing here has
  * its default, and the library prints a warning. */
 static const struct {
   const char *path;
@@ -33,7 +33,7 @@ static const struct {
 };
 static const u32 node_count = sizeof nodes / sizeof nodes[0];
 
-/* Whether the node behind this one stands under the first `length` characters of its path. */
+/* Whether the node after this one has the first `length` characters of its path, and a dot. */
 static int next_is_under(u32 node, size_t length) {
   return node + 1 < node_count && strncmp(nodes[node + 1].path, nodes[node].path, length) == 0 &&
          nodes[node + 1].path[length] == '.';

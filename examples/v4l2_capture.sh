@@ -21,7 +21,7 @@ work=$(mktemp -d)
 trap 'rm -rf "$work"' EXIT
 trap 'exit 1' HUP INT TERM
 
-# The size of a file in sysfs tells nothing: read it. Once, so that what is tested is what is composed from.
+# The size of a file in sysfs means nothing: read it. Once, so that what is tested is what is composed from.
 cat -- "$connector" >"$work/sink.bin"
 if [ -s "$work/sink.bin" ]; then
   set -- --sink "$work/sink.bin" "$@"

@@ -481,13 +481,13 @@ EDID_COMPOSER_API void print_platform_node(u32 node, const char *label);
  * A composition uses it only when it is asked for twice: by @ref compose_edid_request, and by `enable`, either of the
  * configuration's table `hdmi2` or of @ref compose_request_t::hdmi2.
  *
- * "HDMI 2.0" and "HDMI 2.1" are the High-Definition Multimedia Interface Specifications of these versions; "CTA-861" is
- * CTA-861-G and later, which CEA-861 became.
+ * "HDMI 2.1" is the High-Definition Multimedia Interface Specification of that version, which has all of HDMI 2.0;
+ * "CTA-861" is CTA-861-G and later, which CEA-861 became.
  * @{ */
 
 /** Most short video descriptors that are kept of a sink: 8 extensions of 123 bytes, headers of data blocks aside. */
 #define HDMI2_MOST_SVDS 952
-/** Most payload bytes of a data block (CTA-861, section 7.4). */
+/** Most payload bytes of a data block (CTA-861, section 7.5). */
 #define HDMI2_MOST_BLOCK_BYTES 31
 
 /** A data block as it stands in a sink's EDID, which is passed on byte for byte. */
@@ -496,7 +496,7 @@ typedef struct hdmi2_block_t {
   u8 payload[HDMI2_MOST_BLOCK_BYTES]; /**< The bytes after the header byte; 0 after the first length of them. */
 } hdmi2_block_t;
 
-/** Bits of @ref hdmi2_t::eotfs (CTA-861, HDR static metadata data block, byte 2). */
+/** Bits of @ref hdmi2_t::eotfs (CTA-861, section 7.5.13). */
 enum hdmi2_eotf {
   HDMI2_EOTF_SDR = 0x01,   /**< Traditional gamma, standard dynamic range. */
   HDMI2_EOTF_GAMMA = 0x02, /**< Traditional gamma, high dynamic range. */
@@ -504,7 +504,7 @@ enum hdmi2_eotf {
   HDMI2_EOTF_HLG = 0x08    /**< Hybrid log-gamma. */
 };
 
-/** Bits of @ref hdmi2_t::colorimetry (CTA-861, colorimetry data block, byte 2). */
+/** Bits of @ref hdmi2_t::colorimetry (CTA-861, section 7.5.5). */
 enum hdmi2_colorimetry {
   HDMI2_XVYCC601 = 0x01,    /**< xvYCC601. */
   HDMI2_XVYCC709 = 0x02,    /**< xvYCC709. */
@@ -526,7 +526,7 @@ typedef struct hdmi2_t {
   u32 size;                 /**< sizeof(hdmi2_t) of the caller; see @ref decode_hdmi2. */
   u32 svd_count;            /**< Short video descriptors of all video data blocks. */
   u8 svds[HDMI2_MOST_SVDS]; /**< Their bytes as stored, in block order; see @ref y420_map. */
-  /* HDMI Forum vendor-specific data block, or sink capability data structure (HDMI 2.1, section 10.3.2) */
+  /* HDMI Forum vendor-specific data block or, without one, sink capability data structure (HDMI 2.1) */
   u8 forum_present;  /**< 1 when the sink has one of at least 7 payload bytes. */
   u8 forum_version;  /**< Its version (byte 4); 1. */
   u32 max_tmds_rate; /**< Maximum TMDS character rate, MHz, a multiple of 5; 0: at most 340 (byte 5). */
@@ -538,7 +538,7 @@ typedef struct hdmi2_t {
   u8 dc_48bit_420;   /**< 1 when it takes 48-bit deep colour in YCbCr 4:2:0 (byte 7, bit 2). */
   u8 dc_36bit_420;   /**< 1 when it takes 36-bit deep colour in YCbCr 4:2:0 (byte 7, bit 1). */
   u8 dc_30bit_420;   /**< 1 when it takes 30-bit deep colour in YCbCr 4:2:0 (byte 7, bit 0). */
-  u8 allm_present;   /**< 1 when byte 8 is there. */
+  u8 allm_present;   /**< 1 when byte 8 is there, as it is where bytes 9 and 10 are. */
   u8 allm;           /**< 1 when it takes the auto low-latency mode (byte 8, bit 1). */
   u8 vrr_present;    /**< 1 when bytes 9 and 10 are there. */
   u8 vrr_min;        /**< Lowest variable refresh rate, Hz, 0 to 63; 0: no VRR (byte 9, bits 5 to 0). */
@@ -636,38 +636,42 @@ EDID_COMPOSER_API bool hdmi2_values_init(hdmi2_values_t *values);
 /**
  * Decodes what the CTA-861 extensions of a whole EDID say of HDMI 2.
  *
- * Extensions that the base block announces and that are there count: of tag 2, revision 3, a right checksum and a
- * timing offset of at most 127, the first 8 of them. A data block that would end after its collection ends the reading
- * of that extension, with a warning; so do blocks that are too short and bits of a 4:2:0 map without descriptor give
- * one. What
+ * Extensions count that the base block announces and that are there: those of tag 2, revision 3, a right checksum and a
+ * timing offset of at most 127, the first 8 of them. Others are passed over without a line. A warning is given for a
+ * data block that ends after its collection, which ends the reading of that extension; for a block that is too short,
+ * which counts as none; and for bits of a 4:2:0 map that no descriptor belongs to, which are cleared. What
  * @ref decode_edid_extensions reports is not reported again.
  *
  * @param edid the EDID, of which @p edid_bytes bytes are read.
  * @param edid_bytes its size, bytes; a multiple of 128 other than 0.
- * @param hdmi2 its size is set by the caller; the other members are cleared, then filled.
- * @return true; false with an error line for a NULL argument, another size, or a base block with a wrong header or
- *         checksum. The record then says that the EDID has none of it.
+ * @param hdmi2 its size is set by the caller; the other members are cleared, then filled. A record that is larger than
+ *        this version's keeps what it has after that, and its size becomes this version's.
+ * @return true; false with an error line for a NULL argument, a record or an EDID of another size, or a base block with
+ *         a wrong header, checksum or version. The record, if there is one, then says that the EDID has none of it.
  */
 EDID_COMPOSER_API bool decode_hdmi2(const u8 *edid, u32 edid_bytes, hdmi2_t *hdmi2);
 
 /**
- * Encodes a record as data blocks, one after the other, in the order of its members. What @ref decode_hdmi2 has read of
- * an EDID comes back from them, if they have room.
+ * Encodes a record as data blocks, one after the other: video data blocks of up to 31 descriptors, then the others in
+ * the order of the record's members. What @ref decode_hdmi2 has read of an EDID comes back when it reads these blocks.
  *
- * @param hdmi2 the record. Values that their fields can't hold are cut to the nearest that they can.
- * @param blocks receives the data blocks; nothing is written after @p size bytes.
- * @param size its size, bytes; an extension has room for 123, 105 with a detailed timing.
- * @param used receives the bytes that all blocks take, also when they are more than @p size.
- * @return true when all blocks were written; false with an error line for a NULL argument or too little room.
+ * @param hdmi2 the record. A number that is too large for its field is written as the largest that it holds, a rate
+ * that is no multiple of 5 MHz as the next lower one; a block to be passed on that is too short is left out.
+ * @param blocks receives the data blocks; not NULL.
+ * @param size its size, bytes; an extension has room for 123, for 105 beside a detailed timing.
+ * @param used receives the bytes that all blocks need, also when they are more than @p size; not NULL.
+ * @return true when all blocks were written; false with an error line, and nothing written, for a NULL argument or too
+ *         little room.
  */
 EDID_COMPOSER_API bool encode_hdmi2(const hdmi2_t *hdmi2, u8 *blocks, u32 size, u32 *used);
 
 /**
- * Prints a record as a report on standard output: every field in words, values with units.
+ * Prints a record as a report on standard output: every field in words, values with units; "none" for each block that
+ * the EDID doesn't have. Bits without a name are printed by their number.
  *
  * @param hdmi2 the record.
  * @param title first line, NUL-terminated; NULL prints as an empty one.
- * @return true; false with an error line when @p hdmi2 is NULL.
+ * @return true; false with an error line when @p hdmi2 is NULL or its size too small.
  */
 EDID_COMPOSER_API bool print_hdmi2(const hdmi2_t *hdmi2, const char *title);
 
@@ -877,7 +881,47 @@ enum compose_subject {
   /** Modes added to reach the fewest an EDID has; code: how many. */
   COMPOSE_SUBJECT_PADDING = 13,
   /** Room in the CEA extension; code: bytes needed before the checksum. */
-  COMPOSE_SUBJECT_EXTENSION_ROOM = 14
+  COMPOSE_SUBJECT_EXTENSION_ROOM = 14,
+  /* HDMI 2, where the composition has it */
+  /** A mode above VIC 64; code: its VIC (CTA-861, section 4). */
+  COMPOSE_SUBJECT_EXTENDED_MODE = 15,
+  /** The rate of the link to the box, told above 340 MHz; code: MHz. */
+  COMPOSE_SUBJECT_LINK_RATE = 16,
+  /** A transfer function of HDR; code: its bit of @ref hdmi2_eotf. */
+  COMPOSE_SUBJECT_HDR = 17,
+  /** A colour space; code: its bit of @ref hdmi2_colorimetry. */
+  COMPOSE_SUBJECT_COLORIMETRY = 18,
+  /** YCbCr 4:2:0; code: how many modes may be sent in it. */
+  COMPOSE_SUBJECT_YCBCR_420 = 19,
+  /** A colour depth in 4:2:0; code: bits per pixel, 30 or 36. */
+  COMPOSE_SUBJECT_DEEP_COLOR_420 = 20,
+  /** The auto low-latency mode; code: 1 or 0. */
+  COMPOSE_SUBJECT_ALLM = 21,
+  /** The variable refresh rate; code: its lowest rate in Hz, 0 when it is not offered. */
+  COMPOSE_SUBJECT_VRR = 22,
+  /** A quantization range that sources may select; code: 0 of RGB, 1 of YCbCr. */
+  COMPOSE_SUBJECT_QUANTIZATION = 23,
+  /** A block of the sink that can be passed on; code: @ref compose_room_item of it, 1 to 4. */
+  COMPOSE_SUBJECT_PASSED_BLOCK = 24,
+  /** That the VICs of 4Kx2K modes are taken as well as their HDMI_VICs; code: 1 or 0. */
+  COMPOSE_SUBJECT_UHD_VIC = 25,
+  /** A mode above VIC 64 as first detailed timing; code: its VIC, 0 for none. */
+  COMPOSE_SUBJECT_PREFERRED_TIMING = 26,
+  /** Something that was left out for room; code: @ref compose_room_item. None when everything has room. */
+  COMPOSE_SUBJECT_ROOM_ITEM = 27
+};
+
+/** What is left out for room, in this order, until the rest fits. */
+enum compose_room_item {
+  COMPOSE_ROOM_FREESYNC = 1,       /**< The FreeSync block. */
+  COMPOSE_ROOM_HDR_DYNAMIC = 2,    /**< The HDR dynamic metadata data block. */
+  COMPOSE_ROOM_HDR10PLUS = 3,      /**< The HDR10+ block. */
+  COMPOSE_ROOM_DOLBY_VISION = 4,   /**< The Dolby Vision block. */
+  COMPOSE_ROOM_3D_STRUCTURES = 5,  /**< 3D structures beyond the mandatory ones, all of them. */
+  COMPOSE_ROOM_MODES = 6,          /**< Modes up to VIC 64, from the last on. */
+  COMPOSE_ROOM_MODES_IN_420 = 7,   /**< Modes that are offered in 4:2:0 only, from the last on. */
+  COMPOSE_ROOM_EXTENDED_MODES = 8, /**< Other modes above VIC 64, from the last on. */
+  COMPOSE_ROOM_SERIAL_TEXT = 9     /**< The serial number text, which comes after all of these. */
 };
 
 /** What was decided; @ref compose_decision_t::verdict. */
@@ -911,7 +955,8 @@ enum compose_reason {
   COMPOSE_REASON_OTHER_REFRESH_FAMILY = 7,
   /** Above the geometry limit {lines of the mode, limit}. */
   COMPOSE_REASON_TALLER_THAN_SINK = 8,
-  /** Chosen, but the extension holds no more of its kind {descriptors of its kind there}. */
+  /** Chosen, but the extension holds no more of its kind {descriptors of its kind there; of what HDMI 2 leaves out for
+   *  room: how many}. */
   COMPOSE_REASON_NO_ROOM = 9,
   /** No VIC has it {active pixels, active lines of a frame or 0, Hz, 1 interlaced}. */
   COMPOSE_REASON_TIMING_WITHOUT_VIC = 10,
@@ -1014,32 +1059,54 @@ enum compose_reason {
   /* HDMI 2 */
   /** In 4:2:0 only, as it is too fast otherwise {its kHz, its kHz in 4:2:0, limit in kHz}. */
   COMPOSE_REASON_ONLY_IN_420 = 59,
-  /** Above the rate of the link {its kHz, limit in kHz, 1 the sink's or 2 the box's}. */
+  /** Above the rate of the link {its kHz, limit in kHz, 1 when it is the box's, 0 when it is that of box and sink}. */
   COMPOSE_REASON_ABOVE_RATE = 60,
-  /** The sink has it in 4:2:0 only, in which it is not offered {setting of y420}. */
+  /** The sink has it in 4:2:0 only, in which it is not offered {setting}. */
   COMPOSE_REASON_SINK_HAS_IT_IN_420 = 61,
-  /** The platform does not offer it. */
+  /** The platform does not offer it {setting, 1 when the sink has it}. */
   COMPOSE_REASON_OFF = 62,
-  /** The box does it itself. */
+  /** The box does it itself {as above}. */
   COMPOSE_REASON_BOX_ITSELF = 63,
-  /** As the sink, which has it. */
+  /** As the sink, which has it {as above}. */
   COMPOSE_REASON_AS_SINK = 64,
-  /** As the sink, which doesn't have it. */
+  /** As the sink, which doesn't have it {as above}. */
   COMPOSE_REASON_SINK_WITHOUT = 65,
-  /** No range that a source may use {minimum, maximum in Hz, as worked out}. */
+  /** No range that a source may use {minimum, maximum, the sink's minimum, its maximum, Hz}. */
   COMPOSE_REASON_VRR_RANGE_INVALID = 66,
-  /** 340 MHz, the most that the HDMI block tells, as the link carries more. */
+  /** 340 MHz, the most that the HDMI block tells, as the link carries more {its MHz}. */
   COMPOSE_REASON_TMDS_OF_LINK = 67,
-  /** What the modes above VIC 64 need. */
+  /** What the modes above VIC 64 need {kHz of the fastest on the link}. */
   COMPOSE_REASON_TMDS_OF_EXTENDED_MODES = 68,
-  /** Cut to what box and sink take. */
+  /** Cut to what box and sink take, or to what the modes need {MHz wanted, MHz}. */
   COMPOSE_REASON_TMDS_LIMITED = 69,
-  /** The sink's block, byte for byte. */
+  /** The sink's block, byte for byte {its bytes}. */
   COMPOSE_REASON_PASSED_ON = 70,
-  /** The sink's block announces a mode above the rate of the link. */
+  /** The sink's block announces a mode above the rate of the link {MHz of the mode, MHz of the link}. */
   COMPOSE_REASON_RATE_BELOW_BLOCK = 71,
   /** The sink's range of refresh rates is not offered unchanged. */
-  COMPOSE_REASON_VRR_CHANGED = 72
+  COMPOSE_REASON_VRR_CHANGED = 72,
+  /** What the box's receiver takes {its MHz, the sink's MHz}. */
+  COMPOSE_REASON_LINK_RATE_OF_BOX = 73,
+  /** What the sink takes {as above}. */
+  COMPOSE_REASON_LINK_RATE_OF_SINK = 74,
+  /** What modes that the box makes itself need {as above}. */
+  COMPOSE_REASON_LINK_RATE_OF_ADDED_MODES = 75,
+  /** No offered mode is fast enough for it, or none that the sink takes in it {setting, 1 when the sink has any}. */
+  COMPOSE_REASON_NO_MODE_IN_420 = 76,
+  /** No offered mode in 4:2:0 leaves room for it on the link {MHz of the link, setting}. */
+  COMPOSE_REASON_RATE_BELOW_DEPTH = 77,
+  /** HDMI requires 30 bit where 36 bit is offered. */
+  COMPOSE_REASON_DEEP_COLOR_420_REQUIRED = 78,
+  /** A 4Kx2K mode is offered by its HDMI_VIC and by its VIC. */
+  COMPOSE_REASON_UHD_VIC_OF_MODES = 79,
+  /** No 4Kx2K mode is offered by both. */
+  COMPOSE_REASON_NO_UHD_VIC = 80,
+  /** Nothing else calls for the HDMI Forum block, which would say so. */
+  COMPOSE_REASON_NO_FORUM_BLOCK = 81,
+  /** The first mode above VIC 64 that a detailed timing can hold. */
+  COMPOSE_REASON_FIRST_EXTENDED_MODE = 82,
+  /** No offered mode above VIC 64 fits a detailed timing. */
+  COMPOSE_REASON_NO_EXTENDED_TIMING = 83
 };
 
 /** Who named a candidate; bits of @ref compose_decision_t::origins. */
@@ -1067,7 +1134,9 @@ enum compose_origin {
   /** The caller's current mode. */
   COMPOSE_ORIGIN_CURRENT_MODE = 0x0400,
   /** The library itself: padding and basic audio. */
-  COMPOSE_ORIGIN_LIBRARY = 0x0800
+  COMPOSE_ORIGIN_LIBRARY = 0x0800,
+  /** The sink's 4:2:0 video block; place in sink_index. */
+  COMPOSE_ORIGIN_SINK_420 = 0x1000
 };
 
 /** One decision of a composition. It holds no pointers: a copy of it keeps its meaning. */
@@ -1229,10 +1298,12 @@ typedef struct compose_result_t {
                                     them for each input; 0 when the composition failed. */
   u32 sink_status;             /**< What became of the sink's base block; @ref compose_sink_status. 0 when the call was
                                     refused before the sink was looked at. */
-  u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. */
+  u32 sink_extension_status;   /**< What became of block 1; @ref compose_extension_status. With HDMI 2, of the first
+                                    CTA-861 extension that can be read, of block 1 where there is none. */
   u32 sink_malformed_at; /**< The byte, when @ref sink_extension_status is COMPOSE_EXTENSION_MALFORMED, of block 1, from
                             0, at which the data block begins that overruns; else 0. */
-  u32 sink_blocks_unread; /**< Extension blocks after block 1 that are announced and given, but not read. */
+  u32 sink_blocks_unread; /**< Extension blocks after block 1 that are announced and given, but not read. With HDMI 2,
+                               those of all blocks. */
 } compose_result_t;
 
 /**

@@ -5,10 +5,10 @@
  * Linking this library supplies the eight `config_*` operations that libedid_composer binds to (see edid_composer.h).
  * The tree is made from a TOML 1.0 document:
  *
- * - tables and arrays are nodes with children: a table's in the order in which the file names them, an array's in
- * theirs, each named by its index from "0" on;
- * - integers and strings are values, and booleans read as 0 and 1. Integers range from -2147483648 to 4294967295; those
- * above 2147483647 keep their bit pattern, so that the unsigned reader gets back what was written;
+ * - tables and arrays are nodes with children: those of a table in the order of the file, those of an array in the
+ *   order of the array, each named by its index from "0" on;
+ * - integers and strings are values, and booleans are read as 0 and 1. Integers range from -2147483648 to 4294967295;
+ *   those above 2147483647 keep their bit pattern, so that the unsigned reader returns what was written;
  * - anything else (floats, dates and times), as well as a key that no path can name (empty, or with a dot or a control
  *   character), a path of more than 255 characters, a NUL in a string, a character that is not ASCII outside of strings
  *   and comments, nesting deeper than 64, an array of more than 1000 elements, and a document of more than 1 MiB, is
@@ -17,7 +17,7 @@
  * A process has one tree, which is empty until a first load succeeds. A load that fails leaves the tree as it was.
  *
  * Threads: any number of threads may read at once. Loading must not run at the same time as anything else in here, and
- * ends the life of every node handle.
+ * makes every node handle invalid.
  *
  * The header is self-contained and valid as C11 and as C++17.
  */
@@ -57,7 +57,7 @@ EDID_CONFIG_STORE_API bool config_store_load_text(const char *text, size_t lengt
 EDID_CONFIG_STORE_API bool config_store_load_default(void);
 
 /**
- * The TOML document of the default platform, commented: a starting point for one's own.
+ * The TOML document of the default platform, with comments: a starting point for your own.
  *
  * Never NULL, NUL-terminated, read-only, valid as long as the library is loaded.
  */
@@ -68,17 +68,17 @@ EDID_CONFIG_STORE_API const char *config_store_hdmi2_text(void);
 
 /**
  * What was wrong with the last load, as one line without a newline: `file:line:column: key: what is wrong`, without
- * those that do not apply. Empty when the last load succeeded.
+ * the parts that do not apply. Empty when the last load succeeded.
  *
  * Never NULL, NUL-terminated, valid until the next load.
  */
 EDID_CONFIG_STORE_API const char *config_store_error(void);
 
 /**
- * Where a node stands in the document that was loaded: its key, or the value of an array's element. For what reports on
- * a configuration.
+ * The place of a node in the document that was loaded: of its key, or of the value of an array's element. For programs
+ * that report on a configuration.
  *
- * @param node a handle that a `config_node_*` operation has given.
+ * @param node a handle from a `config_node_*` operation.
  * @param line receives the line, counted from 1. May be NULL.
  * @param column receives the column, counted from 1. May be NULL.
  * @return false, with both untouched, for the root and for a handle of no node.

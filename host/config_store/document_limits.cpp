@@ -31,7 +31,7 @@ class walk_t {
     } else if (character == '#') {
       advance(std::min(rest_.find('\n'), rest_.size()));
     } else if (static_cast<unsigned char>(character) >= 0x80) {
-      refuse("a character that is not ASCII stands outside of strings and comments");
+      refuse("a character that is not ASCII is outside of strings and comments");
     } else {
       count(character);
       advance(1);

@@ -3,6 +3,8 @@
 #include "diagnostics.h"
 #include "edid_composer/edid_reading.h"
 #include "edid_composer/explain/explain.h"
+#include "edid_composer/explain/written_offer.h"
+#include "edid_composer/hdmi2/explanation.h"
 #include "edid_composer/hdmi2/layer.h"
 #include "edid_composer/hdmi2/layer_encoder.h"
 #include "edid_composer/hdmi2/platform_values.h"
@@ -14,6 +16,7 @@
 #include "edid_composer/selection/video_modes.h"
 #include "edid_decode_encode/encoder.h"
 #include "edid_decode_encode/layout.h"
+#include "utility/vic_timings.h"
 
 namespace edid_composer {
 namespace {
@@ -148,12 +151,16 @@ void read_sink_into(workspace_t *work, const compose_request_t &request, compose
   result->sink_blocks_unread = reading.blocks_unread;
 }
 
-/// Passes the decisions on to the observer, all or none.
+/// Passes the decisions on to the observer, all or none. Without HDMI 2 its parts are null.
 void pass_on_decisions(const compose_request_t &request, const inputs_t &inputs, const outcomes_t &outcomes,
-                       const journal_t &journal, const edid_t &new_record) {
+                       const journal_t &journal, const edid_t &new_record, const layer_inputs_t *layer_inputs = nullptr,
+                       const layer_outcome_t *layer = nullptr) {
   if (request.observer == nullptr || !journal.is_complete()) return;
   decisions_t decisions(inputs.arena);
-  explain(inputs, outcomes, journal, new_record, request.new_edid, &decisions);
+  const u32 largest_vic = layer != nullptr ? g_vic_dtd_size : UINT32_MAX;
+  explain(inputs, outcomes, journal, new_record, request.new_edid, largest_vic, &decisions);
+  if (layer != nullptr) explain_hdmi2(*layer_inputs, *layer, new_record, outcomes.encoding, &decisions);
+  place_candidates(request.new_edid, &decisions);
   decisions.pass_on(request.observer, request.observer_context);
 }
 
@@ -208,7 +215,9 @@ bool compose_plain(const preparation_t &preparation, workspace_t *work, compose_
                                         layer.offer.blocks, platform);
   if (!keep_encoding(request, outcomes.encoding, result)) return false;
   trace_new_edid(request.new_edid);
-  pass_on_decisions(request, inputs, outcomes, journal, work->new_edid);
+  outcomes.population.deep_color = layer.offer.depths;
+  outcomes.population.tmds_clock = layer.offer.tmds_clock;
+  pass_on_decisions(request, inputs, outcomes, journal, work->new_edid, &layer_inputs, &layer);
   return true;
 }
 

@@ -10,7 +10,7 @@ REPORTS_AS(print_edid);
 constexpr u32 smallest_size = block_size;
 constexpr u32 largest_size = 2 * block_size;
 
-/// The formats of an audio mask, from bit 0 on. kept: the enhanced AC-3 of bit 9 is called as the AC-3 of bit 1.
+/// The formats of an audio mask, from bit 0 on. kept: bit 9, enhanced AC-3, has the name of bit 1, AC-3.
 constexpr const char *audio_mask_names[] = {
     "pcm ", "ac3 ",    "mpeg1 ", "mp3 ", "mpeg2 ",   "aac ",    "dts ",     "atrac ",         "dsd ",
     "ac3 ", "dts_hd ", "mlp ",   "dst ", "wma_pro ", "he_aac ", "he_aac2 ", "mpeg_surround ",

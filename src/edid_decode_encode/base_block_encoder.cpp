@@ -125,7 +125,7 @@ bool encode_base_block(const edid_t &edid, u8 *block) {
   if (!encode_up_to_timings(edid, block, &writer)) return false;
   put_text_descriptor(&writer, display_descriptor::name_text, edid.monitor_name);
   encode_range_limits(edid, &writer);
-  // kept: both bytes follow the last descriptor. They stand at 126 and 127 when name and range limits were written.
+  // kept: both bytes follow the last descriptor, so that they are bytes 126 and 127 only after all four.
   writer.put(1);
   writer.put(_calculate_checksum({block, block_size}));
   return true;

@@ -60,7 +60,7 @@ bool decode_audio_block(const byte_view_t &payload, u32 length, appender_t<short
   for (u32 i = 0; i < length; i += short_audio_size) {
     short_audio_desc_t audio{};
     if (decode_edid_short_audio(payload[i], payload[i + 1], payload[i + 2], &audio) != 1) {
-      // kept: the labels stand in the reverse of the bytes' order.
+      // kept: the labels are in the reverse order of the bytes.
       LOG_WARNING("Failed to decode audio format. Index:%d byte3:0x%02X byte2:0x%02X byte1:0x%02X", i, payload[i],
                   payload[i + 1], payload[i + 2]);
       continue;

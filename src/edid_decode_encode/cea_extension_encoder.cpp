@@ -47,7 +47,7 @@ void encode_video_block(const edid_t &edid, bool native_bit, byte_writer_t *exte
     LOG_WARNING("Requested too many short video descriptions. Truncating to the maximum allowed. Max:%d Requested:%d",
                 most, size);
   }
-  // kept: 32 descriptors wrap to a length of 0.
+  // kept: 32 descriptors are written, whose length wraps to 0.
   finish_block(data_block::video, header, extension);
 }
 

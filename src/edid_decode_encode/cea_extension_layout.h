@@ -14,6 +14,7 @@ inline constexpr u32 data_blocks = 4;
 
 inline constexpr u8 cea_tag = 0x02;
 inline constexpr u8 supported_revision = 3;
+// kept: CEA-861 allows up to 127, where no detailed timing follows.
 inline constexpr u32 largest_timings_offset = 110;
 
 inline constexpr u8 underscan = 0x80;
@@ -47,6 +48,7 @@ inline constexpr u32 extended = 7;
 
 inline constexpr u32 speaker_length = 3;
 inline constexpr u8 extended_colorimetry = 5;
+inline constexpr u8 extended_420_video = 0x0E;
 inline constexpr flag_t colorimetry_flags[] = {{&edid_t::xvycc601, 0x01}, {&edid_t::xvycc709, 0x02}};
 
 constexpr u8 header(u32 tag, u32 length) {

@@ -11,6 +11,7 @@ struct encoding_t {
   u8 physical_address_offset = 0;  ///< Within the whole EDID; set as soon as the HDMI block is begun.
   u32 extension_bytes = 0;         ///< Of the extension, before the checksum.
   u32 longest_block = 0;           ///< Of the data blocks that can become too long, without its header.
+  bool text_left_out = false;      ///< The serial number text was left out for lack of room.
 };
 
 /// encode_edid(), in whose name it reports.

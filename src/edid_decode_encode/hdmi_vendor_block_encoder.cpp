@@ -113,6 +113,7 @@ void encode_hdmi_vendor_block(edid_t *edid, byte_writer_t *extension) {
   extension->put(low_byte(edid->max_tmds_clock / layout::max_tmds_clock_unit));
   encode_latencies(*edid, extension);
   if (edid->hdmi_video_present != 0) encode_video(edid, extension);
+  // kept: a length above 31 wraps.
   const u32 length = extension->position() - header - 1;
   extension->put_at(header, data_block::header(data_block::vendor_specific, length));
 }

@@ -6,7 +6,7 @@
 namespace edid_composer {
 
 /// The four lists of a record, in the order in which they are checked, initialised and deleted.
-/// kept: two lists are called otherwise when they are missing at destruction.
+/// kept: two lists have another name when they are missing at destruction.
 struct record_list_t {
   ll_list_t edid_t::*list;
   u32 element_tag;

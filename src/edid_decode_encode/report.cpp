@@ -123,7 +123,7 @@ void print_features(const edid_t &edid) {
   print("\tStandard colorspace   = %s\n", true_or_false(edid.standard_colorspace != 0));
   print("\tPreferred timing mode = %s\n", true_or_false(edid.preferred_timing != 0));
   print("\tGTF                   = %s\n", supported(edid.gtf));
-  // kept: the timing bytes stand under this heading; the chromaticity coordinates are not printed.
+  // kept: the timing bytes follow this heading; the chromaticity coordinates are not printed.
   print("\nColorimetry:\n");
   print_est_man_type(edid.est_timings_1, est_timing_1_string, "Established Timings 1");
   print_est_man_type(edid.est_timings_2, est_timing_2_string, "Established Timings 2");

@@ -95,7 +95,7 @@ bool verify_entries(const ll_list_t &list) {
     return false;
   }
   if (counter != size) {
-    // kept: the counted number stands under the label ListSize.
+    // kept: the label ListSize has the counted number.
     LOG_ERROR("Corrupt List: Either the list's size doesn't match the number of entries. ListSize:%d Counted:%d",
               counter, size);
     return false;
@@ -110,7 +110,7 @@ bool verify_integrity(const ll_list_t *list) {
     return false;
   }
   if (const u32 magic = _get_magic_number(list); list->magic != magic) {
-    // kept: the stored magic stands under the label ExpectedMagic.
+    // kept: the label ExpectedMagic has the stored number.
     LOG_ERROR("Corrupt List: List not initialized. Ptr:%s ExpectedMagic:%d Magic:%d Size:%d Head:%s ",
               address(list).text, list->magic, magic, list->size, address(list->head).text);
     return false;
@@ -340,7 +340,7 @@ bool ll_add_entry_to_front(ll_list_t *list, ll_entry_t *new_entry) {
   REPORTS_AS(ll_add_entry_to_front);
   if (!accepts_entries<site>(list, new_entry)) return false;
   if (list->type != new_entry->type) {
-    // kept: "tothis".
+    // kept: "tothis" without a blank.
     LOG_BUG("This entry represents a different type and cannot be added tothis list. List:0x%08X Entry:0x%08X",
             list->type, new_entry->type);
     return false;

@@ -193,7 +193,7 @@ class appender_t : public untyped_appender_t {
     ll_entry_t *const entry = filled_entry(record);
     return entry != nullptr && add_to_back(entry);
   }
-  /// Puts the record before the others. kept: a failure has the words for the back of the list.
+  /// Puts the record before the others. kept: a failure is reported in the words for the back of the list.
   [[nodiscard]] bool prepend(const record_t &record) {
     ll_entry_t *const entry = filled_entry(record);
     return entry != nullptr && add_to_front(entry);

@@ -48,7 +48,7 @@ constexpr const char *vic_names[] = {
     "1440x576p50Hz4x3",       "1440x576p50Hz16x9",       "1920x1080p50Hz16x9",     "1920x1080p24Hz16x9",
     "1920x1080p25Hz16x9",     "1920x1080p30Hz16x9",      "2880x480p60Hz4x3",       "2880x480p60Hz16x9",
     "2880x576p50Hz4x3",       "2880x576p50Hz16x9",
-    "1920x10801250i50Hz16x9",  // kept: run together; the 1250-line raster
+    "1920x10801250i50Hz16x9",  // kept: 1080 and 1250 run together
     "1920x1080i100Hz16x9",    "1280x720p100Hz16x9",      "720x576p100Hz4x3",       "720x576p100Hz16x9",
     "720(1440)x576i100Hz4x3", "720(1440)x576i100Hz16x9", "1920x1080i120Hz16x9",    "1280x720p120Hz16x9",
     "720x480p120Hz4x3",       "720x480p120Hz16x9",       "720(1440)x480i120Hz4x3", "720(1440)x480i120Hz16x9",

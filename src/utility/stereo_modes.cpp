@@ -1,7 +1,7 @@
 // The 3D structures and modes that HDMI names (HDMI 1.4a, sections 8.2.3 and 8.3.2).
 #include "edid_composer.h"
 
-// kept: bit 15 stands for side-by-side (half), as bit 8 does.
+// kept: bit 15 means side-by-side (half), as bit 8 does.
 constinit const u32 _3d_struct_all_array[16] = {
     STEREO_FRAME_PACKING,
     STEREO_FIELD_ALTERNATIVE,

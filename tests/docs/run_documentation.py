@@ -8,7 +8,8 @@ Fenced blocks are told apart by their language and the words behind it:
   them compared with its --help; the latter are run with --source-tree.
 - text: what the block before it prints. A line `...` stands for any number of lines. `text figure` is a picture.
 - toml: composed from, by itself when it names its table, else under the domain's. A word is the file to keep it in.
-- c: `c fragment` (statements), `c declarations`, `c program` (linked) or `c program run` (and run).
+- c: `c fragment` (statements), `c declarations`, `c program` (linked) or `c program run` (and run). A word that ends in
+  .c is the file to keep it in.
 - cmake: a project around the document's last program is built with it.
 
 Exit status 0: all of it holds.

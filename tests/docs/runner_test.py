@@ -131,6 +131,10 @@ class Snippets(unittest.TestCase):
         self.assertEqual(self.problems(program + "```text\na\n```\n"), [])
         self.assert_told(program + "```text\nb\n```\n", "+a")
 
+    def test_a_program_with_a_file_name_is_kept(self):
+        program = "```c program kept.c\nint main(void) {\n  return 0;\n}\n```\n"
+        self.assertEqual(self.problems(program + "```sh\ngrep -c main kept.c\n```\n```text\n1\n```\n"), [])
+
     def test_a_language_that_is_not_run_is_told(self):
         self.assert_told("```python\n1\n```\n", "python")
         self.assert_told("```\n1\n```\n", "language")

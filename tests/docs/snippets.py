@@ -81,7 +81,8 @@ class Runner:
 
     def _c_program(self, block, expected):
         self.last_program = block.text
-        source = self.scratch.write("snippet.c", block.text)
+        names = [word for word in block.words if word.endswith(".c")]
+        source = self.scratch.write(names[0] if names else "snippet.c", block.text)
         libraries = C_LIBRARIES if "config_store.h" in block.text else ("-ledid_composer",)
         command = [self.compiler, *C_FLAGS, str(source), "-o", "snippet", *libraries]
         status, printed = self.scratch.run(command)

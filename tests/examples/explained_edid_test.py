@@ -1,4 +1,4 @@
-"""The EDID that the README explains line by line is the one that its command composes."""
+"""The EDID that docs/composed-edid.md explains line by line is the one that its command composes."""
 
 import os
 import pathlib
@@ -24,8 +24,8 @@ def explained(text):
 class ExplainedEdid(running.ExampleTest):
     def setUp(self):
         super().setUp()
-        readme = pathlib.Path(os.environ["SOURCE_DIR"]) / "README.md"
-        blocks = markdown.blocks(readme.read_text())
+        page = pathlib.Path(os.environ["SOURCE_DIR"]) / "docs" / "composed-edid.md"
+        blocks = markdown.blocks(page.read_text())
         (position,) = [i for i, block in enumerate(blocks) if block.words[:2] == ("figure", "edid")]
         self.command, self.figure = blocks[position - 1], blocks[position]
 

@@ -10,6 +10,8 @@ static_assert(sizeof(i32) == 4 && std::is_signed_v<i32>);
 static_assert(std::is_trivial_v<edid_t> && std::is_standard_layout_v<edid_t>);
 static_assert(std::is_trivial_v<platform_values_t> && std::is_standard_layout_v<platform_values_t>);
 static_assert(std::is_trivial_v<compose_cfg_t> && std::is_standard_layout_v<compose_cfg_t>);
+static_assert(std::is_trivial_v<hdmi2_t> && std::is_standard_layout_v<hdmi2_t>);
+static_assert(std::is_trivial_v<hdmi2_values_t> && std::is_standard_layout_v<hdmi2_values_t>);
 static_assert(std::is_trivial_v<compose_decision_t> && std::is_standard_layout_v<compose_decision_t>);
 static_assert(std::is_same_v<decltype(compose_decision_t::code), u32>);
 static_assert(std::is_same_v<decltype(compose_decision_t::position), i32>);

@@ -127,7 +127,7 @@ int run(const check_options_t &options) {
 command_t check_platform_command() {
   const auto target = std::make_shared<check_options_t>();
   return {"check-platform",
-          "Tell what a composition reads of a platform configuration, its mistakes, and what comes of them",
+          "Check a platform configuration: what is read of it, mistakes, and what follows from them",
           {required(option("FILE", "", target->file, parse_file_name, "The platform configuration (TOML)")),
            repeated({"--sink", "FILE", "EDID of a sink to compose for as well, or a folder of them; may be repeated",
                      [target](const std::string &text) { target->sinks.push_back(parse_file_name(text)); }}),

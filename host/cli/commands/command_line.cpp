@@ -20,7 +20,7 @@ namespace edid_cli {
 int run_command_line(int argument_count, char **arguments) {
   const program_t program{
       program_name,
-      "Composes the EDID that a video platform shows on its HDMI input, and looks at EDIDs and platforms. FILE may be "
+      "Composes the EDID that a video platform shows on its HDMI input; explains, prints and checks. FILE may be "
       "- for standard input.",
       std::string(program_name) + " " EDID_COMPOSER_VERSION "\n" + gVersion,
       {compose_command(), explain_command(), print_command(), diff_command(), sinks_command(), check_platform_command(),

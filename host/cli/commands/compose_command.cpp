@@ -47,7 +47,7 @@ int run(compose_options_t &options) {
     return compose_several(options) ? done_status : refused_status;
   }
   if (options.log) {
-    throw bad_input_t("--log goes with several EDIDs: a folder of sinks, or a range of ports");
+    throw bad_input_t("--log needs several EDIDs: a folder of sinks, or a range of ports");
   }
   return compose_single(options);
 }
@@ -60,15 +60,15 @@ command_t compose_command() {
   options.insert(
       options.end(),
       {required(option("-o,--output", "FILE", target->output, parse_file_name,
-                       "Where the EDID goes; - for standard output. Of several: a folder, or a file name with {sink} "
+                       "Where the EDID goes; - for standard output. For several: a folder, or a file name with {sink} "
                        "and {port} in it")),
        option("--format", "raw|hex", target->format, parse_edid_format,
               "Write bytes, or hexadecimal text (default raw)"),
        option("--jobs", "N", target->jobs, parse_jobs,
-              "Compose so many of several at once (default: as many as there are processors)"),
+              "Of several, compose N at the same time (default: the number of processors)"),
        flag("--strict", target->strict,
-            "Fail, and write no EDID, where a sink is not read to its end or a source could not use the EDID"),
-       flag("--log", target->log, "Of several: write what the library says into a .log file beside each")});
+            "Fail and write no EDID if a sink is not read to its end, or if no source could use the EDID"),
+       flag("--log", target->log, "For several: write the library's lines to a .log file beside each EDID")});
   return {"compose", "Compose an EDID, or one for each of several sinks or ports", std::move(options),
           [target] { return run(*target); }};
 }

@@ -119,7 +119,7 @@ command_t diff_command() {
   return {
       "diff",
       "Print two EDIDs side by side, field by field",
-      {flag("--only-changes", target->only_changes, "Leave out the fields that are the same"),
+      {flag("--only-changes", target->only_changes, "Omit the fields that are the same"),
        drm_directory_option(target->drm_directory), edid_operand("A", target->left), edid_operand("B", target->right)},
       [target] { return run(*target); }};
 }

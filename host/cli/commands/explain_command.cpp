@@ -126,16 +126,15 @@ int run(explain_options_t &options) {
 command_t explain_command() {
   const auto target = std::make_shared<explain_options_t>();
   std::vector<option_t> options = composition_options(target->composition);
-  options.insert(
-      options.end(),
-      {option(
-           "--want", "MODE", target->want, [](const std::string &text) { return text; },
-           "Say what stands in the way of one mode or format: 1080p60, 4k30, vic 16, pcm8, ac3, 3d, deep-color"),
-       flag("--wide", target->wide, "Print where each row comes from, and wrap nothing"),
-       flag("--json", target->json, "Print a JSON document"),
-       option("--html", "FILE", target->html_file, parse_file_name,
-              "Write a page to read in a browser; - for standard output")});
-  return {"explain", "Tell why a composed EDID offers what it offers", std::move(options),
+  options.insert(options.end(), {option(
+                                     "--want", "MODE", target->want, [](const std::string &text) { return text; },
+                                     "Print whether one mode or format is offered, why, and what to change: 1080p60, "
+                                     "4k30, vic 16, pcm8, ac3, 3d, deep-color"),
+                                 flag("--wide", target->wide, "Print where each row comes from, without wrapping"),
+                                 flag("--json", target->json, "Print a JSON document"),
+                                 option("--html", "FILE", target->html_file, parse_file_name,
+                                        "Write a page for a browser; - for standard output")});
+  return {"explain", "Explain why a composed EDID offers what it offers", std::move(options),
           [target] { return run(*target); }};
 }
 

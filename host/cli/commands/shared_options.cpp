@@ -32,7 +32,7 @@ option_t noted(option_t option, std::set<std::string> &given) {
 option_t drm_directory_option(std::string &directory) {
   directory = default_drm_directory;
   option_t result = option("--drm-dir", "DIR", directory, parse_file_name,
-                           std::string("Where the connectors are looked for (default ") + default_drm_directory + ")");
+                           std::string("The folder of the connectors (default ") + default_drm_directory + ")");
   result.environment = "EDID_COMPOSER_DRM_DIR";
   return result;
 }
@@ -68,9 +68,9 @@ std::string setting_name(const option_t &option) {
 std::vector<option_t> composition_options(composition_options_t &target) {
   std::vector<option_t> options = {
       option("--platform", "FILE", target.platform_file, parse_file_name,
-             "Platform configuration (TOML); the default one otherwise"),
+             "Platform configuration, TOML (default: the built-in one)"),
       option("--sink", "FILE", target.sink, parse_file_name,
-             "EDID of the downstream sink: a file, raw or as text, or a connector; no sink otherwise"),
+             "EDID of the downstream sink: a file, raw or as text, or a connector (default: no sink)"),
       drm_directory_option(target.drm_directory),
   };
   for (const option_t &setting : setting_options(target)) {

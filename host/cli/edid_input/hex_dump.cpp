@@ -84,7 +84,7 @@ class dump_reader_t {
     });
     if (!target) {
       refuse_at(name_, line, offset,
-                "is not the offset of what follows: " + std::to_string(bytes_.size()) + " bytes stand before it");
+                "is not the offset of what follows: " + std::to_string(bytes_.size()) + " bytes come before it");
     }
     while (bytes_.size() < *target) {
       bytes_.push_back(bytes_[bytes_.size() - last_row_size_]);

@@ -46,7 +46,7 @@ std::string title_of(const explained_t &explained) {
   const std::string sink = explained.sink_bytes.empty() ? "no sink"
                            : has_name                   ? explained.sink.monitor_name
                                                         : short_name(explained.sink_name);
-  return "EDID for " + sink + " behind " + explained.places.name();
+  return "EDID of " + explained.places.name() + " for " + sink;
 }
 
 std::vector<fact_t> edid_facts(const edid_records_t &edid, const std::string &source) {

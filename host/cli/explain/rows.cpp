@@ -55,7 +55,7 @@ row_t row_of(const compose_decision_t &decision, const explained_t &explained) {
   if (is_of_unread_block(decision, explained.reading)) {
     row.sentence = "This library reads one extension. It takes the bytes after it for timings, and offers none.";
   } else if (is_doubtful(decision, explained.reading)) {
-    row.sentence = "It stands in an extension that is malformed, and may be no timing at all.";
+    row.sentence = "It is in an extension that is malformed, and may not be a timing.";
     row.rests_on_unread = true;
   }
   return row;

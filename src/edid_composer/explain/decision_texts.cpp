@@ -13,13 +13,33 @@ struct text_t {
 };
 
 constexpr text_t subject_texts[] = {
-    {COMPOSE_SUBJECT_VIDEO_MODE, "video mode"},     {COMPOSE_SUBJECT_SINK_TIMING, "sink timing"},
-    {COMPOSE_SUBJECT_4K_MODE, "4Kx2K mode"},        {COMPOSE_SUBJECT_AUDIO_FORMAT, "audio format"},
-    {COMPOSE_SUBJECT_NATIVE_RATE, "native rate"},   {COMPOSE_SUBJECT_GEOMETRY_LIMIT, "geometry limit"},
-    {COMPOSE_SUBJECT_CURRENT_MODE, "current mode"}, {COMPOSE_SUBJECT_PHYSICAL_ADDRESS, "physical address"},
-    {COMPOSE_SUBJECT_DEEP_COLOR, "deep colour"},    {COMPOSE_SUBJECT_TMDS_CLOCK, "TMDS clock"},
-    {COMPOSE_SUBJECT_LATENCY, "latency"},           {COMPOSE_SUBJECT_3D, "3D"},
-    {COMPOSE_SUBJECT_PADDING, "padding"},           {COMPOSE_SUBJECT_EXTENSION_ROOM, "extension room"},
+    {COMPOSE_SUBJECT_VIDEO_MODE, "video mode"},
+    {COMPOSE_SUBJECT_SINK_TIMING, "sink timing"},
+    {COMPOSE_SUBJECT_4K_MODE, "4Kx2K mode"},
+    {COMPOSE_SUBJECT_AUDIO_FORMAT, "audio format"},
+    {COMPOSE_SUBJECT_NATIVE_RATE, "native rate"},
+    {COMPOSE_SUBJECT_GEOMETRY_LIMIT, "geometry limit"},
+    {COMPOSE_SUBJECT_CURRENT_MODE, "current mode"},
+    {COMPOSE_SUBJECT_PHYSICAL_ADDRESS, "physical address"},
+    {COMPOSE_SUBJECT_DEEP_COLOR, "deep colour"},
+    {COMPOSE_SUBJECT_TMDS_CLOCK, "TMDS clock"},
+    {COMPOSE_SUBJECT_LATENCY, "latency"},
+    {COMPOSE_SUBJECT_3D, "3D"},
+    {COMPOSE_SUBJECT_PADDING, "padding"},
+    {COMPOSE_SUBJECT_EXTENSION_ROOM, "extension room"},
+    {COMPOSE_SUBJECT_EXTENDED_MODE, "extended mode"},
+    {COMPOSE_SUBJECT_LINK_RATE, "link rate"},
+    {COMPOSE_SUBJECT_HDR, "HDR"},
+    {COMPOSE_SUBJECT_COLORIMETRY, "colorimetry"},
+    {COMPOSE_SUBJECT_YCBCR_420, "YCbCr 4:2:0"},
+    {COMPOSE_SUBJECT_DEEP_COLOR_420, "deep colour in 4:2:0"},
+    {COMPOSE_SUBJECT_ALLM, "ALLM"},
+    {COMPOSE_SUBJECT_VRR, "VRR"},
+    {COMPOSE_SUBJECT_QUANTIZATION, "quantization range"},
+    {COMPOSE_SUBJECT_PASSED_BLOCK, "passed-on block"},
+    {COMPOSE_SUBJECT_UHD_VIC, "UHD VIC"},
+    {COMPOSE_SUBJECT_PREFERRED_TIMING, "preferred timing"},
+    {COMPOSE_SUBJECT_ROOM_ITEM, "left out for room"},
 };
 
 constexpr text_t verdict_texts[] = {
@@ -101,6 +121,17 @@ constexpr text_t reason_texts[] = {
     {COMPOSE_REASON_PASSED_ON, "passed on from the sink"},
     {COMPOSE_REASON_RATE_BELOW_BLOCK, "it announces a mode that is too fast for the link"},
     {COMPOSE_REASON_VRR_CHANGED, "the sink's range of refresh rates is not offered unchanged"},
+    {COMPOSE_REASON_LINK_RATE_OF_BOX, "the platform's receiver takes no more"},
+    {COMPOSE_REASON_LINK_RATE_OF_SINK, "the sink takes no more"},
+    {COMPOSE_REASON_LINK_RATE_OF_ADDED_MODES, "modes that the platform makes itself need it"},
+    {COMPOSE_REASON_NO_MODE_IN_420, "no offered mode may be sent in it"},
+    {COMPOSE_REASON_RATE_BELOW_DEPTH, "no mode in 4:2:0 leaves room for it on the link"},
+    {COMPOSE_REASON_DEEP_COLOR_420_REQUIRED, "HDMI requires 30 bit where 36 bit is offered"},
+    {COMPOSE_REASON_UHD_VIC_OF_MODES, "a 4Kx2K mode is offered by its HDMI_VIC and by its VIC"},
+    {COMPOSE_REASON_NO_UHD_VIC, "no 4Kx2K mode is offered by its HDMI_VIC and by its VIC"},
+    {COMPOSE_REASON_NO_FORUM_BLOCK, "nothing else calls for the HDMI Forum block"},
+    {COMPOSE_REASON_FIRST_EXTENDED_MODE, "the first mode above VIC 64 that a detailed timing can hold"},
+    {COMPOSE_REASON_NO_EXTENDED_TIMING, "no offered mode above VIC 64 fits a detailed timing"},
 };
 
 constexpr text_t sink_status_texts[] = {

@@ -33,6 +33,7 @@ i32 compose_decision_t::*place_of(compose_origin origin) {
     case COMPOSE_ORIGIN_SHORT_VIDEO:
     case COMPOSE_ORIGIN_SINK_4K:
     case COMPOSE_ORIGIN_SINK_AUDIO:
+    case COMPOSE_ORIGIN_SINK_420:
       return &compose_decision_t::sink_index;
     case COMPOSE_ORIGIN_PRIORITY_LIST:
     case COMPOSE_ORIGIN_OTHER_PRIORITY_LIST:
@@ -92,11 +93,13 @@ compose_decision_t *decisions_t::nominate(compose_subject subject, u32 code, com
   return decision;
 }
 
-void decisions_t::nominate_modes(const ll_list_t &modes, compose_origin origin) {
+void decisions_t::nominate_modes(const ll_list_t &modes, compose_origin origin, u32 largest_vic) {
   if (!is_walkable<short_video_desc_t>(modes)) return;
   i32 index = 0;
-  for (const auto &mode : walk<const short_video_desc_t>(LIST(&modes, "&modes")))
-    nominate(COMPOSE_SUBJECT_VIDEO_MODE, mode.vic, origin, index++);
+  for (const auto &mode : walk<const short_video_desc_t>(LIST(&modes, "&modes"))) {
+    if (mode.vic <= largest_vic) nominate(COMPOSE_SUBJECT_VIDEO_MODE, mode.vic, origin, index);
+    ++index;
+  }
 }
 
 void decisions_t::note(compose_subject subject, u32 code, compose_verdict verdict, compose_reason reason,

@@ -1,6 +1,8 @@
 // The decisions of one composition, as an observer receives them.
 #pragma once
 
+#include <cstdint>
+
 #include "edid_composer/inputs.h"
 #include "linked_list/record_blocks.h"
 
@@ -25,7 +27,8 @@ class decisions_t {
   /// Adds a candidate by who names it, at which place of the list that it stands in.
   compose_decision_t *nominate(compose_subject subject, u32 code, compose_origin origin, i32 index);
   /// Nominates all modes of a list. One that can't be walked is passed over in silence: its stage has reported it.
-  void nominate_modes(const ll_list_t &modes, compose_origin origin);
+  /// VICs above @p largest_vic are passed over too.
+  void nominate_modes(const ll_list_t &modes, compose_origin origin, u32 largest_vic = UINT32_MAX);
   /// Adds a derived value.
   void note(compose_subject subject, u32 code, compose_verdict verdict, compose_reason reason,
             reason_values_t values = {});

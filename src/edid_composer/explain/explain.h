@@ -18,8 +18,9 @@ struct outcomes_t {
   encoding_t encoding{};
 };
 
-/// Explains a composition that has succeeded; @p new_edid are its 256 bytes, @p record what they were made from.
+/// Explains a composition that has succeeded, but for the places of what is offered (written_offer.h); @p new_edid are
+/// its 256 bytes, @p record what they were made from. Video modes are those up to @p largest_vic.
 void explain(const inputs_t &inputs, const outcomes_t &outcomes, const journal_t &journal, const edid_t &record,
-             const u8 *new_edid, decisions_t *decisions);
+             const u8 *new_edid, u32 largest_vic, decisions_t *decisions);
 
 }  // namespace edid_composer

@@ -53,9 +53,22 @@ void explain_depth(u32 bits, bool offered, decisions_t *decisions) {
                   COMPOSE_REASON_DEEP_COLOR_OF_PLATFORM, reason_values(offered));
 }
 
+/// The platform offers it only where the sink has it, which it hasn't.
+void leave_out_depth(u32 bits, decisions_t *decisions) {
+  constexpr i32 as_sink = 2;
+  decisions->note(COMPOSE_SUBJECT_DEEP_COLOR, bits, COMPOSE_VERDICT_LEFT_OUT, COMPOSE_REASON_SINK_WITHOUT,
+                  reason_values(as_sink, 0));
+}
+
 void explain_deep_color(const deep_color_t &deep_color, decisions_t *decisions) {
-  explain_depth(30, deep_color.bits_30, decisions);
-  if (deep_color.requires_36) {
+  if (deep_color.sink_lacks_30) {
+    leave_out_depth(30, decisions);
+  } else {
+    explain_depth(30, deep_color.bits_30, decisions);
+  }
+  if (deep_color.sink_lacks_36) {
+    leave_out_depth(36, decisions);
+  } else if (deep_color.requires_36) {
     decisions->note(COMPOSE_SUBJECT_DEEP_COLOR, 36, COMPOSE_VERDICT_CHANGED, COMPOSE_REASON_DEEP_COLOR_REQUIRED);
   } else {
     explain_depth(36, deep_color.bits_36, decisions);
@@ -63,8 +76,8 @@ void explain_deep_color(const deep_color_t &deep_color, decisions_t *decisions) 
   decisions->note(COMPOSE_SUBJECT_DEEP_COLOR, 48, COMPOSE_VERDICT_LEFT_OUT, COMPOSE_REASON_DEEP_COLOR_NEVER);
 }
 
-compose_verdict verdict_of_clock(u32 wanted_mhz, u32 declared_mhz) {
-  if (declared_mhz != wanted_mhz) return COMPOSE_VERDICT_CHANGED;
+compose_verdict verdict_of_clock(const tmds_clock_t &clock, u32 declared_mhz) {
+  if (declared_mhz != clock.wanted_mhz || clock.reason == COMPOSE_REASON_TMDS_LIMITED) return COMPOSE_VERDICT_CHANGED;
   return declared_mhz != 0 ? COMPOSE_VERDICT_OFFERED : COMPOSE_VERDICT_LEFT_OUT;
 }
 
@@ -78,9 +91,10 @@ void explain_tmds_clock(const tmds_clock_t &clock, const edid_t &sink, decisions
     values = reason_values(clock.wanted_mhz, declared_mhz);
   } else if (clock.reason == COMPOSE_REASON_TMDS_OVERRIDE) {
     values = reason_values(clock.wanted_mhz, sink.max_tmds_clock);
+  } else if (clock.reason >= COMPOSE_REASON_TMDS_OF_LINK) {
+    values = clock.values;
   }
-  decisions->note(COMPOSE_SUBJECT_TMDS_CLOCK, declared_mhz, verdict_of_clock(clock.wanted_mhz, declared_mhz), reason,
-                  values);
+  decisions->note(COMPOSE_SUBJECT_TMDS_CLOCK, declared_mhz, verdict_of_clock(clock, declared_mhz), reason, values);
 }
 
 }  // namespace

@@ -109,12 +109,12 @@ void nominate_4k_modes(const hdmi_vics_t &vics, compose_origin origin, decisions
 }  // namespace
 
 void explain_video_modes(const inputs_t &inputs, const video_selection_t &selection, const journal_t &journal,
-                         decisions_t *decisions) {
+                         u32 largest_vic, decisions_t *decisions) {
   const auto &[sink, platform, settings, arena] = inputs;
   const i32 rate = selection.native_rate.hz;
   nominate_timings<detailed_timing_t>(sink.dtd_list, COMPOSE_ORIGIN_DETAILED_TIMING, journal, decisions);
   nominate_timings<std_timing_t>(sink.std_timings, COMPOSE_ORIGIN_STANDARD_TIMING, journal, decisions);
-  decisions->nominate_modes(sink.video_list, COMPOSE_ORIGIN_SHORT_VIDEO);
+  decisions->nominate_modes(sink.video_list, COMPOSE_ORIGIN_SHORT_VIDEO, largest_vic);
   explain_native_rate(selection.native_rate, decisions);
   nominate_platform_modes(rate, platform, decisions);
   explain_geometry_limit(selection.geometry_limit, decisions);

@@ -8,8 +8,9 @@
 
 namespace edid_composer {
 
+/// Short video descriptors of the sink with VICs above @p largest_vic are none of these modes.
 void explain_video_modes(const inputs_t &inputs, const video_selection_t &selection, const journal_t &journal,
-                         decisions_t *decisions);
+                         u32 largest_vic, decisions_t *decisions);
 
 /// @p selected is the number of modes before any were added.
 void explain_padding(i32 selected, decisions_t *decisions);

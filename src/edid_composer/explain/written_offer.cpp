@@ -28,6 +28,8 @@ struct codes_t {
 
 struct written_offer_t {
   codes_t vics;
+  codes_t svds;      ///< The same, as they stand.
+  codes_t svds_420;  ///< Of the 4:2:0 video block.
   codes_t hdmi_vics;
   u32 audio_formats;
 };
@@ -53,8 +55,15 @@ written_offer_t read_offer(const byte_view_t &extension) {
         offer.audio_formats += blocks->length / short_audio_size;
         break;
       case data_block::video:
-        for (u32 i = 1; i <= blocks->length; ++i)
+        for (u32 i = 1; i <= blocks->length; ++i) {
           offer.vics.add(block[i] & short_video::vic_mask);
+          offer.svds.add(block[i]);
+        }
+        break;
+      case data_block::extended:
+        if (block[1] != data_block::extended_420_video) break;
+        for (u32 i = 2; i <= blocks->length; ++i)
+          offer.svds_420.add(block[i]);
         break;
       case data_block::vendor_specific:
         read_hdmi_vics(block, blocks->length, &offer.hdmi_vics);
@@ -88,6 +97,13 @@ void place_audio_formats(u32 count, decisions_t *decisions) {
   place_those(false);
 }
 
+/// A mode above VIC 64 stands in one of two blocks, by its whole code.
+void place_extended_mode(const written_offer_t &offer, compose_decision_t *decision) {
+  constexpr u8 whole_code = 0xFF;
+  const codes_t &svds = decision->reason == COMPOSE_REASON_ONLY_IN_420 ? offer.svds_420 : offer.svds;
+  place(decision, svds.place_of(decision->code, whole_code), svds.count);
+}
+
 }  // namespace
 
 void place_candidates(const u8 *new_edid, decisions_t *decisions) {
@@ -98,6 +114,8 @@ void place_candidates(const u8 *new_edid, decisions_t *decisions) {
       place(&decision, offer.vics.place_of(decision.code, short_video::vic_mask), offer.vics.count);
     } else if (decision.subject == COMPOSE_SUBJECT_4K_MODE) {
       place(&decision, offer.hdmi_vics.place_of(decision.code, hdmi_vendor_block::vic_mask), offer.hdmi_vics.count);
+    } else if (decision.subject == COMPOSE_SUBJECT_EXTENDED_MODE) {
+      place_extended_mode(offer, &decision);
     }
   }
   place_audio_formats(offer.audio_formats, decisions);

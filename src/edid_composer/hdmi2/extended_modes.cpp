@@ -81,6 +81,7 @@ class judge_t {
     extended_mode_t mode{.timing = &timing,
                          .index = index,
                          .place = mode_place_t::nowhere,
+                         .chosen_place = mode_place_t::nowhere,
                          .takes_420 = takes_420(inputs_, khz, naming, is_addition),
                          .made_by_box = false,
                          .reason = COMPOSE_REASON_NOT_AVAILABLE,
@@ -101,14 +102,15 @@ class judge_t {
       mode.place = mode_place_t::ycbcr_420_block;
       mode.made_by_box = half(khz) > both_khz;
       mode.reason = COMPOSE_REASON_ONLY_IN_420;
-      mode.values = reason_values(khz, half(khz), limit);
+      mode.values = reason_values(khz, half(khz), limit * khz_per_mhz);
     } else if (is_addition || naming.by_svd || mode.takes_420) {
       mode.reason = COMPOSE_REASON_ABOVE_RATE;
-      mode.values = reason_values(khz, limit);
+      mode.values = reason_values(khz, limit * khz_per_mhz, is_addition);
     } else if (naming.by_420_block) {
       mode.reason = COMPOSE_REASON_SINK_HAS_IT_IN_420;
       mode.values = reason_values(inputs_.platform.y420);
     }
+    mode.chosen_place = mode.place;
     return mode;
   }
 

@@ -13,8 +13,9 @@ struct extended_mode_t {
   const extended_timing_t *timing;
   i32 index;  ///< Of its first mention in the priority list.
   mode_place_t place;
-  bool takes_420;    ///< It may be sent in 4:2:0.
-  bool made_by_box;  ///< The link to the box has to carry it, whatever the sink takes.
+  mode_place_t chosen_place;  ///< Before room was made.
+  bool takes_420;             ///< It may be sent in 4:2:0.
+  bool made_by_box;           ///< The link to the box has to carry it, whatever the sink takes.
   compose_reason reason;
   reason_values_t values;
 

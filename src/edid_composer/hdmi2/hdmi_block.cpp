@@ -42,10 +42,13 @@ u32 largest_link_khz(const extended_modes_t &modes) {
 
 deep_color_t depths_for_sink(const layer_inputs_t &inputs, const deep_color_t &of_platform) {
   if (!is_as_sink(inputs)) return of_platform;
-  const edid_t &sink = inputs.base.sink;
-  return {.bits_30 = of_platform.bits_30 && sink.dc_30bit != 0,
-          .bits_36 = of_platform.bits_36 && sink.dc_36bit != 0,
-          .requires_36 = of_platform.requires_36};
+  const bool sink_has_30 = inputs.base.sink.dc_30bit != 0;
+  const bool sink_has_36 = inputs.base.sink.dc_36bit != 0;
+  return {.bits_30 = of_platform.bits_30 && sink_has_30,
+          .bits_36 = of_platform.bits_36 && sink_has_36,
+          .requires_36 = of_platform.requires_36 && sink_has_36,
+          .sink_lacks_30 = of_platform.bits_30 && !sink_has_30,
+          .sink_lacks_36 = of_platform.bits_36 && !sink_has_36};
 }
 
 tmds_clock_t tmds_clock_with_extended(const layer_inputs_t &inputs, const base_offer_t &base, const plan_t &plan,
@@ -58,6 +61,7 @@ tmds_clock_t tmds_clock_with_extended(const layer_inputs_t &inputs, const base_o
   if (rate > largest_hdmi_rate) {
     clock.wanted_mhz = largest_hdmi_rate;
     clock.reason = COMPOSE_REASON_TMDS_OF_LINK;
+    clock.values = reason_values(rate);
     return clock;
   }
   const u32 extended_khz = largest_link_khz(plan.extended);
@@ -73,8 +77,12 @@ tmds_clock_t tmds_clock_with_extended(const layer_inputs_t &inputs, const base_o
     most = std::min(most, std::max(inputs.base.sink.max_tmds_clock, needed));
   }
   const u32 wanted = rate_for_clock(std::max(of_today_khz, extended_khz));
-  if (std::min(wanted, most) != told_mhz) {
-    clock.reason = wanted > most ? COMPOSE_REASON_TMDS_LIMITED : COMPOSE_REASON_TMDS_OF_EXTENDED_MODES;
+  if (wanted > most) {
+    clock.reason = COMPOSE_REASON_TMDS_LIMITED;
+    clock.values = reason_values(wanted, most);
+  } else if (wanted != told_mhz) {
+    clock.reason = COMPOSE_REASON_TMDS_OF_EXTENDED_MODES;
+    clock.values = reason_values(extended_khz);
   }
   clock.wanted_mhz = std::min(wanted, most);
   return clock;

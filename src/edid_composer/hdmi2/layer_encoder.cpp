@@ -35,15 +35,17 @@ bool encode_base(const edid_t &edid, u8 *block) {
   return true;
 }
 
-void encode_serial_text(const char *text, byte_writer_t *extension) {
+/// False when there is one, but no room for it.
+bool encode_serial_text(const char *text, byte_writer_t *extension) {
   const text_descriptor_t serial(display_descriptor::serial_text, text);
-  if (!serial.has_text) return;
+  if (!serial.has_text) return true;
   if (extension->position() + descriptor_size > checksum_offset) {
     LOG_WARNING("Leaving out the serial number text for lack of room. Bytes missing:%u",
                 extension->position() + descriptor_size - checksum_offset);
-    return;
+    return false;
   }
   extension->put(serial.bytes, descriptor_size);
+  return true;
 }
 
 bool encode_extension(edid_t *edid, bool native_bit, const hdmi2_t &blocks, u8 *extension, encoding_t *encoding) {
@@ -52,7 +54,7 @@ bool encode_extension(edid_t *edid, bool native_bit, const hdmi2_t &blocks, u8 *
   write_hdmi2_blocks(blocks, &writer);
   writer.put_at(cea_extension::timings_offset, low_byte(writer.position()));
   encode_extension_timing(&writer);
-  encode_serial_text(edid->serial_string, &writer);
+  encoding->text_left_out = !encode_serial_text(edid->serial_string, &writer);
   encode_extension_flags(*edid, &writer);
   encoding->extension_bytes = writer.position();
   writer.put_at(checksum_offset, _calculate_checksum({extension, block_size}));

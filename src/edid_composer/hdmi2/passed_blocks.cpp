@@ -3,12 +3,6 @@
 #include "edid_composer/hdmi2/codec/passed_on_blocks.h"
 
 namespace edid_composer {
-namespace {
-
-/// What 2160p60 takes, MHz.
-constexpr u32 rate_of_2160p60 = 594;
-
-}  // namespace
 
 compose_reason judge_passed_block(const layer_inputs_t &inputs, passed_block_t which, u32 rate,
                                   const vrr_offer_t &vrr) {

@@ -19,6 +19,9 @@ inline constexpr passed_block_row_t passed_blocks[passed_block_count] = {
     {"FreeSync block", &hdmi2_t::freesync, &hdmi2_values_t::pass_freesync},
 };
 
+/// What 2160p60 takes, MHz.
+inline constexpr u32 rate_of_2160p60 = 594;
+
 /// Why a block is passed on (COMPOSE_REASON_PASSED_ON) or not, room aside. @p rate in MHz.
 compose_reason judge_passed_block(const layer_inputs_t &inputs, passed_block_t which, u32 rate, const vrr_offer_t &vrr);
 

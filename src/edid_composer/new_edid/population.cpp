@@ -27,7 +27,7 @@ void set_identity(const platform_values_t &platform, edid_t *new_edid) {
   LOG_TRACE("\tMonitor Name    = %s", text_field_t(new_edid->monitor_name).c_str());
 }
 
-/// What every composed EDID says of its display.
+/// What every composed EDID says of its display. kept: fixed, whatever the display and the modes are.
 void set_display(edid_t *new_edid) {
   new_edid->version = 1;
   new_edid->revision = 3;

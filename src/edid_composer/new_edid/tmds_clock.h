@@ -10,8 +10,9 @@ namespace edid_composer {
 struct tmds_clock_t {
   u32 wanted_mhz;  ///< 0 when it needn't be declared.
   compose_reason reason;
-  u32 pixel_clock;      ///< Of the most demanding mode, Hz; 0 with the platform's own clock.
-  u32 percent_of_that;  ///< What the deepest colour takes of it.
+  u32 pixel_clock;           ///< Of the most demanding mode, Hz; 0 with the platform's own clock.
+  u32 percent_of_that;       ///< What the deepest colour takes of it.
+  reason_values_t values{};  ///< Of a reason that follows from neither.
 
   /// What the record holds: the HDMI block has no room for more.
   u32 held_mhz() const;

@@ -23,6 +23,7 @@ configuration_list_t::configuration_list_t(const configuration_key_t &key) {
   find(key.path);
   if (ended_) return;
   entry_.index = 0;
+  // kept: cleared once for the list, so that after the NUL of an entry there can be the end of a longer one before it.
   for (char &character : entry_.text)
     character = '\0';
   print_platform_node(node_, "\tFirst Child Node");

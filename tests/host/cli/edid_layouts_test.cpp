@@ -172,9 +172,9 @@ TEST_F(EdidLayouts, AnOffsetThatDoesNotFollowIsNamedWithItsPlace) {
   std::string dump = xxd_dump(bytes_, 2);
   dump.erase(dump.find("00000020:"), dump.find("00000030:") - dump.find("00000020:"));
   expect_bad_input(print(dump),
-                   path() + ":3:1: \"00000030\" is not the offset of what follows: 32 bytes stand before it");
+                   path() + ":3:1: \"00000030\" is not the offset of what follows: 32 bytes come before it");
   expect_bad_input(print("00000000  00 ff\n*\nffffffff\n"),
-                   path() + ":3:1: \"ffffffff\" is not the offset of what follows: 2 bytes stand before it");
+                   path() + ":3:1: \"ffffffff\" is not the offset of what follows: 2 bytes come before it");
   expect_bad_input(print("00000000  00 ff\n*\n"), path() + ":2:1: \"*\" is followed by no offset that ends it");
   expect_bad_input(print("00000000  00 ff\nnot an offset\n"),
                    path() + ":2:1: \"not\" is not the offset that a line of this dump begins with");

@@ -171,10 +171,10 @@ TEST_F(Reasons, PutTheirNumbersIntoWords) {
       {COMPOSE_REASON_DUPLICATE, {2, 0}, "Format 1 of those chosen covers it already."},
       {COMPOSE_REASON_AUDIO_MASK, {0x3, 0x40}, "The audio mask in force, 0x3, leaves its type out; its bit is 0x40."},
       {COMPOSE_REASON_AUDIO_MASK, {-2, 1}, "The audio mask in force, 0xFFFFFFFE, leaves its type out; its bit is 0x1."},
-      {COMPOSE_REASON_CURRENT_MODE_WITHOUT_VIC, {1920, 540, 50, 1}, "No VIC stands for 1920x540i50."},
+      {COMPOSE_REASON_CURRENT_MODE_WITHOUT_VIC, {1920, 540, 50, 1}, "1920x540i50 has no VIC."},
       {COMPOSE_REASON_ADDRESS_BELOW_SINK,
        {3, 0x2000},
-       "Input 3 stands in the first free place of the sink's address 2.0.0.0."},
+       "Input 3 takes the first free place of the sink's address 2.0.0.0."},
       {COMPOSE_REASON_DEEP_COLOR_OF_PLATFORM, {0}, "The platform says no."},
       {COMPOSE_REASON_TMDS_OVERRIDE,
        {300, 0},
@@ -189,7 +189,7 @@ TEST_F(Reasons, PutTheirNumbersIntoWords) {
       {COMPOSE_REASON_ROOM_ENOUGH, {98, 127}, "98 of 127 bytes are used."},
       {COMPOSE_REASON_BLOCK_TOO_LONG,
        {120, 127, 32, 31},
-       "A data block has 32 bytes, but its length field can tell 31 at most: sources read it as shorter."},
+       "A data block has 32 bytes, but its length field can hold 31 at most: sources read it as shorter."},
   };
   for (const auto &expected : cases) {
     EXPECT_EQ(sentence(left_out(expected.reason, expected.values)), expected.sentence);
@@ -207,9 +207,9 @@ TEST_F(Reasons, SayWhichRateCountsAsWhich) {
 
 TEST_F(Reasons, SayWhatALatencyOf0MsIsDeclaredFor) {
   EXPECT_EQ(sentence(decision(COMPOSE_SUBJECT_LATENCY, 0, COMPOSE_VERDICT_LEFT_OUT, COMPOSE_REASON_LATENCY_NONE)),
-            "Neither the platform nor the sink tells of a delay.");
+            "Neither the platform nor the sink has a delay.");
   EXPECT_EQ(sentence(decision(COMPOSE_SUBJECT_LATENCY, 0, COMPOSE_VERDICT_OFFERED, COMPOSE_REASON_LATENCY_NONE)),
-            "Neither the platform nor the sink tells of a delay: 0 ms is declared, as other latencies are.");
+            "Neither the platform nor the sink has a delay: 0 ms is declared, as other latencies are.");
 }
 
 TEST_F(Reasons, ForNoRoomAreTheNameThatIsMissing) {

@@ -79,7 +79,7 @@ INSTANTIATE_TEST_SUITE_P(
         usage_case_t{"SinksWithArgument", {"sinks", "x"}, "The following argument was not expected: x (try --help)"},
         usage_case_t{"LogOfOne",
                      {"compose", "-o", nowhere, "--log"},
-                     "--log goes with several EDIDs: a folder of sinks, or a range of ports"},
+                     "--log needs several EDIDs: a folder of sinks, or a range of ports"},
         usage_case_t{
             "PlatformWithArgument", {"platform", "x"}, "The following argument was not expected: x (try --help)"}),
     [](const auto &tested) { return tested.param.name; });

@@ -125,7 +125,7 @@ TEST_F(ConfigStore, NestingDoesNotExhaustASmallStack) {
 }
 
 TEST_F(ConfigStore, CharactersOutsideOfAsciiBelongIntoStringsAndComments) {
-  const std::string beyond = "a character that is not ASCII stands outside of strings and comments";
+  const std::string beyond = "a character that is not ASCII is outside of strings and comments";
   EXPECT_EQ(refusal_of("a = 1\nb = \xEF\xBB\x9A\n"), "test.toml:2:5: " + beyond);
   EXPECT_EQ(refusal_of("\xC3\xA4 = 1\n"), "test.toml:1:1: " + beyond);
   EXPECT_EQ(refusal_of("a = '\xC3\xA4' \xC3\xA4\n"), "test.toml:1:9: " + beyond);

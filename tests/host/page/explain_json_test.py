@@ -38,8 +38,8 @@ class Cells(html.parser.HTMLParser):
 OWN_TEXTS = {"Verdict", "What", "Why", "From", "Offset", "Bytes", "Part", "Field", "Meaning", "Sink", "New EDID", "Key",
              "Value", "Default", "Limits", "Best video", "Preferred video", "Audio", "Lost", "Most common reasons",
              "none", "-", "Base block", "Limits and derived values",
-             "Why a box shows this EDID on its HDMI input, and what became of every mode and format.",
-             "Point at, tap or move to a byte with the arrow keys: what it means stands below."}
+             "Why a box shows this EDID on its HDMI input, with the verdict on every mode and format.",
+             "Point at a byte, tap it or go to it with the arrow keys: its meaning appears below."}
 
 
 def cells_of(page):

@@ -209,7 +209,7 @@ class Accessible(PageTest):
     def test_it_has_a_language_a_title_and_headings_in_order(self):
         self.open("--sink", self.sample("tv_4k"))
         self.assertEqual(self.browser.run("return document.documentElement.lang"), "en")
-        self.assertEqual(self.browser.run("return document.title"), "EDID for SAMPLE 4K TV behind default platform")
+        self.assertEqual(self.browser.run("return document.title"), "EDID of default platform for SAMPLE 4K TV")
         levels = self.browser.run("return [...document.querySelectorAll('h1, h2, h3')].map(h => Number(h.tagName[1]))")
         self.assertEqual(levels.count(1), 1)
         self.assertTrue(all(level - before <= 1 for before, level in zip(levels, levels[1:])), levels)
@@ -282,7 +282,7 @@ class Hostile(PageTest):
         sink = self.write("<script>document.body.remove();<\u2215script>.bin", sinks.sink(vics=[16], name=b"\n"))
         self.open("--platform", platform, "--sink", sink)
         self.assertEqual(self.browser.run("return document.images.length + document.scripts.length"), 1)
-        self.assertEqual(self.browser.run("return document.title"), f"EDID for {sink.name} behind {platform.name}")
+        self.assertEqual(self.browser.run("return document.title"), f"EDID of {platform.name} for {sink.name}")
 
     def test_scripts_other_than_its_own_do_not_run(self):
         self.open()

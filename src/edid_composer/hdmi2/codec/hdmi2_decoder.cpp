@@ -20,8 +20,9 @@ bool verify_size(u32 edid_bytes) {
 bool verify_base_block(const byte_view_t &block) {
   if (std::memcmp(block.data(), base_block::header, sizeof base_block::header) != 0) {
     LOG_ERROR(
-        "The base block does not begin with the header of an EDID. Expected:0x00FFFFFF Received:0x%02X%02X%02X%02X",
-        block[0], block[1], block[2], block[3]);
+        "The base block does not begin with the header of an EDID. Expected:0x00FFFFFFFFFFFF00 "
+        "Received:0x%04X%04X%04X%04X",
+        block.big_endian_16(0), block.big_endian_16(2), block.big_endian_16(4), block.big_endian_16(6));
     return false;
   }
   const u8 calculated = _calculate_checksum(block);

@@ -22,15 +22,16 @@ bool print_block(const char *heading, const byte_view_t &payload) {
   return true;
 }
 
-/// Types of metadata one after the other, each with its length ahead of it.
+/// Types of metadata one after the other, each with the length of what follows it ahead of it.
 void print_dynamic_metadata(const byte_view_t &payload) {
   constexpr u32 first = 1;
   constexpr u32 type = 1;
   constexpr u32 version = 3;
-  constexpr u32 length_with_version = 3;
-  for (u32 at = first; payload.contains(at + type + 1); at += 1 + payload[at]) {
+  constexpr u8 version_mask = 0x0F;
+  constexpr u32 least_length = 2;
+  for (u32 at = first; payload[at] >= least_length; at += 1 + payload[at]) {
     print_number("Metadata type", payload.little_endian_16(at + type), "");
-    if (payload[at] >= length_with_version) print_number("Version of the type", payload[at + version] & 0x0F, "");
+    if (payload[at] > least_length) print_number("Version of the type", payload[at + version] & version_mask, "");
   }
 }
 

@@ -16,7 +16,8 @@ u32 svd_count(const hdmi2_t &hdmi2) {
 bool is_marked_420(const hdmi2_t &hdmi2, u32 index) {
   if (hdmi2.y420_map_present == 0 || index >= hdmi2.svd_count) return false;
   if (hdmi2.y420_map_bytes == 0) return true;
-  return index / 8 < hdmi2.y420_map_bytes && (hdmi2.y420_map[index / 8] >> index % 8 & 1) != 0;
+  const byte_view_t map = byte_view_t(hdmi2.y420_map, sizeof hdmi2.y420_map).first(hdmi2.y420_map_bytes);
+  return (map[index / 8] >> index % 8 & 1) != 0;
 }
 
 void read_video_block(const byte_view_t &block, hdmi2_t *hdmi2) {
