@@ -102,7 +102,6 @@ int run(explain_options_t &options) {
   load_platform(options.composition.platform_file);
   require_platform_settings(options.composition);
   const std::vector<u8> sink = read_sink(options.composition.sink, options.composition.drm_directory);
-  const sink_record_t record(sink);
   const platform_places_t places(platform_name(options.composition));
   // What the library says goes to standard error: standard output is for the explanation.
   const composition_t composition =
@@ -112,7 +111,8 @@ int run(explain_options_t &options) {
     return options.want ? bad_input_status : refused_status;
   }
   const std::string sink_name = options.composition.sink ? input_name(*options.composition.sink) : "";
-  const sink_reading_t reading = sink_reading(sink, composition.result);
+  const sink_record_t record(sink_of_stages(sink, composition));
+  const sink_reading_t reading = sink_reading(sink, composition);
   const explained_t explained{composition, sink, record.get(), sink_name, reading, places, options.composition};
   if (options.want) {
     return print_answers(options, wanted, explained);
