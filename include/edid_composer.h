@@ -414,7 +414,7 @@ typedef struct platform_values_t {
   ll_list_t video_60_additional;    /**< Modes that a 60 Hz sink counts as able to show, whatever its EDID says. */
   i32 modes_4k_x_2k_priority[7];    /**< HDMI_VICs to offer, best first, 1 to 4 each; the first 0 ends the list. */
   i32 modes_4k_x_2k_addition[7];    /**< HDMI_VICs that the sink counts as able to show; the first 0 ends the list. */
-  i32 native_refresh_rate;          /**< Refresh family when the sink's EDID doesn't tell: 50 or 60. */
+  i32 native_refresh_rate;          /**< Refresh family if the sink's EDID shows none: 50 or 60. */
   i32 current_mode_set_to_priority; /**< 1: put the current output mode first. */
   i32 geometry_limit;               /**< 1: drop modes taller than the sink's tallest short video descriptor. */
   i32 audio_pass_through;           /**< 0 platform formats, 1 platform and sink formats, 2 sink formats. */
@@ -722,7 +722,7 @@ typedef struct configuration_key_t {
 } configuration_key_t;
 
 /**
- * Lends a key. Keys stand in the order in which they are read.
+ * The key at a position, in the order in which keys are read.
  *
  * @param index 0 for the first key.
  * @return the key, static; NULL after the last one.
@@ -768,8 +768,8 @@ typedef struct configuration_reading_t {
 /**
  * Receives what was read.
  *
- * Called on the thread that composes while the configuration is read: once for each key, and before a list's key for
- * each of its entries. Audio formats that are absent are passed over.
+ * Called on the thread that composes: once for each key that is read, and before a list's key for each of its entries.
+ * Passed over are audio formats that are absent, and, where HDMI 2 is off, the keys of its table but `enable`.
  *
  * @param reading the record; it is gone when the call returns.
  * @param context @ref compose_request_t::configuration_observer_context.
@@ -1204,7 +1204,7 @@ typedef struct compose_log_line_t {
   u32 line;             /**< Line number in the library's source; 0 for @ref COMPOSE_LOG_TEXT. */
   const char *text;     /**< The message, NUL-terminated, without the newline that ends the line on standard output.
                              Up to 1023 bytes; the rest of a longer one is cut. Texts of the sink and of the platform
-                             stand in it as they are, control characters included. */
+                             are in it as they are, control characters included. */
 } compose_log_line_t;
 
 /**
@@ -1232,7 +1232,7 @@ enum compose_sink_status {
   COMPOSE_SINK_CHECKSUM_INVALID = 5,
   /** Refused: neither version 1.3 nor a later revision of version 1. */
   COMPOSE_SINK_VERSION_UNSUPPORTED = 6,
-  /** Reading ended at a malformed 18-byte descriptor: what stands before it is used, what follows it and the extension
+  /** Reading ended at a malformed 18-byte descriptor: what comes before it is used, what follows it and the extension
    *  are not. */
   COMPOSE_SINK_DESCRIPTOR_INVALID = 7,
   /** Reading ended because a list entry could not be had. */
@@ -1258,7 +1258,7 @@ enum compose_extension_status {
   /** Refused: its detailed timings (byte 2) begin after byte 110, which the standard allows and this library does not.
    */
   COMPOSE_EXTENSION_OFFSET_UNSUPPORTED = 8,
-  /** A data block overruns its collection: what stands before it is used. See @ref
+  /** A data block overruns its collection: what comes before it is used. See @ref
    *  compose_result_t::sink_malformed_at. */
   COMPOSE_EXTENSION_MALFORMED = 9,
   /** Reading ended because a list entry could not be had. */
@@ -1309,9 +1309,9 @@ typedef struct compose_result_t {
 /**
  * Composes as @ref compose_edid_internal does, from a request record into a result record.
  *
- * What is written, and every line, is the same as from @ref compose_edid_internal, in whose name the lines are, with an
- * observer or a log callback and without. An observed composition needs list entries of its own; when one cannot be
- * had, that is reported, the composition goes on, and no decision is passed on.
+ * What is written, and every line, is the same as from @ref compose_edid_internal, in whose name the lines are, unless
+ * HDMI 2 is asked for (@ref hdmi2); with observer or log callback and without. An observed composition needs list
+ * entries of its own; when one cannot be had, that is reported and no decision is passed on, but the EDID is written.
  *
  * Several threads may compose at once, each with its own request, result and buffers; each call's lines go to its own
  * callback.

@@ -1,6 +1,6 @@
 #!/bin/sh
 # Measures what the tests cover and fails below 98 % of the lines or 95 % of the branches of src/, or 90 % of the lines of
-# host/. What cannot be covered is marked where it stands, with the reason (GCOVR_EXCL_...). Details: build/coverage/*.html
+# host/. What cannot be covered is marked in the source, with the reason (GCOVR_EXCL_...). Details: build/coverage/*.html
 # usage: scripts/coverage.sh [--no-install]
 set -eu
 cd "$(dirname "$0")/.."

@@ -1,6 +1,6 @@
 #!/bin/sh
 # Breaks the library and the program on purpose, one change at a time, and shows that the tests notice each of them.
-# usage: scripts/mutate.sh [--no-install] [ARGUMENT OF tests/mutation/mutate.py...] (--help tells them)
+# usage: scripts/mutate.sh [--no-install] [ARGUMENT OF tests/mutation/mutate.py...] (--help lists them)
 set -eu
 cd "$(dirname "$0")/.."
 . scripts/install_packages.sh

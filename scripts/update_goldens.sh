@@ -1,5 +1,5 @@
 #!/bin/sh
-# Composes every golden case anew and writes tests/end_to_end/golden. What changed is then to be reviewed like code:
+# Composes every golden case again and writes tests/end_to_end/golden. Review the changes like code:
 # git diff tests/end_to_end/golden
 # usage: scripts/update_goldens.sh [--no-install]
 # Needs a Debian 12 machine, and root or sudo if one of the packages below is missing.
@@ -7,7 +7,7 @@ set -eu
 cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 
-echo 'Building the library and the golden maker, and making the goldens anew.'
+echo 'Building the library and the golden maker, and writing the goldens.'
 install_packages build-essential cmake ninja-build python3 libgtest-dev libgmock-dev libtomlplusplus-dev libcli11-dev \
   nlohmann-json3-dev libutfcpp-dev
 

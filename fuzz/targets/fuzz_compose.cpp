@@ -5,44 +5,19 @@
 #include "fuzz_input.h"
 #include "fuzz_target.h"
 #include "sink_bytes.h"
+#include "support/configuration_keys.h"
 #include "support/configuration_tree.h"
 #include "support/observation.h"
 
 namespace {
 
-constexpr std::array<const char *, 25> scalar_keys = {
-    "native_refresh_rate",
-    "current_mode_set_to_priority",
-    "audio.pass_through",
-    "underscan",
-    "is_tv",
-    "geometry_limit",
-    "dc_30bit",
-    "dc_36bit",
-    "tmds_override",
-    "supports_ai",
-    "speaker_entry",
-    "xvYCC601",
-    "xvYCC709",
-    "native_bit",
-    "product_id",
-    "serial",
-    "week",
-    "year",
-    "CNC0",
-    "CNC1",
-    "CNC2",
-    "CNC3",
-    "manufacturer_id",
-    "monitor_name",
-    "monitor_serial",
-};
+bool is_scalar(const configuration_key_t &key) {
+  return key.kind == CONFIGURATION_INTEGER || key.kind == CONFIGURATION_UNSIGNED || key.kind == CONFIGURATION_TEXT;
+}
 
-constexpr std::array<const char *, 10> list_keys = {
-    "50_hz_priority_list",   "50_hz_addition_list",   "60_hz_priority_list",   "60_hz_addition_list",
-    "4k_x_2k_priority_list", "4k_x_2k_addition_list", "established_timings_1", "established_timings_2",
-    "manufacturer_timings",  "standard_timings",
-};
+bool is_list(const configuration_key_t &key) {
+  return !is_scalar(key) && key.kind != CONFIGURATION_AUDIO_FORMATS;
+}
 
 /// The many entries that a valid configuration has, before the fuzzer's own.
 void add_modes(fuzz::fuzz_input_t *input, test_support::configuration_tree_t *tree) {
@@ -58,14 +33,16 @@ void add_modes(fuzz::fuzz_input_t *input, test_support::configuration_tree_t *tr
 }
 
 void add_anything(fuzz::fuzz_input_t *input, test_support::configuration_tree_t *tree) {
+  static const auto lists = test_support::configuration_keys(is_list);
+  static const auto scalars = test_support::configuration_keys(is_scalar);
   for (u32 count = input->below(40); count > 0; --count) {
-    const bool is_list = input->flag();
+    const bool in_list = input->flag();
     const bool is_text = input->flag();
-    const std::string key =
-        is_list ? list_keys[input->below(list_keys.size())] : scalar_keys[input->below(scalar_keys.size())];
-    if (is_list && is_text) {
+    const auto &keys = in_list ? lists : scalars;
+    const std::string key = keys[input->below(static_cast<u32>(keys.size()))]->name;
+    if (in_list && is_text) {
       tree->add(key, input->text(40));
-    } else if (is_list) {
+    } else if (in_list) {
       tree->add(key, static_cast<i32>(input->flag() ? input->below(9) : input->number()));
     } else if (is_text) {
       tree->set(key, input->text(40));

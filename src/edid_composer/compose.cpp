@@ -113,8 +113,8 @@ bool run_stages(const inputs_t &inputs, edid_t *new_edid, journal_t *journal, ou
   return true;
 }
 
-/// Takes over what became of the encoding.
-bool keep_encoding(const compose_request_t &request, const encoding_t &encoding, compose_result_t *result) {
+/// Takes over what became of the encoding, and traces the new EDID.
+bool conclude_encoding(const compose_request_t &request, const encoding_t &encoding, compose_result_t *result) {
   const u8 offset = encoding.physical_address_offset;
   if (offset != 0 && request.settings->spa_offset != nullptr) *request.settings->spa_offset = offset;
   if (!encoding.complete) {
@@ -123,6 +123,7 @@ bool keep_encoding(const compose_request_t &request, const encoding_t &encoding,
   }
   result->bytes_written = largest_size;
   result->physical_address_offset = offset;
+  trace_new_edid(request.new_edid);
   return true;
 }
 
@@ -130,7 +131,7 @@ bool keep_encoding(const compose_request_t &request, const encoding_t &encoding,
 bool write(const compose_request_t &request, const platform_values_t &platform, edid_t *new_edid, encoding_t *encoding,
            compose_result_t *result) {
   *encoding = encode(request.new_edid, static_cast<i32>(request.new_edid_bytes), new_edid, &platform);
-  return keep_encoding(request, *encoding, result);
+  return conclude_encoding(request, *encoding, result);
 }
 
 /// Reads the sink, with HDMI 2 into @p hdmi2 too, which is null without.
@@ -181,7 +182,6 @@ bool compose_plain(const preparation_t &preparation, workspace_t *work, compose_
       !write(request, platform, &work->new_edid, &outcomes.encoding, result)) {
     return false;
   }
-  trace_new_edid(request.new_edid);
   pass_on_decisions(request, inputs, outcomes, journal, work->new_edid);
   return true;
 }
@@ -213,8 +213,7 @@ bool compose_plain(const preparation_t &preparation, workspace_t *work, compose_
   }
   outcomes.encoding = encode_with_hdmi2(request.new_edid, static_cast<i32>(request.new_edid_bytes), &work->new_edid,
                                         layer.offer.blocks, platform);
-  if (!keep_encoding(request, outcomes.encoding, result)) return false;
-  trace_new_edid(request.new_edid);
+  if (!conclude_encoding(request, outcomes.encoding, result)) return false;
   outcomes.population.deep_color = layer.offer.depths;
   outcomes.population.tmds_clock = layer.offer.tmds_clock;
   pass_on_decisions(request, inputs, outcomes, journal, work->new_edid, &layer_inputs, &layer);

@@ -1,4 +1,4 @@
-// What the list derives its checks from, and the making of entries whose tag is known.
+// Lists and entries whose tag is known.
 #pragma once
 
 #include "edid_composer.h"
@@ -6,9 +6,6 @@
 namespace edid_composer {
 
 class entry_arena_t;
-
-/// The magic of an initialised head: its own address, so that a moved or copied head is found out. 0 for a null list.
-u32 _get_magic_number(const ll_list_t *list);
 
 /// The tag of a type name: its bytes, sign-extended, XORed together at shifts of 0, 8, 16, 24, 0, ...
 constexpr u32 _calculate_str_checksum(const char *name) {

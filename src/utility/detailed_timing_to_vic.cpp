@@ -15,19 +15,11 @@ bool same_raster(const vic_timing_t &row, const detailed_timing_t &timing) {
          row.vertical.active == timing.v_active;
 }
 
-bool row_aspect(u32 index, u32 *ratio) {
-  const detailed_timing_t row = timing_of(g_vic_dtd[index]);
-  if (row.h_image_size == 0 || row.v_image_size == 0) {
-    LOG_BUG("DTD table timing has a zeroed vertical/horizontal image size. index:%d h_image_size:%d v_image_size:%d",
-            index, row.h_image_size, row.v_image_size);
-    return false;
-  }
-  if (convert_geo_to_ratio(row.h_image_size, row.v_image_size, ratio) != 1) {
-    LOG_BUG("DTD table timing failed aspect ratio calculation. index:%d h_image_size:%d v_image_size:%d", index,
-            row.h_image_size, row.v_image_size);
-    return false;
-  }
-  return true;
+/// The picture aspect ratio of a row, whose image size always has one.
+u32 aspect_of(const vic_timing_t &row) {
+  u32 ratio = 0;
+  convert_geo_to_ratio(row.image_size.width, row.image_size.height, &ratio);
+  return ratio;
 }
 
 /// The picture aspect ratio of a timing: that of its image size, else that of the monitor.
@@ -61,12 +53,10 @@ using namespace edid_composer;  // NOLINT(google-build-using-namespace): the ope
 
 u8 convert_dtd_to_vic(const edid_t *edid, const detailed_timing_t *timing, u32 *vic) {
   if (!begin_search<site>(edid, timing, vic)) return 0;
-  for (u32 index = 0; index < g_vic_dtd_size; ++index) {
-    u32 row_ratio = 0;
-    u32 timing_ratio = 0;
-    if (same_raster(g_vic_dtd[index], *timing) && row_aspect(index, &row_ratio) &&
-        timing_aspect(*edid, *timing, &timing_ratio) && row_ratio == timing_ratio) {
-      *vic = g_vic_dtd[index].vic;
+  for (const vic_timing_t &row : g_vic_dtd) {
+    u32 ratio = 0;
+    if (same_raster(row, *timing) && timing_aspect(*edid, *timing, &ratio) && aspect_of(row) == ratio) {
+      *vic = row.vic;
       return 1;
     }
   }

@@ -38,10 +38,12 @@ bool platform_values_init(platform_values_t *values) {
   }
   std::memset(values, 0, sizeof *values);
   for (const auto &row : platform_lists) {
+    // GCOVR_EXCL_START: takes a list at one of the few addresses whose magic is 0.
     if (!init_list(&(values->*row.list), row.element_tag)) {
       LOG_BUG("Failed to initialize the platform values %s", row.initialised_name);
       return false;
     }
+    // GCOVR_EXCL_STOP
   }
   return true;
 }

@@ -34,7 +34,7 @@ std::vector<workload_t> all_workloads() {
     workloads.push_back({operation.name + ("/" + ordinary.name), &operation, ordinary.bytes, ordinary.bytes, false});
   const auto add_hostile = [&](const char *operation, const bench::hostile_family_t &family) {
     const bytes_t smallest = bench::hostile_sink(family, 256);
-    for (const std::size_t size : {256, 4096, 32768}) {
+    for (const std::size_t size : {256U, 4096U, 32768U}) {
       const std::string name = std::string(operation) + "/" + family.name + "/" + std::to_string(size);
       const bytes_t sink = bench::hostile_sink(family, size);
       workloads.push_back({name, &bench::operation_named(operation), sink, smallest, true});

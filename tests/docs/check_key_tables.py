@@ -21,7 +21,7 @@ SMALLEST, LARGEST = -2147483648, 4294967295
 
 
 def of_markdown(text):
-    """Each key's limits and default as a table tells them; None where it tells no number."""
+    """Each key's limits and default as a table has them; None if they are not numbers."""
     keys = {}
     for table in markdown.tables(text):
         for row in table:
@@ -34,7 +34,7 @@ def of_markdown(text):
 
 
 def of_man_page(text):
-    """The same from a manual page: an item for each key, and a sentence behind it."""
+    """The same from a manual page: an item for each key, and the sentence after it."""
     keys = {}
     for name, sentence in re.findall(r"^\.It Ic (\S+)\n(.*)$", text, re.MULTILINE):
         number = re.match(rf"Integer, {RANGE.pattern}; default (\S+)\.$", sentence)
@@ -43,7 +43,7 @@ def of_man_page(text):
 
 
 def of_library(scratch):
-    """The same as the library tells it, of itself."""
+    """The same from the library itself."""
     asked = platform_keys.asked_for(scratch)
     numbers = [path for path, (kind, _) in asked.items() if kind == "number"]
     limits = {}
@@ -70,7 +70,7 @@ def of_table(text):
 
 
 def limits_in_words(low, high):
-    """How the default platform's comments may tell limits."""
+    """How the default platform's comments may write limits."""
     values = [str(value) for value in range(int(low), int(high) + 1)] if int(high) - int(low) <= 2 else []
     upper = rf"(?:{high}|0x{int(high):X})"
     listed = [", ".join(values[:-1]) + " or " + values[-1]] if len(values) > 1 else []
@@ -78,7 +78,7 @@ def limits_in_words(low, high):
 
 
 def comment_problems(text, library):
-    """What the default platform's comments don't tell of the keys below them."""
+    """What the default platform's comments lack about the keys below them."""
     for block in re.split(r"\n\n", text):
         comment = " ".join(line.lstrip("# ") for line in block.splitlines() if line.startswith("#"))
         for name in re.findall(r"^(\w+) = ", block, re.MULTILINE):
@@ -87,9 +87,9 @@ def comment_problems(text, library):
                 continue
             low, high, default = library[key]
             if not re.search(limits_in_words(low, high), comment):
-                yield f"platform.toml: the comment of {name} doesn't tell its limits, {low} to {high}: {comment}"
+                yield f"platform.toml: the comment of {name} does not have its limits, {low} to {high}: {comment}"
             if not re.search(rf"[Dd]efault {default}\b", comment):
-                yield f"platform.toml: the comment of {name} doesn't tell its default, {default}: {comment}"
+                yield f"platform.toml: the comment of {name} does not have its default, {default}: {comment}"
 
 
 def problems(documented, library, name):

@@ -1,4 +1,4 @@
-"""The program's command lines, as --help tells them and as documents write them."""
+"""The program's command lines, as --help lists them and as documents write them."""
 
 import re
 import shlex
@@ -48,7 +48,7 @@ def options_in(text):
 
 
 def invocations(script):
-    """The command lines of the program in a shell script, each as its words behind the program's name."""
+    """The command lines of the program in a shell script, each as the words after the program's name."""
     found = []
     for line in script.replace("\\\n", " ").splitlines():
         lexer = shlex.shlex(line, posix=True, punctuation_chars="|&;<>()")

@@ -26,7 +26,7 @@ def masked_lines(text):
 
 
 def _segments(lines):
-    """The runs of lines between the lines that stand for left-out ones."""
+    """The runs of lines between the lines that mark left-out ones."""
     segments = [[]]
     for line in lines:
         if line == LEFT_OUT:
@@ -44,7 +44,7 @@ def _find(segment, lines, start):
 
 
 def matches(expected, actual):
-    """Whether the lines of a document stand for the lines that were printed; '...' stands for any number of lines."""
+    """Whether a document's lines match the lines that were printed; '...' matches any number of lines."""
     first, *others = _segments(expected)
     if not others:
         return first == actual

@@ -8,7 +8,7 @@ FENCE = re.compile(r"^(?P<indent> *)(?P<ticks>`{3,})(?P<info>[^`]*)$")
 
 @dataclasses.dataclass(frozen=True)
 class Block:
-    """A fenced block: its language, the words behind it, its text, and where it begins."""
+    """A fenced block: its language, the words after it, its text, and where it begins."""
 
     language: str
     words: tuple
@@ -39,7 +39,7 @@ def blocks(text):
 
 
 def outside_blocks(text):
-    """The document without what stands in fenced blocks, line for line."""
+    """The document with empty lines in place of its fenced blocks."""
     lines = []
     ticks = None
     for line in text.splitlines():
@@ -77,7 +77,7 @@ def links(text):
 
 
 def anchors(text):
-    """What a link may name behind a '#': one for each heading, made as the common Markdown sites make them."""
+    """What a link may name after a '#': one for each heading, made as the common Markdown sites make them."""
     for line in outside_blocks(text):
         heading = re.match(r"#+ +(.*)", line)
         if heading:

@@ -24,7 +24,7 @@ def compose(scratch, configuration):
 
 
 def missing(printed):
-    """What a composition looked for in vain: full path and kind, with the default where one is told."""
+    """What a composition looked for in vain: full path and kind, with the default if the warning has one."""
     found = {}
     for line in printed.splitlines():
         for kind, pattern in (("number", NUMBER), ("text", TEXT), ("list", LIST)):
@@ -44,7 +44,7 @@ def asked_for(scratch):
 
 
 def limits(printed):
-    """The limits that the warnings about too small and too large values tell."""
+    """The limits that the warnings about too small and too large values have."""
     return {match[1]: (match[2], match[3]) for match in LIMITED.finditer(printed)}
 
 

@@ -1,7 +1,7 @@
 #!/usr/bin/env python3
 """Runs every command and snippet of a Markdown document, in order, as a reader would, and compares what they print.
 
-Fenced blocks are told apart by their language and the words behind it:
+What is done with a fenced block depends on its language and the words after it:
 
 - sh: run by `sh -e` in a scratch folder that keeps what earlier blocks of the document wrote. `sh hardware` needs a
   connector or a capture device and `sh build` the source tree: these are parsed, and the options of edid-composer in
@@ -76,7 +76,7 @@ def main():
     parser.add_argument("--libdir", default="lib", help="where under it the libraries are")
     parser.add_argument("--cc", default="cc", help="C compiler")
     parser.add_argument("--source-tree", action="store_true", help="run in a copy of the source tree, build blocks too")
-    parser.add_argument("--show", action="store_true", help="tell each block")
+    parser.add_argument("--show", action="store_true", help="list each block")
     arguments = parser.parse_args()
 
     with scratch_folder.Scratch(arguments.source, arguments.prefix, arguments.libdir) as scratch:

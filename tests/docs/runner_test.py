@@ -85,7 +85,7 @@ class CommandLines(unittest.TestCase):
 
 
 class Snippets(unittest.TestCase):
-    """Whole documents, each with one mistake that must be told, or none."""
+    """Whole documents, each with one mistake that must be reported, or none."""
 
     def problems(self, text):
         with tempfile.TemporaryDirectory() as folder, scratch_folder.Scratch(*ARGUMENTS[:3]) as scratch:

@@ -1,5 +1,5 @@
-"""A place to run a document's snippets in: an empty folder with the examples in it, and the program, header and
-libraries found as if they were installed in the system's own places."""
+"""A place to run a document's snippets in: a folder with the examples and the names of the source tree's other folders
+in it, and the program, header and libraries found as if they were installed in the system's own places."""
 
 import os
 import pathlib
@@ -15,7 +15,11 @@ class Scratch:
         self.timeout = timeout
         self._folder = tempfile.TemporaryDirectory(prefix="edid_composer_docs.")
         self.path = pathlib.Path(self._folder.name)
-        shutil.copytree(source / "examples", self.path / "examples")
+        # A reader is in a clone: what a snippet writes must not have the name of one of its folders.
+        for folder in source.iterdir():
+            if folder.is_dir():
+                (self.path / folder.name).mkdir()
+        shutil.copytree(source / "examples", self.path / "examples", dirs_exist_ok=True)
         self.environment = self._environment(prefix, prefix / libdir)
 
     def __enter__(self):

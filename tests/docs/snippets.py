@@ -93,7 +93,7 @@ class Runner:
     def _cmake(self, block, expected):
         """Configures and builds a project around the fragment, with the last program that the document showed."""
         if self.last_program is None or expected is not None:
-            return "a CMake block stands behind the C program that it builds, and prints nothing"
+            return "a CMake block follows the C program that it builds, and prints nothing"
         lines = ["cmake_minimum_required(VERSION 3.22)", "project(host C)"]
         if "add_executable(" not in block.text:
             lines.append("add_executable(host host.c)")

@@ -1,26 +1,20 @@
 // The payloads of the data blocks of an extension.
 #include <cstdio>
 
-#include "codec_fixture.h"
+#include "extension_lines.h"
 #include "support/failing_allocation.h"
 
 namespace codec_test {
 namespace {
 
+using extension_lines::error;
+using extension_lines::function;
+using extension_lines::trace;
 using test_support::audio_block;
 using test_support::audio_of;
 using test_support::audio_words_t;
 using test_support::data_block;
 using test_support::video_block;
-
-constexpr const char *function = "decode_edid_extensions";
-
-std::string error(const std::string &message) {
-  return codec_error(function, message);
-}
-std::string trace(const std::string &message) {
-  return trace_line(function, message);
-}
 
 const std::string unrecognised_format =
     codec_error("decode_edid_short_audio", "Unrecognized audio type found in audio format. Expected:1-15 Received:0");

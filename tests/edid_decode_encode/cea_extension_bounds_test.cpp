@@ -1,28 +1,15 @@
 // Reads of an extension stay inside the bytes that there are; what is missing reads as 0.
-#include "codec_fixture.h"
+#include "extension_lines.h"
 #include "support/long_loops.h"
 
 namespace codec_test {
 namespace {
 
+using extension_lines::error;
+using extension_lines::function;
+using extension_lines::malformed;
+using extension_lines::trace;
 using test_support::data_block;
-
-constexpr const char *function = "decode_edid_extensions";
-
-std::string error(const std::string &message) {
-  return codec_error(function, message);
-}
-std::string trace(const std::string &message) {
-  return trace_line(function, message);
-}
-
-std::string malformed(u32 index, i32 collection) {
-  return error(
-      "Malformed EDID: The CEA extension data block specifies a tag with a length whose total bytes exceeds the length "
-      "of "
-      "the CEA extension's data block. Tag:0 Len:0 Current Byte:" +
-      std::to_string(index) + " Data Block Len:" + std::to_string(collection));
-}
 
 // The first @p length bytes, with the last of them (of the first block) changed so that the block sums to 0 when the
 // missing ones are 0. The first four stay as they are.
@@ -54,7 +41,7 @@ outcome_t outcome_of(const u8 *extension, u32 length) {
   return outcome;
 }
 
-// Decoding must not depend on what lies behind the bytes, and must be what it is with zeros there.
+// Decoding must not depend on what lies after the bytes, and must be what it is with zeros there.
 outcome_t outcome_without_reading_behind(const bytes_t &bytes) {
   const exact_bytes_t exact(bytes);
   outcome_t outcome = outcome_of(exact.data(), exact.size());
@@ -166,7 +153,7 @@ TEST(ExtensionBounds, HeadersBehindTheEndReadAsReservedBlocksUpToTheBound) {
       error("Malformed EDID: The CEA extension data block specifies a tag with a length whose total bytes exceeds "
             "the length of the CEA extension's data block. Tag:7 Len:31 Current Byte:0 Data Block Len:8"));
 
-  // Flags chosen so that byte 4 is 0: reserved, no payload, and so are the seven headers behind it.
+  // Flags chosen so that byte 4 is 0: reserved, no payload, and so are the seven headers after it.
   const bytes_t reserved = cut_to({0x02, 0x03, 12, 0xEF, 0x00}, 5);
   ASSERT_EQ(reserved[4], 0x00);
   std::string expected;
@@ -233,7 +220,7 @@ TEST(ExtensionBounds, AWrappedCollectionEndsAsAnOverrunBehindTheLastByte) {
       expected += trace(header == 26 ? "Reserved code. Len=1" : "Reserved code. Len=0");
     }
     EXPECT_EQ(outcome.result, 0);
-    EXPECT_EQ(outcome.output, expected + malformed(static_cast<u32>(length) - 4, -1));
+    EXPECT_EQ(outcome.output, expected + malformed(0, 0, static_cast<u32>(length) - 4, -1));
     EXPECT_EQ(outcome.fields, fields_of(edid_t{}));
   }
 }
@@ -246,7 +233,7 @@ TEST(ExtensionBounds, AWrappedCollectionReportsItsLengthAsASignedNumber) {
     const exact_bytes_t exact(bytes);
     scoped_edid_t edid;
     EXPECT_EQ(output_of([&] { EXPECT_EQ(decode_edid_extensions(exact.data(), 128, edid.get()), 0); }),
-              malformed(124, collection));
+              malformed(0, 0, 124, collection));
   }
 }
 
@@ -255,7 +242,7 @@ TEST(ExtensionBounds, AWrappedCollectionStartsItsTimingsInsideTheHeader) {
   bytes[3] = 0x40;
   test_support::mend_checksum(bytes, 0);
   scoped_edid_t edid;
-  EXPECT_EQ(output_of([&] { EXPECT_EQ(decode_extension(bytes, edid.get()), 0); }), malformed(124, -4));
+  EXPECT_EQ(output_of([&] { EXPECT_EQ(decode_extension(bytes, edid.get()), 0); }), malformed(0, 0, 124, -4));
   const auto timings = elements_of<detailed_timing_t>(edid->dtd_list);
   // Slots at 0, 18, 36, ...: the first is 02 03 00 40, the second holds the reserved block as its bytes 8 and 9.
   ASSERT_EQ(timings.size(), 1u);
@@ -274,7 +261,7 @@ TEST(ExtensionBounds, AWrappedCollectionThatABlockRunsPastEndsAtTheNextHeader) {
   test_support::mend_checksum(bytes, 0);
   const outcome_t outcome = checked_outcome(bytes);
   EXPECT_EQ(outcome.result, 0);
-  EXPECT_EQ(test_support::count_of(outcome.output, malformed(128, -1)), 1);
+  EXPECT_EQ(test_support::count_of(outcome.output, malformed(0, 0, 128, -1)), 1);
 }
 
 TEST(ExtensionBounds, AWrappedCollectionOfThreeBlocksGoesOnToTheLastByte) {
@@ -285,7 +272,7 @@ TEST(ExtensionBounds, AWrappedCollectionOfThreeBlocksGoesOnToTheLastByte) {
   bytes[202] = 0x04;
   const outcome_t outcome = checked_outcome(bytes);
   EXPECT_EQ(outcome.result, 0);
-  EXPECT_EQ(test_support::count_of(outcome.output, malformed(252, -1)), 1);
+  EXPECT_EQ(test_support::count_of(outcome.output, malformed(0, 0, 252, -1)), 1);
   EXPECT_EQ(outcome.fields.at("video_list[0].vic"), "16");
   EXPECT_EQ(outcome.fields.at("video_list[1].vic"), "4");
 }

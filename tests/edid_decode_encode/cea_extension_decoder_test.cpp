@@ -1,32 +1,17 @@
 // The course of decoding an extension: header, flags, trailing timings, and the walk over the data blocks.
 #include <cstdio>
 
-#include "codec_fixture.h"
+#include "extension_lines.h"
 
 namespace codec_test {
 namespace {
 
+using extension_lines::error;
+using extension_lines::malformed;
+using extension_lines::trace;
 using test_support::data_block;
 using test_support::join;
 using test_support::video_block;
-
-constexpr const char *function = "decode_edid_extensions";
-
-std::string error(const std::string &message) {
-  return codec_error(function, message);
-}
-std::string trace(const std::string &message) {
-  return trace_line(function, message);
-}
-
-std::string malformed(u32 tag, u32 length, u32 index, i32 collection) {
-  return error(
-      "Malformed EDID: The CEA extension data block specifies a tag with a length whose total bytes exceeds the length "
-      "of "
-      "the CEA extension's data block. Tag:" +
-      std::to_string(tag) + " Len:" + std::to_string(length) + " Current Byte:" + std::to_string(index) +
-      " Data Block Len:" + std::to_string(collection));
-}
 
 std::string output_of_decoding(const bytes_t &extension, edid_t *edid, u8 result) {
   return output_of([&] { EXPECT_EQ(decode_extension(extension, edid), result); });

@@ -68,18 +68,78 @@ void print_hdmi(const edid_t &edid) {
   std::printf("],\n");
 }
 
+void print_array(const char *name, const u8 *bytes, u32 count) {
+  std::printf(",\n\"%s\":[", name);
+  for (u32 i = 0; i < count; ++i)
+    std::printf("%s%u", comma(i > 0), bytes[i]);
+  std::printf("]");
+}
+
+struct hdmi2_number_t {
+  const char *name;
+  u8 hdmi2_t::*member;
+};
+#define NUMBER(member) \
+  { #member, &hdmi2_t::member }
+constexpr hdmi2_number_t hdmi2_numbers[] = {
+    NUMBER(forum_present),
+    NUMBER(forum_version),
+    NUMBER(scdc),
+    NUMBER(read_request),
+    NUMBER(scramble_low),
+    NUMBER(frl_rate),
+    NUMBER(uhd_vic),
+    NUMBER(dc_48bit_420),
+    NUMBER(dc_36bit_420),
+    NUMBER(dc_30bit_420),
+    NUMBER(allm),
+    NUMBER(vrr_min),
+    NUMBER(ycc_quantization),
+    NUMBER(rgb_quantization),
+    NUMBER(preferred_scan),
+    NUMBER(it_scan),
+    NUMBER(ce_scan),
+    NUMBER(video_capability_present),
+    NUMBER(colorimetry),
+    NUMBER(gamut_metadata),
+    NUMBER(colorimetry_present),
+    NUMBER(hdr_static_present),
+    NUMBER(eotfs),
+    NUMBER(metadata_types),
+    NUMBER(y420_map_present),
+};
+#undef NUMBER
+
+void print_hdmi2_record(const hdmi2_t &hdmi2) {
+  std::printf("\"hdmi2\":{\"max_tmds_rate\":%u,\"vrr_max\":%u", hdmi2.max_tmds_rate, hdmi2.vrr_max);
+  for (const auto &[name, member] : hdmi2_numbers)
+    std::printf(",\n\"%s\":%u", name, hdmi2.*member);
+  print_array("svds", hdmi2.svds, hdmi2.svd_count);
+  print_array("y420_vics", hdmi2.y420_vics, hdmi2.y420_count);
+  print_array("map", hdmi2.y420_map, hdmi2.y420_map_bytes);
+  print_array("luminance", hdmi2.luminance, hdmi2.luminance_count);
+  print_array("hdr_dynamic", hdmi2.hdr_dynamic.payload, hdmi2.hdr_dynamic.length);
+  print_array("hdr10plus", hdmi2.hdr10plus.payload, hdmi2.hdr10plus.length);
+  print_array("dolby_vision", hdmi2.dolby_vision.payload, hdmi2.dolby_vision.length);
+  print_array("freesync", hdmi2.freesync.payload, hdmi2.freesync.length);
+  std::printf("},\n");
+}
+
 }  // namespace
 
 int main() {
   const std::vector<u8> bytes = standard_input();
   edid_t edid{};
   if (edid_prepare(&edid) == 0) return 1;
-  const bool decoded = decode(bytes, edid);
+  hdmi2_t hdmi2{};
+  hdmi2.size = sizeof hdmi2;
+  const bool decoded = decode(bytes, edid) && decode_hdmi2(bytes.data(), static_cast<u32>(bytes.size()), &hdmi2);
   if (decoded) {
     std::printf("{\n");
     print_modes(edid);
     print_audio(edid);
     print_hdmi(edid);
+    print_hdmi2_record(hdmi2);
     std::printf("\"xvycc601\":%u,\"xvycc709\":%u\n}\n", edid.xvycc601, edid.xvycc709);
   }
   return edid_destroy(&edid) != 0 && decoded ? 0 : 1;

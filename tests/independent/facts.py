@@ -5,6 +5,7 @@ import re
 import subprocess
 
 import edid_decode
+import hdmi2_facts
 
 NAMES = (
     "VICs",
@@ -19,6 +20,7 @@ NAMES = (
     "3D present",
     "HDMI VICs",
     "xvYCC",
+    *hdmi2_facts.NAMES,
 )
 STRUCTURES = {
     # Mask bit, and how edid-decode calls the structure: for many modes at once, and for a single one.
@@ -107,6 +109,7 @@ def by_library(reader, edid):
         "3D present": bool(read["3d_present"]),
         "HDMI VICs": read["hdmi_vics"],
         "xvYCC": [name for name in XVYCC if read[name.lower()]],
+        **hdmi2_facts.by_library(read["hdmi2"]),
     }
 
 
@@ -126,8 +129,9 @@ def _library_audio(audio):
 
 
 def by_edid_decode(edid):
+    tree = edid_decode.reading(edid)
     extension = edid_decode.Node("")
-    for block in edid_decode.reading(edid).all("Block 1, CTA-861"):
+    for block in tree.all("Block 1, CTA-861"):
         extension = block
     hdmi = edid_decode.Node("")
     for block in extension.all("Vendor-Specific Data Block (HDMI), OUI 00-0C-03:"):
@@ -148,6 +152,7 @@ def by_edid_decode(edid):
         "3D present": "3D present" in video.lines(),
         "HDMI VICs": [_vic(node.line) for node in video.below("HDMI VICs:")],
         "xvYCC": [node.line for node in extension.below("Colorimetry Data Block:") if node.line in XVYCC],
+        **hdmi2_facts.by_edid_decode(tree),
     }
 
 

@@ -2,6 +2,7 @@
 #include <array>
 #include <cstring>
 
+#include "linked_list/integrity.h"
 #include "linked_list/linked_list.h"
 #include "linked_list/list_fixture.h"
 #include "support/patterns.h"

@@ -55,6 +55,7 @@ struct situation_t {
   const platform_values_t *values;  ///< Null: the configuration tree.
   bool observed;
   bool traced;
+  const hdmi2_values_t *hdmi2 = nullptr;
 
   /// With the @p nth allocation failing; 0: none. Whatever comes of it, nothing is lost.
   run_t run(int nth, failing_t failing = failing_t::only_that_one) const {
@@ -68,7 +69,7 @@ struct situation_t {
       {
         const failing_allocation_t failure(nth, failing);
         composition.result = test_support::compose_observed(sink, std::span(memory).subspan(margin, 256), &settings,
-                                                            values, observed ? count : nullptr, &run.decisions);
+                                                            values, observed ? count : nullptr, &run.decisions, hdmi2);
         EXPECT_TRUE(nth == 0 || failure.happened());
       }
       composition.bytes.assign(memory.begin() + margin, memory.end() - margin);
@@ -150,6 +151,8 @@ const std::map<std::string, outcome_t> &outcomes() {
       {"linked_list:N:ll_copy_list() BUG: Failed creating entry for the destination list.\n" +
            of_composing("ERROR: Failed populating the new edid."),
        outcome_t::refused},
+      {error(of_composer + "change_record") + of_composing("ERROR: Failed adding HDMI 2 to the new edid."),
+       outcome_t::refused},
       // Of the explanation.
       {error(of_composer + "compose_edid_internal"), outcome_t::untold},
       // Of the log.
@@ -190,6 +193,8 @@ class FailingComposition : public testing::Test {
       sink.video.insert(sink.video.end(), i, 60);
       situations_.push_back({sink.build(), values_.get(), i % 2 == 0, false});
       situations_.push_back({sink.build(), values_.get(), false, true});
+      hdmi2_[i] = hdmi2_values(i % 12);
+      situations_.push_back({sink.build(), values_.get(), i % 2 == 0, i % 3 == 0, &hdmi2_[i]});
     }
   }
 
@@ -210,7 +215,20 @@ class FailingComposition : public testing::Test {
     EXPECT_EQ(situation.run(0).words, whole.words);
   }
 
+  /// With @p count modes that the box makes itself, the first of them the preferred one.
+  static hdmi2_values_t hdmi2_values(u32 count) {
+    hdmi2_values_t values{};
+    values.size = sizeof values;
+    hdmi2_values_init(&values);
+    values.enable = values.preferred_extended = 1;
+    values.tmds_limit = 600;
+    for (u32 i = 0; i < count; ++i)
+      values.vic_priority_list[i] = values.vic_addition_list[i] = static_cast<i32>(97 - i);
+    return values;
+  }
+
   test_support::scoped_values_t values_;
+  hdmi2_values_t hdmi2_[24]{};
   std::vector<situation_t> situations_;
   std::set<std::string> seen_;
 };
@@ -243,8 +261,9 @@ TEST_F(FailingComposition, SurvivesWithoutAnyMemoryFromAnyAllocationOn) {
 // Nothing configured, no sink: the first entry is that of basic audio.
 TEST(FailingPoorComposition, IsRefused) {
   const test_support::configuration_tree_t tree;
+  const situation_t situation{{}, nullptr, true, false};
   for (int nth = 1; nth <= 2; ++nth)
-    EXPECT_EQ(situation_t({}, nullptr, true, false).run(nth).words, refusal);
+    EXPECT_EQ(situation.run(nth).words, refusal);
 }
 
 }  // namespace

@@ -152,6 +152,31 @@ TEST_F(Threads, ReceiveTheLinesOfTheirOwnCompositions) {
   EXPECT_EQ(output, "");
 }
 
+TEST_F(Threads, ComposeWithHdmi2AtOnce) {
+  tree_.set("hdmi2.enable", 1);
+  tree_.set("hdmi2.tmds_limit", 600);
+  for (const i32 vic : {97, 96, 95}) {
+    tree_.add("hdmi2.vic_priority_list", vic);
+    tree_.add("hdmi2.vic_addition_list", vic);
+  }
+  const std::vector<job_t> all = jobs();
+  std::vector<bytes_t> expected;
+  for (const job_t &job : all) {
+    request_t request(job.sink, job.cfg, nullptr);
+    ASSERT_TRUE(request.compose());
+    EXPECT_NE(request.new_edid, compose(job.sink, job.cfg, nullptr).bytes);
+    expected.push_back(request.new_edid);
+  }
+  std::atomic<int> deviating{0};
+  run_on_threads([&](std::size_t i) {
+    request_t request(all[i].sink, all[i].cfg, nullptr);
+    for (int k = 0; k < compositions_of_each; ++k) {
+      if (!request.compose() || request.new_edid != expected[i]) ++deviating;
+    }
+  });
+  EXPECT_EQ(deviating.load(), 0);
+}
+
 TEST_F(Threads, DecodeAndPrintAtOnce) {
   const bytes_t sink = rich_sink().build();
   const std::string report = test_support::raw_output_of([&] { print_edid(sink.data(), 256, 1, "Sample"); });

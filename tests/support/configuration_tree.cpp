@@ -177,6 +177,18 @@ std::vector<config_call_t> configuration_tree_t::calls() const {
   return state_->calls;
 }
 
+int configuration_tree_t::forget_calls(const std::string &path) {
+  const std::lock_guard<std::recursive_mutex> lock(guard);
+  if (living_trees.empty()) return 0;
+  return static_cast<int>(
+      std::erase_if(living_trees.back()->calls, [&](const config_call_t &call) { return call.path == path; }));
+}
+
+bool configuration_tree_t::is_there() {
+  const std::lock_guard<std::recursive_mutex> lock(guard);
+  return !living_trees.empty();
+}
+
 void configuration_tree_t::fill_completely() {
   static const std::vector<std::pair<const char *, i32>> numbers{
       {"native_refresh_rate", 50},

@@ -68,6 +68,11 @@ class configuration_tree_t {
   /// Those calls, in order.
   std::vector<config_call_t> calls() const;
 
+  /// Forgets the calls for a path, and returns how many there were. Of the current tree; without one there are none.
+  static int forget_calls(const std::string &path);
+  /// Whether there is a current tree.
+  static bool is_there();
+
   struct state_t;
 
  private:

@@ -49,7 +49,7 @@ class ordered_workers_t {
     std::unique_lock lock(mutex_);
     std::optional<batch_result_t> &place = place_of(taken_);
     changed_.wait(lock, [&place] { return place.has_value(); });
-    batch_result_t result = *std::move(place);
+    batch_result_t result = std::move(*place);
     place.reset();
     ++taken_;
     lock.unlock();

@@ -19,6 +19,10 @@ bool is_option_name(const command_t &command, const std::string &text) {
   });
 }
 
+bad_input_t missing_before(const std::string &next, const std::string &name, const option_t &option) {
+  return bad_input_t(name + ": " + option.value_name + " is missing before " + next);
+}
+
 void add_option(CLI::App &app, const command_t &command, const option_t &option) {
   if (!option.take) {
     app.add_flag_callback(option.names, option.set, option.description);
@@ -28,7 +32,7 @@ void add_option(CLI::App &app, const command_t &command, const option_t &option)
   const CLI::callback_t take = [&command, long_name, &option](const CLI::results_t &texts) {
     for (const std::string &text : texts) {
       if (is_option_name(command, text)) {
-        throw bad_input_t(long_name + ": " + option.value_name + " is missing before " + text);
+        throw missing_before(text, long_name, option);
       }
       try {
         option.take(text);

@@ -99,8 +99,8 @@ class problem_finder_t {
     const std::string most = std::to_string(room.value[3]);
     if (room.reason == COMPOSE_REASON_NOT_ANNOUNCED) {
       add(problem_kind_t::not_announced, severity_t::error,
-          "without a name of 2 characters or more that begins with no blank, byte 126 stays 0: no source reads the "
-          "extension, so there is neither HDMI nor audio");
+          "without a name of 2 characters or more that does not begin with a blank, byte 126 stays 0: no source reads "
+          "the extension, so there is neither HDMI nor audio");
     }
     if (room.value[2] > room.value[3]) {
       const bool is_video = (composition_.new_edid[video_block_header] & block_length_mask) == 0;

@@ -12,7 +12,7 @@ namespace edid_cli {
 
 inline constexpr u32 edid_block_size = 128;
 /// The base block counts the blocks that follow it in one byte.
-inline constexpr std::size_t max_edid_size = 256 * edid_block_size;
+inline constexpr std::size_t max_edid_size = std::size_t{256} * edid_block_size;
 
 /// A file that could be read, but holds no EDID in any form.
 class not_an_edid_t : public bad_input_t {
@@ -20,8 +20,12 @@ class not_an_edid_t : public bad_input_t {
   using bad_input_t::bad_input_t;
 };
 
-/// The bytes of an EDID: one or more whole blocks. Their content is not looked at. Throws bad_input_t,
-/// or not_an_edid_t.
+/// The bytes of an EDID: one or more whole blocks. What they say is not looked at. Throws bad_input_t, which begins
+/// with
+/// @p name, or not_an_edid_t.
+std::vector<u8> edid_of(const std::string &content, const std::string &name);
+
+/// The same from a file.
 std::vector<u8> read_edid_file(const std::string &file);
 
 /// The same from a file, from standard input, or, where there is no file of that name, from the connector of that name.

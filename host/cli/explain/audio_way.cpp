@@ -122,7 +122,7 @@ std::optional<step_t> next_audio_step(const wanted_t &wanted, const trial_t &tri
   if (settings.audio_sink_filter == 1 && !has_no_room(wanted, trial) && trial.has_room()) {
     return step_t{.action = step_action_t::drop_option,
                   .key = option_sink_filter,
-                  .remark = "the sink does not have the format, or less of it"};
+                  .remark = "the sink does not have the format, or has less of it"};
   }
   const auto fewer_modes = trial.has_room() ? std::nullopt : step_that_makes_room(wanted, trial);
   return fewer_modes ? fewer_modes : step_that_drops_a_format(wanted, trial);

@@ -90,15 +90,15 @@ constexpr field_row_t timing_rows[] = {
 
 struct display_descriptor_t {
   unsigned tag;
-  const char *name;
   bool is_text;
+  const char *name;
 };
 
 constexpr unsigned range_limits_tag = 0xFD;
 constexpr display_descriptor_t display_descriptors[] = {
-    {0xFF, "Serial number text", true}, {0xFE, "Text", true},           {range_limits_tag, "Range limits", false},
-    {0xFC, "Monitor name", true},       {0xFB, "Colour points", false}, {0xFA, "Standard timings", false},
-    {0x10, "Dummy descriptor", false},
+    {0xFF, true, "Serial number text"}, {0xFE, true, "Text"},           {range_limits_tag, false, "Range limits"},
+    {0xFC, true, "Monitor name"},       {0xFB, false, "Colour points"}, {0xFA, false, "Standard timings"},
+    {0x10, false, "Dummy descriptor"},
 };
 
 constexpr field_row_t range_rows[] = {
@@ -124,7 +124,7 @@ std::string text_of(const byte_naming_t &naming) {
 
 void name_display_descriptor(byte_naming_t &naming, std::size_t end) {
   const unsigned tag = naming.next(3);
-  display_descriptor_t kind{tag, "Descriptor", false};
+  display_descriptor_t kind{tag, false, "Descriptor"};
   for (const display_descriptor_t &row : display_descriptors) {
     kind = row.tag == tag ? row : kind;
   }

@@ -2,7 +2,6 @@
 
 #include <string_view>
 
-#include "edid_text/alignment.h"
 #include "edid_text/edid_fields.h"
 #include "io/program_name.h"
 #include "io/standard_output.h"
@@ -77,6 +76,7 @@ std::vector<fact_t> platform_facts(const platform_check_t &check, const std::str
   return facts;
 }
 
+<<<<<<< HEAD
 std::vector<compared_t> comparison_of(const edid_records_t &sink, const edid_records_t &new_edid) {
   std::vector<compared_t> rows;
   for (const edid_field_t &field : edid_fields()) {
@@ -87,6 +87,8 @@ std::vector<compared_t> comparison_of(const edid_records_t &sink, const edid_rec
   return rows;
 }
 
+=======
+>>>>>>> main
 }  // namespace
 
 std::string line_text(const position_t &position) {

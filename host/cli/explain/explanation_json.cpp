@@ -84,7 +84,7 @@ json_t json_summary(const summary_t &summary) {
 }
 
 json_t json_compared(const compared_t &row) {
-  return {{"field", json_text(row.field)}, {"sink", json_text(row.sink)}, {"new_edid", json_text(row.new_edid)}};
+  return {{"field", json_text(row.field)}, {"sink", json_text(row.left)}, {"new_edid", json_text(row.right)}};
 }
 
 json_t json_key(const key_reading_t &key) {

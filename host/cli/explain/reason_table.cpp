@@ -174,7 +174,7 @@ constexpr reason_text_t rows[] = {
      sink_part_t::none,
      "The platform has no delay, and {missing}."},
     {COMPOSE_REASON_LATENCY_TOO_LONG,
-     "{0} ms of the platform and {1} ms of the sink: one of both is longer than 500 ms, so none is valid.",
+     "{0} ms of the platform and {1} ms of the sink: one of them is longer than 500 ms, so none is valid.",
      {},
      "--latency"},
     {COMPOSE_REASON_3D_ALWAYS, "The caller asks for it always.", {}, "--3d"},

@@ -80,10 +80,8 @@ std::vector<std::string> offered_audio(const std::vector<row_t> &rows) {
       *same = &row;
     }
   }
-  std::vector<std::string> names;
-  for (const row_t *const row : best) {
-    names.push_back(row->name);
-  }
+  std::vector<std::string> names(best.size());
+  std::transform(best.begin(), best.end(), names.begin(), [](const row_t *row) { return row->name; });
   return names;
 }
 

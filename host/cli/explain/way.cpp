@@ -23,7 +23,7 @@ std::optional<step_t> next_step(const wanted_t &wanted, const trial_t &trial, co
   if (!trial.composition.is_composed) {
     return step_that_drops_what_breaks(trial);
   }
-  if (const auto step = announcing_step(trial)) {
+  if (auto step = announcing_step(trial)) {
     return step;
   }
   switch (wanted.subject) {

@@ -116,7 +116,6 @@ void append_hdmi2_extension(std::vector<u8> &edid, std::span<const u32> vics) {
 
 std::vector<u8> made_sink(u32 family, std::span<const u32> vics, std::span<const u32> extended_vics) {
   std::vector<u8> edid;
-  edid.reserve(3 * edid_block_size);
   append(edid, base_block_begin);
   family == 50 ? append(edid, timing_50) : append(edid, timing_60);
   append(edid, dummy_descriptor);

@@ -29,7 +29,7 @@ std::string last_name(const std::string &key) {
 
 /// The key that a name is nearest to: as it stands, or by its last name in another table.
 std::optional<std::string> suggestion_for(const std::string &key, const std::vector<std::string> &known) {
-  if (const auto nearest = nearest_name(key, known)) {
+  if (auto nearest = nearest_name(key, known)) {
     return nearest;
   }
   std::vector<std::string> names;

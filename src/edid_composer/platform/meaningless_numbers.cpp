@@ -33,6 +33,7 @@ void settle_week(configuration_outcome_t *week) {
 }
 
 void settle_deep_color(configuration_outcome_t *deep_color) {
+  REPORTS_AS(settle_deep_color);
   constexpr i32 of_platform = 0;
   constexpr i32 as_sink = 2;
   if (deep_color->used == of_platform || deep_color->used == as_sink) return;

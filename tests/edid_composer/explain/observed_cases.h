@@ -22,6 +22,7 @@ inline void PrintTo(const case_t &named, std::ostream *out) {
 std::vector<case_t> video_cases();
 std::vector<case_t> audio_cases();
 std::vector<case_t> selection_cases();   ///< Refresh family, geometry, current mode, padding.
+std::vector<case_t> hdmi2_cases();       ///< What HDMI 2 adds.
 std::vector<case_t> capability_cases();  ///< Address, colours, clock, latencies, 3D, room.
 
 }  // namespace observed

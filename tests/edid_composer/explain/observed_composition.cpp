@@ -13,8 +13,9 @@ composition_t compose(const situation_t &situation, const platform_values_t *val
   composition_t composition;
   const bytes_t sink = situation.sink.build();
   composition.output = test_support::output_of([&] {
-    composition.result = test_support::compose_observed(sink, composition.bytes, &situation.settings, values, observer,
-                                                        &composition.decisions);
+    composition.result =
+        test_support::compose_observed(sink, composition.bytes, &situation.settings, values, observer,
+                                       &composition.decisions, situation.hdmi2 ? &*situation.hdmi2 : nullptr);
   });
   return composition;
 }
@@ -32,7 +33,8 @@ std::vector<std::string> words_where(const composition_t &composition, const con
 }  // namespace
 
 bytes_t sink_t::build() const {
-  const bool has_extension = !(more_timings.empty() && video.empty() && audio.empty() && hdmi.empty());
+  const bool has_extension =
+      !(more_timings.empty() && video.empty() && audio.empty() && hdmi.empty() && blocks.empty());
   if (!has_extension && timings.empty() && std_timings.empty()) return {};
   test_support::base_block_builder_t base;
   for (u32 i = 0; i < timings.size(); ++i)
@@ -45,6 +47,8 @@ bytes_t sink_t::build() const {
   if (!video.empty()) extension.block(test_support::video_block(video));
   if (!audio.empty()) extension.block(test_support::audio_block(audio));
   if (!hdmi.empty()) extension.block(test_support::hdmi_block(hdmi));
+  for (const auto &block : blocks)
+    extension.block(block);
   for (const auto &timing : more_timings)
     extension.timing(test_support::timing_descriptor(timing));
   return test_support::join(base.extensions(1).build(), extension.build());
@@ -54,6 +58,14 @@ situation_t::situation_t() : settings(test_support::plain_settings()) {
   platform.video_60_priority = modes({16, 4, 2, 1});
   platform.video_60_additional = modes({16, 4, 2, 1});
   platform.monitor_name = "Box";
+}
+
+hdmi2_values_t &enable_hdmi2(situation_t &situation) {
+  hdmi2_values_t values{};
+  values.size = sizeof values;
+  hdmi2_values_init(&values);
+  values.enable = 1;
+  return situation.hdmi2.emplace(values);
 }
 
 void keep(const compose_decision_t *decision, void *decisions) {

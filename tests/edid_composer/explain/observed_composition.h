@@ -2,6 +2,7 @@
 #pragma once
 
 #include <array>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -20,6 +21,7 @@ struct sink_t {
   bytes_t video;                                ///< Short video descriptors.
   bytes_t audio;                                ///< Short audio descriptors, three bytes each.
   bytes_t hdmi;                                 ///< The HDMI block's payload, from the physical address on.
+  std::vector<bytes_t> blocks;                  ///< Further data blocks.
 
   bytes_t build() const;
 };
@@ -30,7 +32,11 @@ struct situation_t {
   test_support::platform_configuration_t platform;
   sink_t sink;
   compose_cfg_t settings;
+  std::optional<hdmi2_values_t> hdmi2;
 };
+
+/// Turns HDMI 2 on, with the defaults of everything else.
+hdmi2_values_t &enable_hdmi2(situation_t &situation);
 
 /// An observed composition.
 struct composition_t {

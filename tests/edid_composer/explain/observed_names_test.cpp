@@ -42,7 +42,20 @@ TEST(ObservedNames, OfSubjects) {
                                         {11, "latency"},
                                         {12, "3D"},
                                         {13, "padding"},
-                                        {14, "extension room"}});
+                                        {14, "extension room"},
+                                        {15, "extended mode"},
+                                        {16, "link rate"},
+                                        {17, "HDR"},
+                                        {18, "colorimetry"},
+                                        {19, "YCbCr 4:2:0"},
+                                        {20, "deep colour in 4:2:0"},
+                                        {21, "ALLM"},
+                                        {22, "VRR"},
+                                        {23, "quantization range"},
+                                        {24, "passed-on block"},
+                                        {25, "UHD VIC"},
+                                        {26, "preferred timing"},
+                                        {27, "left out for room"}});
 }
 
 TEST(ObservedNames, OfVerdicts) {
@@ -109,6 +122,31 @@ TEST(ObservedNames, OfReasons) {
                                           {56, "the extension is full: what comes last is left out"},
                                           {57, "a data block is too long for its length field"},
                                           {58, "without a monitor name the extension is not announced"},
+                                          {59, "in 4:2:0 only, as it is too fast for the link otherwise"},
+                                          {60, "it is too fast for the link"},
+                                          {61, "the sink takes it in 4:2:0 only, in which it is not offered"},
+                                          {62, "the platform does not offer it"},
+                                          {63, "the platform does it itself"},
+                                          {64, "as the sink, which has it"},
+                                          {65, "as the sink, which does not have it"},
+                                          {66, "its range of refresh rates is not valid"},
+                                          {67, "the link carries more than the HDMI block tells"},
+                                          {68, "the offered modes above VIC 64 need it"},
+                                          {69, "cut to what the platform and the sink take"},
+                                          {70, "passed on from the sink"},
+                                          {71, "it announces a mode that is too fast for the link"},
+                                          {72, "the sink's range of refresh rates is not offered unchanged"},
+                                          {73, "the platform's receiver takes no more"},
+                                          {74, "the sink takes no more"},
+                                          {75, "modes that the platform makes itself need it"},
+                                          {76, "no offered mode may be sent in it"},
+                                          {77, "no mode in 4:2:0 leaves room for it on the link"},
+                                          {78, "HDMI requires 30 bit where 36 bit is offered"},
+                                          {79, "a 4Kx2K mode is offered by its HDMI_VIC and by its VIC"},
+                                          {80, "no 4Kx2K mode is offered by its HDMI_VIC and by its VIC"},
+                                          {81, "nothing else calls for the HDMI Forum block"},
+                                          {82, "the first mode above VIC 64 that a detailed timing can hold"},
+                                          {83, "no offered mode above VIC 64 fits a detailed timing"},
                                       });
 }
 

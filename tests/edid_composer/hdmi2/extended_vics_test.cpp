@@ -23,8 +23,8 @@ struct listed_t {
 /// What edid-decode printed for each of the VICs; independent.vics_are_as_listed has it print them anew.
 std::map<u32, listed_t> listed_timings() {
   std::map<u32, listed_t> timings;
-  const std::unique_ptr<std::FILE, int (*)(std::FILE *)> file(
-      std::fopen(TESTS_DIR "/independent/vic_timings.txt", "r"), std::fclose);
+  const std::unique_ptr<std::FILE, int (*)(std::FILE *)> file(std::fopen(TESTS_DIR "/independent/vic_timings.txt", "r"),
+                                                              std::fclose);
   if (file == nullptr) return timings;
   u32 vic = 0;
   listed_t row{};

@@ -6,6 +6,7 @@
 
 #include "edid_composer/composer_lines.h"
 #include "edid_composer/platform/platform_values_reader.h"
+#include "support/configuration_keys.h"
 #include "support/configuration_tree.h"
 #include "support/output_capture.h"
 #include "support/records.h"
@@ -124,35 +125,14 @@ TEST(ConfigurationLog, EveryPathIsAskedForOnceAndFromTheRoot) {
     ASSERT_EQ(call.path.substr(0, domain.size()), domain);
     paths.push_back(call.path.substr(domain.size()));
   }
-  std::vector<std::string> expected{"native_refresh_rate",
-                                    "current_mode_set_to_priority",
-                                    "audio.pass_through",
-                                    "underscan",
-                                    "is_tv",
-                                    "geometry_limit",
-                                    "dc_30bit",
-                                    "dc_36bit",
-                                    "tmds_override",
-                                    "supports_ai",
-                                    "speaker_entry",
-                                    "xvYCC601",
-                                    "xvYCC709",
-                                    "native_bit",
-                                    "product_id",
-                                    "serial",
-                                    "week",
-                                    "year",
-                                    "CNC0",
-                                    "CNC1",
-                                    "CNC2",
-                                    "CNC3"};
-  for (char letter = 'a'; letter <= 'z'; ++letter)
-    expected.push_back(std::string("audio.entry_") + letter);
-  for (const char *key :
-       {"50_hz_priority_list", "50_hz_addition_list", "60_hz_priority_list", "60_hz_addition_list",
-        "4k_x_2k_priority_list", "4k_x_2k_addition_list", "manufacturer_id", "monitor_name", "monitor_serial",
-        "established_timings_1", "established_timings_2", "manufacturer_timings", "standard_timings"}) {
-    expected.emplace_back(key);
+  std::vector<std::string> expected;
+  for (const configuration_key_t *key : test_support::configuration_keys()) {
+    if (key->kind == CONFIGURATION_AUDIO_FORMATS) {
+      for (char letter = 'a'; letter <= 'z'; ++letter)
+        expected.push_back(std::string("audio.entry_") + letter);
+    } else {
+      expected.emplace_back(key->name);
+    }
   }
   EXPECT_EQ(paths, expected);
 }

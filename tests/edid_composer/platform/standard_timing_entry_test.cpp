@@ -75,6 +75,11 @@ TEST_F(StandardTimingEntry, HoldsWidthHeightAndRate) {
   EXPECT_EQ(timings(), (timings_t{{1920, 3, 60}, {1280, 2, 75}, {1024, 1, 123}, {800, 0, 100}}));
 }
 
+TEST_F(StandardTimingEntry, IsReadToTheEndOfTheLongestText) {
+  EXPECT_EQ(read("00000000000000001280 1024 75"), "");
+  EXPECT_EQ(timings(), (timings_t{{1280, 2, 75}}));
+}
+
 TEST_F(StandardTimingEntry, FractionOfZeroIsWhole) {
   EXPECT_EQ(read("1280 960 60.00"), "");
   EXPECT_EQ(timings(), (timings_t{{1280, 1, 60}}));
@@ -160,7 +165,7 @@ TEST_F(StandardTimingEntry, IncrementedRateWraps) {
 }
 
 TEST_F(StandardTimingEntry, NumbersThatFillTheBufferLeaveNoneBehindIt) {
-  // The third number ends at the last byte, so the fraction would begin behind the buffer.
+  // The third number ends at the last byte, so the fraction would begin after the buffer.
   const edid_composer::configuration_entry_t entry{
       &key("standard_timings"), 0, edid_composer::entry_kind_t::text, "node", -1, "00000000008 0000000008 000061"};
   ASSERT_EQ(std::strlen(entry.text), sizeof entry.text - 1);

@@ -246,7 +246,7 @@ TEST_F(CheckPlatform, TextsThatAreCutAreTold) {
 
 TEST_F(CheckPlatform, ANameThatWouldHideTheExtensionIsAnError) {
   const std::string problem =
-      "without a name of 2 characters or more that begins with no blank, byte 126 stays 0: no source reads the "
+      "without a name of 2 characters or more that does not begin with a blank, byte 126 stays 0: no source reads the "
       "extension, so there is neither HDMI nor audio (without a sink and 2 more)";
   EXPECT_THAT(findings(complete_with("monitor_name = \"B\"")), Contains("2:1: error: monitor_name: " + problem));
   EXPECT_THAT(findings(complete_with("monitor_name = \" Box\"")),

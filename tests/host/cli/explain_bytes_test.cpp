@@ -113,6 +113,16 @@ TEST_F(ByteNames, OfTheHdmiBlock) {
   expect(182, byte_block_t::hdmi, "4Kx2K mode 1", "3840x2160p30 (4k:1)");
 }
 
+TEST_F(ByteNames, OfADataBlockOfNoKnownKind) {
+  edid_[132] &= 0x1F;
+  fields_ = name_bytes(edid_);
+  expect(132, byte_block_t::other, "Reserved data block", "3 bytes follow");
+  for (const std::size_t offset : {133U, 135U}) {
+    expect(offset, byte_block_t::other, "Not known", "not looked at");
+  }
+  expect(136, byte_block_t::video, "Video data block", "14 bytes follow");
+}
+
 TEST_F(ByteNames, AWrongChecksumIsToldAsWrong) {
   edid_[20] ^= 1;
   fields_ = name_bytes(edid_);

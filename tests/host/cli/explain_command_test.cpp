@@ -176,6 +176,9 @@ TEST_F(Explain, WritesThePageInsteadOfTheTables) {
   EXPECT_EQ(result.output, "");
   const std::string page = content_of(file);
   EXPECT_THAT(page, AllOf(StartsWith("<!DOCTYPE html>"), EndsWith("</html>\n"), Not(HasSubstr("{{"))));
+  // Of the platform's facts, the decisions, the bytes' fields and the configuration's keys.
+  EXPECT_THAT(page, AllOf(HasSubstr("Media Box"), HasSubstr("(VIC 16)"), HasSubstr("148.50 MHz"),
+                          HasSubstr("native_refresh_rate")));
   EXPECT_EQ(run_cli({"explain", "--html", "-"}).output, page);
   EXPECT_LT(page.size(), 150000U);
 }

@@ -17,7 +17,12 @@ namespace {
 
 class TemporaryFile : public testing::Test {
  protected:
-  TemporaryFile() { std::filesystem::create_directories(folder_); }
+  TemporaryFile() {
+    std::filesystem::create_directories(folder_);
+    // Whatever ran these tests, a shell in the background or nohup, may ignore them.
+    for (const int number : {SIGINT, SIGTERM, SIGHUP})
+      signal(number, SIG_DFL);
+  }
   ~TemporaryFile() override { std::filesystem::remove_all(folder_); }
 
   /// How a child that does this ended.

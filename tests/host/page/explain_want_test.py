@@ -343,10 +343,10 @@ class OwnWords(WantTest):
     def hdmi2_steps(self, wanted, sink, keys=""):
         """The steps as key and value, after checking that the program itself offers it once they are taken."""
         table = f"\n[platform.software.drivers.vorex.edid.hdmi2]\n{keys}" if keys else ""
-        _, (answer,) = self.ask(platform() + table, sinks.sample(sink), (), wanted)
+        _, (answer,) = self.ask(platform() + table, self.sample(sink).read_text(), (), wanted)
         self.assertFalse(answer["offered"])
         changed = platform() + self.changed_table(keys, answer["steps"])
-        status, (after,) = self.ask(changed, sinks.sample(sink), (), wanted)
+        status, (after,) = self.ask(changed, self.sample(sink).read_text(), (), wanted)
         self.assertEqual((status, after["offered"]), (0, True), changed)
         return [(step["key"].removeprefix("hdmi2."), step["value"]) for step in answer["steps"]]
 

@@ -33,6 +33,8 @@ void redirect(int descriptor, const std::string &file, int flags) {
     signal(SIGXFSZ, SIG_IGN);
     const rlimit limit{*process.file_size_limit, *process.file_size_limit};
     setrlimit(RLIMIT_FSIZE, &limit);
+    // Coverage counters that are cut off would make no sense.
+    setenv("GCOV_PREFIX", (std::filesystem::path(input).parent_path() / "cut_counters").c_str(), 1);
   }
   if (process.creation_mask) {
     umask(*process.creation_mask);
