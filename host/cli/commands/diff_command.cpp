@@ -46,7 +46,7 @@ class side_t {
 
   const std::string &name() const { return name_; }
   const std::vector<u8> &bytes() const { return bytes_; }
-  edid_records_t records() const { return {edid_.record(), edid_.hdmi2()}; }
+  edid_records_t records() const { return edid_.records(); }
 
  private:
   std::string name_;

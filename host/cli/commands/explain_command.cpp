@@ -83,13 +83,8 @@ int run(explain_options_t &options) {
   const std::vector<wanted_t> wanted = options.want ? parse_wanted(*options.want) : std::vector<wanted_t>{};
   load_platform(options.composition.platform_file);
   require_platform_settings(options.composition);
-<<<<<<< HEAD
-  const std::vector<u8> sink = read_sink(options.composition.sink, options.composition.drm_directory);
-  const platform_places_t places(platform_name(options.composition));
-=======
   const std::optional<std::string> &source = options.composition.sink;
   given_sink_t sink{source ? input_name(*source) : "", read_sink(source, options.composition.drm_directory)};
->>>>>>> main
   // What the library says goes to standard error: standard output is for the explanation.
   const observation_t observation(options.composition, std::move(sink), platform_name(options.composition),
                                   written_to(stderr));
@@ -97,14 +92,7 @@ int run(explain_options_t &options) {
     std::fprintf(stderr, "%s: the library refused to compose an EDID\n", program_name);
     return options.want ? bad_input_status : refused_status;
   }
-<<<<<<< HEAD
-  const std::string sink_name = options.composition.sink ? input_name(*options.composition.sink) : "";
-  const sink_record_t record(sink_of_stages(sink, composition));
-  const sink_reading_t reading = sink_reading(sink, composition);
-  const explained_t explained{composition, sink, record.get(), sink_name, reading, places, options.composition};
-=======
   const explained_t explained = observation.explained();
->>>>>>> main
   if (options.want) {
     return print_answers(options, wanted, explained);
   }

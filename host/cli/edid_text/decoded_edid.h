@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "edid_composer.h"
+#include "edid_text/edid_field.h"
 
 namespace edid_cli {
 
@@ -20,6 +21,7 @@ class decoded_edid_t {
   const edid_t &record() const { return record_; }
   /// What all of its extensions say of HDMI 2; nothing where the base block did not decode.
   const hdmi2_t &hdmi2() const { return hdmi2_; }
+  edid_records_t records() const { return {record_, hdmi2_}; }
 
  private:
   edid_t record_{};

@@ -76,19 +76,6 @@ std::vector<fact_t> platform_facts(const platform_check_t &check, const std::str
   return facts;
 }
 
-<<<<<<< HEAD
-std::vector<compared_t> comparison_of(const edid_records_t &sink, const edid_records_t &new_edid) {
-  std::vector<compared_t> rows;
-  for (const edid_field_t &field : edid_fields()) {
-    for (const aligned_row_t &row : align(field.values(sink), field.values(new_edid))) {
-      rows.push_back({std::string(field.name), row.left.value_or("-"), row.right.value_or("-")});
-    }
-  }
-  return rows;
-}
-
-=======
->>>>>>> main
 }  // namespace
 
 std::string line_text(const position_t &position) {
@@ -102,7 +89,6 @@ explanation_t explanation_of(const explained_t &explained) {
   const decoded_edid_t new_edid(std::vector<u8>(bytes.begin(), bytes.end()));
   const hdmi2_t sink_hdmi2 = decoded_hdmi2(explained.sink_bytes);
   const edid_records_t sink_records{explained.sink, sink_hdmi2};
-  const edid_records_t new_records{new_edid.record(), new_edid.hdmi2()};
 
   explanation_t explanation;
   explanation.title = title_of(explained);
@@ -123,8 +109,8 @@ explanation_t explanation_of(const explained_t &explained) {
   explanation.platform_check = check_platform(explained.options.settings, {});
   explanation.sink_facts = edid_facts(sink_records, explanation.sink_file);
   explanation.platform_facts = platform_facts(explanation.platform_check, explanation.platform);
-  explanation.new_edid_facts = edid_facts(new_records, "composed");
-  explanation.comparison = comparison_of(sink_records, new_records);
+  explanation.new_edid_facts = edid_facts(new_edid.records(), "composed");
+  explanation.comparison = comparison_of(sink_records, new_edid.records());
   explanation.new_edid = bytes;
   explanation.bytes = name_bytes(bytes);
   return explanation;

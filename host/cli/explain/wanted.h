@@ -15,15 +15,9 @@ struct wanted_t {
   u32 channels = 0;         ///< Of an audio format: the fewest; 0: any number.
 };
 
-<<<<<<< HEAD
 /// "16", "vic 95", "1080p60", "1920x1080p60", "4k30", "4k:1", "ac3", "pcm8", "audio:2", "3d", "deep-color", "hdr10",
 /// "vrr" and so on. More than one where modes differ in their aspect ratio only. Throws bad_input_t.
-std::vector<wanted_t> parse_wanted(std::string_view text);
-=======
-/// "16", "vic 95", "1080p60", "1920x1080p60", "4k30", "4k:1", "ac3", "pcm8", "audio:2", "3d", "deep-color". More than
-/// one where modes differ in their aspect ratio only. Throws bad_input_t.
 std::vector<wanted_t> parse_wanted(std::string_view original);
->>>>>>> main
 
 /// "1920x1080p60 16:9 (VIC 16)".
 std::string wanted_name(const wanted_t &wanted);
