@@ -178,7 +178,7 @@ std::string compare(const json_t &request, std::string_view) {
   const edid_cli::decoded_edid_t left(bytes_of("left"));
   const edid_cli::decoded_edid_t right(bytes_of("right"));
   json_t rows = json_t::array();
-  for (const edid_cli::compared_t &row : edid_cli::comparison_of(left.record(), right.record())) {
+  for (const edid_cli::compared_t &row : edid_cli::comparison_of(left.records(), right.records())) {
     rows.push_back({{"field", row.field}, {"left", valid_utf8(row.left)}, {"right", valid_utf8(row.right)}});
   }
   return document({{"rows", std::move(rows)}});

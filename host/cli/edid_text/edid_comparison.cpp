@@ -5,7 +5,7 @@
 
 namespace edid_cli {
 
-std::vector<compared_t> comparison_of(const edid_t &left, const edid_t &right) {
+std::vector<compared_t> comparison_of(const edid_records_t &left, const edid_records_t &right) {
   std::vector<compared_t> rows;
   for (const edid_field_t &field : edid_fields()) {
     for (const aligned_row_t &row : align(field.values(left), field.values(right))) {

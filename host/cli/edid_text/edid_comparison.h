@@ -4,7 +4,7 @@
 #include <string>
 #include <vector>
 
-#include "edid_composer.h"
+#include "edid_text/edid_field.h"
 
 namespace edid_cli {
 
@@ -16,6 +16,6 @@ struct compared_t {
 };
 
 /// The fields in the order of an EDID's bytes; of those with many values, a row for each.
-std::vector<compared_t> comparison_of(const edid_t &left, const edid_t &right);
+std::vector<compared_t> comparison_of(const edid_records_t &left, const edid_records_t &right);
 
 }  // namespace edid_cli

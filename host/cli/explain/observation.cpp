@@ -17,10 +17,10 @@ observation_t::observation_t(const composition_options_t &options, given_sink_t 
                              const line_listener_t &listener)
     : options_(options),
       sink_(std::move(sink)),
-      decoded_sink_(decoded(sink_.bytes)),
       places_(std::move(platform_name)),
       composition_(compose(options, options.ports.first, sink_.bytes, listener, decisions_t::kept)),
-      reading_(sink_reading(sink_.bytes, composition_.result)) {}
+      decoded_sink_(decoded(sink_of_stages(sink_.bytes, composition_))),
+      reading_(sink_reading(sink_.bytes, composition_)) {}
 
 explained_t observation_t::explained() const {
   static const edid_t no_sink{};

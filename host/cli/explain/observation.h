@@ -30,9 +30,9 @@ class observation_t {
  private:
   const composition_options_t &options_;
   given_sink_t sink_;
-  std::unique_ptr<decoded_edid_t> decoded_sink_;
   platform_places_t places_;
   composition_t composition_;
+  std::unique_ptr<decoded_edid_t> decoded_sink_;  ///< As far as the composition has read it.
   sink_reading_t reading_;
 };
 
