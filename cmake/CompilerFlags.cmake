@@ -21,7 +21,7 @@ add_library(edid_composer_library_flags INTERFACE)
 target_compile_options(
   edid_composer_library_flags INTERFACE -fno-exceptions -fno-rtti -fno-threadsafe-statics -fvisibility=hidden
                                         -fvisibility-inlines-hidden -fstack-protector-strong)
-# For a small library. Cold code stays behind the hot code of its function: a part of its own would cost each function a
+# For a small library. Cold code stays after the hot code of its function: a part of its own would cost each function a
 # second unwind entry. Calls within a file go where they say: what is exported is not for a host to replace. And nothing
 # here runs long enough for aligned code to pay.
 target_compile_options(

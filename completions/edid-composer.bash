@@ -42,7 +42,7 @@ _edid_composer_options() {
     diff) printf '%s\n' --only-changes --drm-dir ;;
     sinks) printf '%s\n' --drm-dir ;;
     check-platform) printf '%s\n' --sink --drm-dir --strict ;;
-    platform) printf '%s\n' --keys ;;
+    platform) printf '%s\n' --hdmi2 --keys ;;
     '') printf '%s\n' --version ;;
   esac
   printf '%s\n' --help -h

@@ -39,7 +39,7 @@ class fuzz_input_t {
     return characters;
   }
 
-  /// Bytes in a heap block of exactly their size, so that a sanitizer sees the first one read behind them.
+  /// Bytes in a heap block of exactly their size, so that a sanitizer sees the first read after them.
   struct block_t {
     std::unique_ptr<u8[]> bytes;
     u32 size;

@@ -1,4 +1,4 @@
-// Makes blocks pass the first checks of the decoders, so that a fuzzer's bytes get behind them.
+// Makes blocks pass the first checks of the decoders, so that a fuzzer's bytes get past them.
 #pragma once
 
 #include <cstddef>

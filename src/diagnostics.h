@@ -58,9 +58,9 @@ inline const char *true_or_false(bool value) {
 
 /// Declares `site`, in whose name the lines of the enclosing scope report. The build gives each module's folder its
 /// name.
-#define REPORTS_AS(operation)                                                     \
-  static constexpr ::edid_composer::site_t site {                                 \
-    EDID_COMPOSER_MODULE, ::edid_composer::operation_name(&operation, #operation) \
+#define REPORTS_AS(operation)                                                       \
+  static constexpr ::edid_composer::site_t site {                                   \
+    EDID_COMPOSER_MODULE, ::edid_composer::operation_name(&(operation), #operation) \
   }
 
 #define LOG_ERROR(...) ::edid_composer::log_error(site, __LINE__, __VA_ARGS__)

@@ -13,7 +13,7 @@ record_t *add(ll_list_t *list, const char *type) {
   return static_cast<record_t *>(payload);
 }
 
-/// Fills everything in front of, between and behind the four lists.
+/// Fills everything before, between and after the four lists.
 void fill_scalars(fuzz::fuzz_input_t *input, edid_t *edid) {
   auto *const begin = reinterpret_cast<u8 *>(edid);
   const auto fill = [&](const void *from, const void *to) {

@@ -32,7 +32,7 @@ int LLVMFuzzerTestOneInput(const u8 *data, std::size_t size) {
   const edid_cli::composition_t composition = edid_cli::compose(options, 0, sink, unheard, edid_cli::decisions_t::kept);
   if (!composition.is_composed) return 0;
   const edid_cli::decoded_edid_t decoded(sink.empty() ? std::vector<u8>(fuzz::block_size) : sink);
-  const edid_cli::sink_reading_t reading = edid_cli::sink_reading(sink, composition.result);
+  const edid_cli::sink_reading_t reading = edid_cli::sink_reading(sink, composition);
   const edid_cli::explained_t explained{composition, sink, decoded.record(), "fuzz.bin", reading, places, options};
   const edid_cli::explanation_t explanation = edid_cli::explanation_of(explained);
   FUZZ_REQUIRE(nlohmann::json::accept(edid_cli::explanation_json(explanation)));

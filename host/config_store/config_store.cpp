@@ -93,6 +93,10 @@ const char *config_store_default_text(void) {
   return default_platform_text;
 }
 
+const char *config_store_hdmi2_text(void) {
+  return hdmi2_platform_text;
+}
+
 const char *config_store_error(void) {
   return last_error().c_str();
 }

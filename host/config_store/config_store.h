@@ -63,6 +63,9 @@ EDID_CONFIG_STORE_API bool config_store_load_default(void);
  */
 EDID_CONFIG_STORE_API const char *config_store_default_text(void);
 
+/** The same with the table `hdmi2`, in which everything is as the sink has it, up to 600 MHz. */
+EDID_CONFIG_STORE_API const char *config_store_hdmi2_text(void);
+
 /**
  * What was wrong with the last load, as one line without a newline: `file:line:column: key: what is wrong`, without
  * the parts that do not apply. Empty when the last load succeeded.

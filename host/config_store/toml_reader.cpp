@@ -8,7 +8,7 @@
 
 // Errors come back as results: what is thrown by the parser would have to be caught at the C interface.
 #define TOML_EXCEPTIONS 0
-// The parser asserts what a malformed document can break ("[="), and reports it behind that as it should. The
+// The parser asserts what a malformed document can break ("[="), and reports it after that as it should. The
 // assertions would end the process, or with NDEBUG have the compiler assume that it cannot be: neither may be.
 #undef NDEBUG
 #define TOML_ASSERT(expression) static_assert(true)

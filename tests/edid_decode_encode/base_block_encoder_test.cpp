@@ -34,7 +34,7 @@ bytes_t base_block_up_to_descriptors() {
                  vic_4_descriptor});
 }
 
-// Completes a base block with extension count and checksum behind what there is, and zeros up to byte 127.
+// Completes a base block with extension count and checksum after what there is, and zeros up to byte 127.
 bytes_t completed(bytes_t block) {
   block.push_back(0x01);
   u32 sum = 0;

@@ -41,7 +41,7 @@ outcome_t outcome_of(const u8 *extension, u32 length) {
   return outcome;
 }
 
-// Decoding must not depend on what lies behind the bytes, and must be what it is with zeros there.
+// Decoding must not depend on what lies after the bytes, and must be what it is with zeros there.
 outcome_t outcome_without_reading_behind(const bytes_t &bytes) {
   const exact_bytes_t exact(bytes);
   outcome_t outcome = outcome_of(exact.data(), exact.size());
@@ -153,7 +153,7 @@ TEST(ExtensionBounds, HeadersBehindTheEndReadAsReservedBlocksUpToTheBound) {
       error("Malformed EDID: The CEA extension data block specifies a tag with a length whose total bytes exceeds "
             "the length of the CEA extension's data block. Tag:7 Len:31 Current Byte:0 Data Block Len:8"));
 
-  // Flags chosen so that byte 4 is 0: reserved, no payload, and so are the seven headers behind it.
+  // Flags chosen so that byte 4 is 0: reserved, no payload, and so are the seven headers after it.
   const bytes_t reserved = cut_to({0x02, 0x03, 12, 0xEF, 0x00}, 5);
   ASSERT_EQ(reserved[4], 0x00);
   std::string expected;

@@ -25,7 +25,7 @@ using test_support::scoped_edid_t;
 using test_support::trace_line;
 using test_support::traced_output_of;
 
-/// Bytes in a heap block of exactly their number: AddressSanitizer reports each byte read behind them, and the pointer
+/// Bytes in a heap block of exactly their number: AddressSanitizer reports each byte read after them, and the pointer
 /// isn't null when there are none.
 class exact_bytes_t {
  public:
@@ -75,7 +75,7 @@ inline bytes_t extension_of(const bytes_t &collection, u8 flags = 0, const bytes
   return extension;
 }
 
-/// The bytes of several parts, one behind the other.
+/// The bytes of several parts, one after the other.
 inline bytes_t all_of(const std::vector<bytes_t> &parts) {
   bytes_t bytes;
   for (const bytes_t &part : parts)

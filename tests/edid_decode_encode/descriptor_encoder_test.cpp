@@ -130,7 +130,7 @@ TEST(DetailedTimingEncoder, RefusesClocksBelowThatOfVga) {
 
 namespace {
 
-// The 18 bytes of a text descriptor and the one behind it, out of a block of 19 that was full of 0xA5.
+// The 18 bytes of a text descriptor and the one after it, out of a block of 19 that was full of 0xA5.
 bytes_t encoded_text(u8 tag, const std::string &text, bool result = true) {
   const exact_bytes_t block(bytes_t(19, 0xA5));
   EXPECT_EQ(

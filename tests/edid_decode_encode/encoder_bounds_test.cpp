@@ -6,7 +6,7 @@ namespace {
 
 constexpr std::size_t canaries = 64;
 
-// As encode(), with bytes before and behind the 256 that must stay as they are.
+// As encode(), with bytes before and after the 256 that must stay as they are.
 encoding_t encode_between_canaries(edid_t *edid) {
   platform_values_t values{};
   bytes_t block(canaries + 256 + canaries, 0xC3);
@@ -47,7 +47,7 @@ void add_video_part(edid_t *edid, u32 codes) {
     edid->hdmi_vic[i] = i + 1;
 }
 
-// The line that tells of @p needed bytes, which is the only one, or the one behind @p before.
+// The line that tells of @p needed bytes, which is the only one, or the one after @p before.
 void expect_overflow_line(const std::string &output, u32 needed, const std::string &before = "") {
   ASSERT_EQ(output.substr(0, before.size()), before);
   const std::string line = output.substr(before.size());

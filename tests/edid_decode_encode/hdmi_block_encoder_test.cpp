@@ -190,7 +190,7 @@ namespace {
 
 // The HDMI block of a record with these video entries and 3D, and what becomes of their masks.
 struct encoding_3d_t {
-  bytes_t entries;  // behind the length byte
+  bytes_t entries;  // after the length byte
   u8 length_byte;
   masks_t masks;
   std::string traces;

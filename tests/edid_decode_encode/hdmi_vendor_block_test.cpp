@@ -9,7 +9,7 @@ using test_support::hdmi_block;
 
 constexpr const char *function = "_decode_edid_vendor_block";
 
-// What an HDMI block with this payload behind its OUI changes in a prepared record.
+// What an HDMI block with this payload after its OUI changes in a prepared record.
 fields_t changes_by(const bytes_t &payload_behind_oui) {
   scoped_edid_t edid;
   EXPECT_EQ(output_of([&] { EXPECT_TRUE(decode_vendor_block(hdmi_block(payload_behind_oui), edid.get())); }), "");

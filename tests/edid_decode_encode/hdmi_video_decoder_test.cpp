@@ -89,7 +89,7 @@ TEST(HdmiVideoDecoder, DecodesTheLengthsOfBothParts) {
     for (const u32 structures : {0u, 1u, 2u, 4u, 8u, 16u, 31u}) {
       SCOPED_TRACE(std::to_string(vics) + " and " + std::to_string(structures));
       scoped_edid_t edid;
-      // The codes lie behind the block.
+      // The codes lie after the block.
       const bytes_t block =
           test_support::join(video_part({0x00, byte_of(vics << 5 | structures)}), {1, 2, 3, 4, 5, 6, 7});
       EXPECT_EQ(traced_output_of([&] { EXPECT_TRUE(decode_vendor_block(block, edid.get())); }),
@@ -270,7 +270,7 @@ TEST(Hdmi3dDecoder, ReportsEveryIndexOfABlockBeforeTheVideoBlock) {
 }
 
 TEST(Hdmi3dDecoder, IsBoundedByIts3dLengthAloneNotByTheBlock) {
-  // The block ends with its length byte; the entries are taken from the speaker block behind it.
+  // The block ends with its length byte; the entries are taken from the speaker block after it.
   scoped_edid_t edid;
   const bytes_t collection = all_of({test_support::video_block({4, 5, 16, 32, 34}), video_part({0x80, 0x03}),
                                      test_support::data_block(4, {0x06, 0x16, 0x00})});

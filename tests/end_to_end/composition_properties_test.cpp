@@ -144,7 +144,7 @@ TEST(Composition, OfADamagedSinkIsAlwaysAValidEdid) {
   const bytes_t good = television();
   for (int round = 0; round < 2000; ++round) {
     bytes_t sink = good;
-    // Damage behind the header, mended checksums: the decoders have to look at every field.
+    // Damage after the header, mended checksums: the decoders have to look at every field.
     for (auto count = random() % 8 + 1; count > 0; --count)
       sink[8 + random() % 248] = static_cast<u8>(random());
     sink.resize(round % 3 == 0 ? 128 : 256);

@@ -154,7 +154,7 @@ TEST_F(FullComposition, CannotBeDecodedAgainWhichTheTraceTells) {
 }
 
 TEST_F(FullComposition, WithoutItsExtrasFits) {
-  // Without 3D, 31 modes and 10 audio formats fill 4 + 32 + 31 + 14 + 4 bytes behind the header, and fit.
+  // Without 3D, 31 modes and 10 audio formats fill 4 + 32 + 31 + 14 + 4 bytes after the header, and fit.
   cfg_.hdmi_3d_mode = 0;
   tree_.remove("60_hz_priority_list");
   for (int vic = 1; vic <= 31; ++vic)

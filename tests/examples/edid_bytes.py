@@ -6,7 +6,7 @@ HDMI_OUI = bytes.fromhex("030C00")
 
 
 def from_hex_text(text):
-    """The bytes of a hex text; what stands behind a '#' is a comment."""
+    """The bytes of a hex text; what stands after a '#' is a comment."""
     return bytes.fromhex(" ".join(line.partition("#")[0] for line in text.splitlines()))
 
 

@@ -17,9 +17,17 @@ namespace golden {
 namespace {
 
 void load_platform(const std::string &name) {
+  const std::string_view hdmi2 = config_store_hdmi2_text();
   const bool loaded = name == "default" ? config_store_load_default()
+                      : name == "hdmi2" ? config_store_load_text(hdmi2.data(), hdmi2.size(), "hdmi2 platform")
                                         : config_store_load_file((platforms_directory() / (name + ".toml")).c_str());
   if (!loaded) throw std::runtime_error(config_store_error());
+}
+
+/// Whether the platform that is loaded composes with HDMI 2.
+bool has_hdmi2_table() {
+  u32 node = 0;
+  return config_node_find(0, "platform.software.drivers.vorex.edid.hdmi2", &node) == 0;
 }
 
 compose_cfg_t settings_of(const golden_case_t &golden_case, u8 *address_offset) {
@@ -41,6 +49,15 @@ std::vector<u8> sink_of(const golden_case_t &golden_case) {
 std::string report_of(const golden_case_t &golden_case, const std::vector<u8> &edid, bool brief) {
   return test_support::output_of(
       [&] { print_edid(edid.data(), static_cast<u32>(edid.size()), brief ? 1 : 0, golden_case.name().c_str()); });
+}
+
+/// The second report, of what HDMI 2 added; of a platform without it there is none.
+std::string hdmi2_report_of(const golden_case_t &golden_case, const std::vector<u8> &edid) {
+  if (!has_hdmi2_table()) return "";
+  return "\n" + test_support::output_of([&] {
+           const hdmi2_t hdmi2 = edid_cli::decoded_hdmi2(edid);
+           print_hdmi2(&hdmi2, (golden_case.name() + ": HDMI 2").c_str());
+         });
 }
 
 /// The bytes as the program names them, each field on a line of its own, or on several; the name stands on the first.
@@ -73,9 +90,9 @@ std::string explanation_of(const golden_case_t &golden_case) {
       options, golden_case.port, sink, [](const compose_log_line_t &) {}, edid_cli::decisions_t::kept);
   std::string text;
   test_support::output_of([&] {
-    const edid_cli::decoded_edid_t decoded(sink);
+    const edid_cli::decoded_edid_t decoded(edid_cli::sink_of_stages(sink, composition));
     const edid_cli::platform_places_t places(golden_case.platform);
-    const edid_cli::sink_reading_t reading = edid_cli::sink_reading(sink, composition.result);
+    const edid_cli::sink_reading_t reading = edid_cli::sink_reading(sink, composition);
     text = edid_cli::explanation_text(
         edid_cli::explanation_of({composition, sink, decoded.record(), golden_case.sink, reading, places, options}),
         edid_cli::table_width_t::wide);
@@ -132,7 +149,9 @@ u32 size_of(const std::vector<u8> &bytes) {
 composition_t composed(const golden_case_t &golden_case, bool tracing) {
   const composer_t composer = [](const std::vector<u8> &sink, std::vector<u8> *edid, const compose_cfg_t *settings,
                                  void *) {
-    return compose_edid(sink.data(), size_of(sink), edid->data(), size_of(*edid), settings);
+    // Only a request composes with HDMI 2.
+    return has_hdmi2_table() ? test_support::compose_observed(sink, *edid, settings, nullptr, nullptr, nullptr)
+                             : compose_edid(sink.data(), size_of(sink), edid->data(), size_of(*edid), settings);
   };
   return composed_by(composer, nullptr, golden_case, tracing);
 }
@@ -152,7 +171,8 @@ std::map<std::string, std::string> golden_texts(const golden_case_t &golden_case
   return {{golden_case.name() + ".hex", hex_of(golden_case, composition)},
           {golden_case.name() + ".brief.txt", report_of(golden_case, composition.edid, true)},
           {golden_case.name() + ".explain.txt", explanation_of(golden_case)},
-          {golden_case.name() + ".report.txt", report_of(golden_case, composition.edid, false)},
+          {golden_case.name() + ".report.txt",
+           report_of(golden_case, composition.edid, false) + hdmi2_report_of(golden_case, composition.edid)},
           {golden_case.name() + ".trace.txt", composition.log}};
 }
 

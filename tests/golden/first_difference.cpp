@@ -7,7 +7,7 @@
 namespace golden {
 namespace {
 
-/// The line that begins at @p start, its newline included; nothing behind the end.
+/// The line that begins at @p start, its newline included; nothing after the end.
 std::string line_at(const std::string &text, std::size_t start) {
   const std::size_t newline = text.find('\n', start);
   return text.substr(start, newline == std::string::npos ? newline : newline - start + 1);

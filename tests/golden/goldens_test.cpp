@@ -111,13 +111,25 @@ TEST(GoldenCases, BeginWithWhatTheyAreMadeFrom) {
   EXPECT_THROW(golden::case_of("# What the platform shows\n00 FF\n"), std::runtime_error);
 }
 
-TEST(GoldenCases, AreEverySampleSinkBehindEveryPlatform) {
+/// Names of files without their endings, by whether they hold a text.
+std::vector<std::string> stems_in(const std::filesystem::path &directory, const char *text, bool holds_it) {
+  std::vector<std::string> stems;
+  for (const std::string &name : names_in(directory)) {
+    const bool holds = golden::content_of(directory / name).find(text) != std::string::npos;
+    if (holds == holds_it) stems.push_back(std::filesystem::path(name).stem().string());
+  }
+  return stems;
+}
+
+TEST(GoldenCases, AreEverySampleSinkBehindEveryPlatformOfItsTime) {
   std::set<std::string> expected;
-  for (const std::string &sink : names_in(golden::sinks_directory())) {
-    expected.insert(std::filesystem::path(sink).stem().string() + ".default");
-    for (const std::string &platform : names_in(golden::platforms_directory()))
-      expected.insert(std::filesystem::path(sink).stem().string() + "." +
-                      std::filesystem::path(platform).stem().string());
+  for (const bool has_hdmi2 : {false, true}) {
+    auto platforms = stems_in(golden::platforms_directory(), ".hdmi2]", has_hdmi2);
+    platforms.emplace_back(has_hdmi2 ? "hdmi2" : "default");
+    for (const std::string &sink : stems_in(golden::sinks_directory(), "BT2020", has_hdmi2)) {
+      for (const std::string &platform : platforms)
+        expected.insert(sink + "." + platform);
+    }
   }
   std::set<std::string> names;
   for (const auto &golden_case : golden::golden_cases())

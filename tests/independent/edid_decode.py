@@ -55,7 +55,7 @@ class Node:
         return [grandchild for child in self.children if child.line == line for grandchild in child.children]
 
     def value(self, label):
-        """What stands behind "label: ", or None."""
+        """What stands after "label: ", or None."""
         for line in self.lines():
             if line.startswith(label + ":"):
                 return line[len(label) + 1 :].strip()

@@ -109,7 +109,7 @@ hdmi2_t random_canonical_record(random_source_t &random) {
   return record;
 }
 
-/// Data blocks in as few extensions as hold them, behind a base block.
+/// Data blocks in as few extensions as hold them, after a base block.
 bytes_t sink_of(const bytes_t &blocks) {
   std::vector<bytes_t> collections(1);
   for (std::size_t at = 0; at < blocks.size();) {

@@ -156,7 +156,7 @@ void expect_well_formed(const compose_decision_t &decision) {
   EXPECT_EQ(decision.position >= 0, has_place) << compose_subject_string(decision.subject) << ' ' << decision.code;
 }
 
-/// Not so when a data block is too long for its length field: what stands behind it is then read as something else.
+/// Not so when a data block is too long for its length field: what stands after it is then read as something else.
 bool reads_as_meant(const decisions_t &decisions) {
   const compose_decision_t room = about(COMPOSE_SUBJECT_EXTENSION_ROOM, decisions).at(0);
   const auto &[needed, there, longest, most] = room.value;

@@ -49,7 +49,7 @@ TEST(RandomComposition, AlwaysOffersBasicAudio) {
     const printed_composition_t composition = compose(situation);
     if (!composition.result) return;
     const composed_edid_t edid = taken_apart(composition.bytes, composition.spa_offset);
-    // What stands behind the tenth is left out, and may have been it.
+    // What stands after the tenth is left out, and may have been it.
     if (edid.audio.size() < 10) {
       EXPECT_TRUE(std::any_of(edid.audio.begin(), edid.audio.end(), is_basic_audio));
     }

@@ -9,7 +9,7 @@ namespace properties {
 u32 native_rate_of(const situation_t &situation);
 
 /// The modes of the platform's priority list that the sink or the platform's addition list has, in that order, with the
-/// 3D structures that both sides name; the current mode in front of them, VIC 1 behind them until there are four.
+/// 3D structures that both sides name; the current mode before them, VIC 1 after them until there are four.
 std::vector<test_support::mode_pair_t> modes_to_offer(const situation_t &situation);
 
 /// The 4Kx2K modes of the priority list that the sink or the addition list has.

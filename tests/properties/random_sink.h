@@ -23,7 +23,7 @@ struct random_sink_t {
 
 random_sink_t random_sink(random_source_t &random);
 
-/// Two blocks of anything behind a valid header, or a well-formed sink with some bytes changed; with right checksums
+/// Two blocks of anything after a valid header, or a well-formed sink with some bytes changed; with right checksums
 /// mostly. From none to four blocks.
 test_support::bytes_t random_bytes_of_a_sink(random_source_t &random);
 

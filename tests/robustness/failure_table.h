@@ -27,7 +27,7 @@ std::function<std::string(int, const std::string &)> lines(const std::string &be
 /// The same outcome for every entry.
 std::function<std::string(int)> always(const std::string &outcome);
 
-/// Works, releases everything again, and tells in words what it had left behind.
+/// Works, releases everything again, and returns in words what it had left behind.
 using operation_t = std::function<std::string()>;
 
 /// What a run of the operation prints, as it is to be compared.

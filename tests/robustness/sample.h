@@ -20,7 +20,7 @@ struct sample_sink_t {
   /// The HDMI vendor-specific data block, from the physical address on.
   test_support::bytes_t hdmi{0x10, 0x00, 0xB8, 45, 0x80, 11, 6};
 
-  /// Where decoding stops with a failure of the block; what comes behind is not decoded.
+  /// Where decoding stops with a failure of the block; what comes after is not decoded.
   enum class end_t { none, behind_std_timings, behind_base_timings, behind_video, behind_audio };
   end_t end = end_t::none;
 

@@ -25,7 +25,7 @@ composition_t compose(const bytes_t &sink, compose_cfg_t cfg, const platform_val
   bytes_t memory(margin + edid_size + margin, canary);
   bytes_t offset{canary, canary, canary};
   cfg.spa_offset = offset.data() + 1;
-  // As long as it claims, so that a sanitizer sees any read behind it.
+  // As long as it claims, so that a sanitizer sees any read after it.
   const bytes_t sink_before(sink);
   const bytes_t exact_sink(sink);
   const std::string cfg_before = image_of(cfg);

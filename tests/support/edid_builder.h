@@ -68,7 +68,7 @@ class extension_builder_t {
   std::vector<std::pair<u32, u8>> overrides_;
 };
 
-/// One behind the other.
+/// One after the other.
 bytes_t join(const bytes_t &a, const bytes_t &b);
 
 /// A copy of the VIC's timing.

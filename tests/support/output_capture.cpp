@@ -79,7 +79,7 @@ std::string raw_output_of(const std::function<void()> &action) {
 
 std::string masked(std::string text) {
   // Addresses have more digits than any 32-bit number that is printed in hexadecimal. Under valgrind they have six or
-  // seven, as no number has that stands behind a colon or an equals sign but for an audio format's "Val".
+  // seven, as no number has that stands after a colon or an equals sign but for an audio format's "Val".
   text =
       replaced(text, "(edid_composer|edid_decode_encode|utility|linked_list):[0-9]+:(\\w+\\(\\) (ERROR|WARNING|BUG): )",
                "$1:N:$2");

@@ -11,7 +11,7 @@ namespace test_support {
 /// "N" and pointers that are not "(nil)" by "PTR". Standard output is put back also when @p action throws. Calls nest.
 std::string output_of(const std::function<void()> &action);
 
-/// As output_of(), cut into lines without their newlines. Text behind the last newline is a line too.
+/// As output_of(), cut into lines without their newlines. Text after the last newline is a line too.
 std::vector<std::string> lines_of(const std::function<void()> &action);
 
 /// As output_of(), with tracing on during @p action; the switch is then put back to what it was.

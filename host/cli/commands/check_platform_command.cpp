@@ -14,8 +14,6 @@
 #include "edid_input/sink_folder.h"
 #include "io/bad_input.h"
 #include "io/input.h"
-#include "io/standard_output.h"
-#include "platform/platform_check.h"
 #include "platform/platform_file.h"
 #include "text/printable_text.h"
 #include "text/text_table.h"
@@ -93,16 +91,7 @@ int run(const check_options_t &options) {
   load_platform(options.file);
   std::vector<std::string> passed_over;
   const std::vector<named_sink_t> sinks = read_sinks(options, passed_over);
-  composition_options_t settings;
-  findings_t wrong_settings = take_platform_settings(settings);
-  platform_check_t check;
-  {
-    // The findings say it in other words.
-    const discarded_output_t unseen;
-    check = check_platform(settings.settings, sinks);
-  }
-  check.findings.insert(check.findings.end(), wrong_settings.begin(), wrong_settings.end());
-  sort_findings(check.findings);
+  const platform_check_t check = check_platform_with_settings(sinks);
 
   text_table_t table;
   table.add({"KEY", "VALUE", "DEFAULT", "LIMITS", "FROM"});

@@ -46,7 +46,7 @@ class side_t {
 
   const std::string &name() const { return name_; }
   const std::vector<u8> &bytes() const { return bytes_; }
-  const edid_t &record() const { return edid_.record(); }
+  edid_records_t records() const { return edid_.records(); }
 
  private:
   std::string name_;
@@ -58,7 +58,7 @@ class side_t {
 bool add_field(text_table_t &table, const edid_field_t &field, const side_t &left, const side_t &right,
                bool only_changes) {
   bool differs = false;
-  for (const aligned_row_t &row : align(field.values(left.record()), field.values(right.record()))) {
+  for (const aligned_row_t &row : align(field.values(left.records()), field.values(right.records()))) {
     const bool is_same = row.left == row.right;
     differs = differs || !is_same;
     if (!is_same || !only_changes) {

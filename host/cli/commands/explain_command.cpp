@@ -15,11 +15,11 @@
 #include "explain/explanation_json.h"
 #include "explain/explanation_page.h"
 #include "explain/explanation_text.h"
+#include "explain/observation.h"
 #include "io/atomic_file.h"
 #include "io/bad_input.h"
 #include "io/input.h"
 #include "io/program_name.h"
-#include "io/standard_output.h"
 #include "platform/platform_file.h"
 
 namespace edid_cli {
@@ -35,24 +35,6 @@ struct explain_options_t {
 
 constexpr int offered_status = 0;
 constexpr int not_offered_status = 1;
-
-/// The sink's record; an empty one where there is no sink.
-class sink_record_t {
- public:
-  explicit sink_record_t(const std::vector<u8> &bytes) {
-    // The composition decodes it as well, and prints what the library says of it.
-    const discarded_output_t unseen;
-    if (!bytes.empty()) {
-      decoded_ = std::make_unique<decoded_edid_t>(bytes);
-    }
-  }
-
-  const edid_t &get() const { return decoded_ ? decoded_->record() : none_; }
-
- private:
-  std::unique_ptr<decoded_edid_t> decoded_;
-  edid_t none_{};
-};
 
 std::string platform_name(const composition_options_t &options) {
   if (!options.platform_file) {
@@ -101,19 +83,16 @@ int run(explain_options_t &options) {
   const std::vector<wanted_t> wanted = options.want ? parse_wanted(*options.want) : std::vector<wanted_t>{};
   load_platform(options.composition.platform_file);
   require_platform_settings(options.composition);
-  const std::vector<u8> sink = read_sink(options.composition.sink, options.composition.drm_directory);
-  const sink_record_t record(sink);
-  const platform_places_t places(platform_name(options.composition));
+  const std::optional<std::string> &source = options.composition.sink;
+  given_sink_t sink{source ? input_name(*source) : "", read_sink(source, options.composition.drm_directory)};
   // What the library says goes to standard error: standard output is for the explanation.
-  const composition_t composition =
-      compose(options.composition, options.composition.ports.first, sink, written_to(stderr), decisions_t::kept);
-  if (!composition.is_composed) {
+  const observation_t observation(options.composition, std::move(sink), platform_name(options.composition),
+                                  written_to(stderr));
+  if (!observation.is_composed()) {
     std::fprintf(stderr, "%s: the library refused to compose an EDID\n", program_name);
     return options.want ? bad_input_status : refused_status;
   }
-  const std::string sink_name = options.composition.sink ? input_name(*options.composition.sink) : "";
-  const sink_reading_t reading = sink_reading(sink, composition.result);
-  const explained_t explained{composition, sink, record.get(), sink_name, reading, places, options.composition};
+  const explained_t explained = observation.explained();
   if (options.want) {
     return print_answers(options, wanted, explained);
   }

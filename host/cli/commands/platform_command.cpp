@@ -5,6 +5,7 @@
 
 #include "commands/exit_status.h"
 #include "config_store.h"
+#include "io/bad_input.h"
 #include "platform/platform_keys.h"
 #include "text/text_table.h"
 
@@ -23,12 +24,21 @@ std::string key_table() {
 }  // namespace
 
 command_t platform_command() {
-  const auto lists_keys = std::make_shared<bool>(false);
+  struct platform_options_t {
+    bool hdmi2 = false;
+    bool keys = false;
+  };
+  const auto target = std::make_shared<platform_options_t>();
   return {"platform",
           "Print the default platform configuration",
-          {flag("--keys", *lists_keys, "List the keys of a configuration instead: type, limits, default and meaning")},
-          [lists_keys] {
-            std::fputs(*lists_keys ? key_table().c_str() : config_store_default_text(), stdout);
+          {flag("--hdmi2", target->hdmi2, "With the table of HDMI 2: everything as the sink, up to 600 MHz"),
+           flag("--keys", target->keys, "List the keys of a configuration instead: type, limits, default and meaning")},
+          [target] {
+            if (target->hdmi2 && target->keys) {
+              throw bad_input_t("--hdmi2 and --keys don't go together: --keys lists all keys");
+            }
+            const char *const text = target->hdmi2 ? config_store_hdmi2_text() : config_store_default_text();
+            std::fputs(target->keys ? key_table().c_str() : text, stdout);
             return done_status;
           }};
 }

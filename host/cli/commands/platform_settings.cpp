@@ -6,6 +6,7 @@
 #include "commands/shared_options.h"
 #include "io/bad_input.h"
 #include "io/input.h"
+#include "io/standard_output.h"
 #include "platform/nearest_name.h"
 
 namespace edid_cli {
@@ -100,6 +101,17 @@ void require_platform_settings(composition_options_t &options) {
     throw bad_input_t(input_name(options.platform_file.value_or("")) + ":" + std::to_string(first.position.line) + ":" +
                       std::to_string(first.position.column) + ": " + first.key + ": " + first.text);
   }
+}
+
+platform_check_t check_platform_with_settings(std::span<const named_sink_t> sinks) {
+  // The findings say in other words what the library prints.
+  const discarded_output_t unseen;
+  composition_options_t options;
+  const findings_t wrong_settings = take_platform_settings(options);
+  platform_check_t check = check_platform(options.settings, sinks);
+  check.findings.insert(check.findings.end(), wrong_settings.begin(), wrong_settings.end());
+  sort_findings(check.findings);
+  return check;
 }
 
 }  // namespace edid_cli

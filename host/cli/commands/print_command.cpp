@@ -26,10 +26,16 @@ struct print_options_t {
   bool brief = false;
 };
 
+struct content_t {
+  bool is_complete;
+  bool has_hdmi2;
+};
+
 /// Printing has no result, so the same decoding is tried first, unseen.
-bool decodes(const std::vector<u8> &edid) {
+content_t content_of(const std::vector<u8> &edid) {
   const discarded_output_t unseen;
-  return decoded_edid_t(edid).is_complete();
+  const decoded_edid_t decoded(edid);
+  return {decoded.is_complete(), has_hdmi2(decoded.hdmi2())};
 }
 
 /// The name of a file without its folders.
@@ -39,9 +45,15 @@ std::string title_of(const std::string &file) {
 
 int run(const print_options_t &options) {
   const std::vector<u8> edid = read_edid(options.source, options.drm_directory);
-  const bool decoded = decodes(edid);
+  const content_t content = content_of(edid);
   const auto print = [&] {
-    print_edid(edid.data(), static_cast<u32>(edid.size()), options.brief ? 1 : 0, title_of(options.source).c_str());
+    const std::string title = title_of(options.source);
+    print_edid(edid.data(), static_cast<u32>(edid.size()), options.brief ? 1 : 0, title.c_str());
+    if (content.has_hdmi2 && !options.brief) {
+      std::fputs("\n", stdout);
+      const hdmi2_t hdmi2 = decoded_hdmi2(edid);
+      print_hdmi2(&hdmi2, (title + ": HDMI 2").c_str());
+    }
   };
   // The library prints a sink's texts as they are, and a terminal obeys what is among them.
   if (isatty(STDOUT_FILENO) == 1) {
@@ -49,7 +61,7 @@ int run(const print_options_t &options) {
   } else {
     print();
   }
-  if (!decoded) {
+  if (!content.is_complete) {
     flush_standard_output();
     std::fprintf(stderr, "%s: %s: the library refused to decode this EDID\n", program_name,
                  printable(input_name(options.source)).c_str());

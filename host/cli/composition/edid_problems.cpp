@@ -13,6 +13,17 @@ constexpr u32 fastest_tmds_clock = 340;
 constexpr std::size_t video_block_header = 136;
 constexpr u8 block_length_mask = 0x1F;
 
+/// What is left out of a composition with HDMI 2, by compose_room_item.
+std::string room_item_text(const compose_decision_t &decision) {
+  constexpr const char *items[] = {
+      "anything else",           "the sink's FreeSync block",     "the sink's HDR dynamic metadata",
+      "the sink's HDR10+ block", "the sink's Dolby Vision block", "3D structures beyond the mandatory ones",
+      "modes up to VIC 64: ",    "modes in 4:2:0 only: ",         "modes above VIC 64: ",
+      "the serial number text"};
+  const std::string text = items[decision.code < std::size(items) ? decision.code : 0];
+  return text + (text.ends_with(' ') ? std::to_string(decision.value[0]) + " left out" : "");
+}
+
 bool is_read(const compose_result_t &result) {
   return result.sink_status == COMPOSE_SINK_READ && result.sink_extension_status == COMPOSE_EXTENSION_READ;
 }
@@ -70,6 +81,10 @@ class problem_finder_t {
         break;
       case COMPOSE_SUBJECT_TMDS_CLOCK:
         look_at_tmds_clock(decision);
+        break;
+      case COMPOSE_SUBJECT_ROOM_ITEM:
+        add(problem_kind_t::left_out_for_room, severity_t::note,
+            "the extension has no room for " + room_item_text(decision));
         break;
       case COMPOSE_SUBJECT_DEEP_COLOR:
         look_at_deep_color(decision);

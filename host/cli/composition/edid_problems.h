@@ -28,6 +28,7 @@ enum class problem_kind_t {
   tmds_clock_above_sink,
   deep_color_not_in_sink,
   sink_unread,
+  left_out_for_room,
 };
 
 struct problem_t {

@@ -69,9 +69,7 @@ std::vector<u8> parse_edid(const std::string &content, const std::string &name) 
 
 }  // namespace
 
-std::vector<u8> read_edid_file(const std::string &file) {
-  const std::string content = read_input(file);
-  const std::string name = input_name(file);
+std::vector<u8> edid_of(const std::string &content, const std::string &name) {
   try {
     if (content.empty()) {
       throw bad_input_t(name + ": is empty");
@@ -84,6 +82,10 @@ std::vector<u8> read_edid_file(const std::string &file) {
     }
     throw not_an_edid_t(problem.what());
   }
+}
+
+std::vector<u8> read_edid_file(const std::string &file) {
+  return edid_of(read_input(file), input_name(file));
 }
 
 std::vector<u8> read_edid(const std::string &source, const std::string &drm_directory) {

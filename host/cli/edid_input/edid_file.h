@@ -20,8 +20,12 @@ class not_an_edid_t : public bad_input_t {
   using bad_input_t::bad_input_t;
 };
 
-/// The bytes of an EDID: one or more whole blocks. Their content is not looked at. Throws bad_input_t,
-/// or not_an_edid_t.
+/// The bytes of an EDID: one or more whole blocks. What they say is not looked at. Throws bad_input_t, which begins
+/// with
+/// @p name, or not_an_edid_t.
+std::vector<u8> edid_of(const std::string &content, const std::string &name);
+
+/// The same from a file.
 std::vector<u8> read_edid_file(const std::string &file);
 
 /// The same from a file, from standard input, or, where there is no file of that name, from the connector of that name.

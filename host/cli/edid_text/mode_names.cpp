@@ -82,6 +82,12 @@ u32 vic_of(const short_video_desc_t &descriptor) {
   return descriptor.native != 0 && find_cta_video_format(later) != nullptr ? later : descriptor.vic;
 }
 
+svd_t decoded_svd(u32 code) {
+  constexpr u32 vic_bits = 0x7F;
+  const bool has_native_bit = ((code - 1) & 0x40) == 0 || (code & vic_bits) == 0;
+  return has_native_bit ? svd_t{code & vic_bits, code > vic_bits} : svd_t{code, false};
+}
+
 u32 pixel_clock_of_vic(u32 vic) {
   const cta_video_format_t *const format = find_cta_video_format(vic);
   return format != nullptr ? format->pixel_clock_khz : 0;

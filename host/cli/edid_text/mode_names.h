@@ -33,6 +33,12 @@ std::optional<raster_t> raster_of_hdmi_vic(u32 hdmi_vic);
 /// The VIC that a short video descriptor means. The library reads 7 bits and a native bit; CTA-861-F made the bytes
 /// from 193 on VICs of their own.
 u32 vic_of(const short_video_desc_t &descriptor);
+/// A short video descriptor as it is stored (CTA-861, section 7.5.1).
+struct svd_t {
+  u32 vic;
+  bool native;
+};
+svd_t decoded_svd(u32 code);
 /// The pixel clock that a VIC above the library's needs, kHz; 0 for any other.
 u32 pixel_clock_of_vic(u32 vic);
 

@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "edid_text/mode_names.h"
+#include "explain/hdmi2_features.h"
 #include "explain/offer.h"
 #include "explain/reason_texts.h"
 #include "explain/way.h"
@@ -10,7 +11,6 @@
 namespace edid_cli {
 namespace {
 
-constexpr u32 hdmi_1_4_khz = 340'000;
 constexpr u32 hdmi_2_0_khz = 600'000;
 
 /// Why the library can't offer it, whatever the platform says; empty when it can.
@@ -19,29 +19,41 @@ std::string why_never(const wanted_t &wanted) {
   if (wanted.subject == COMPOSE_SUBJECT_DEEP_COLOR && wanted.code == never_offered_bits) {
     return "HDMI 1.4 has it, but no configuration of this library offers it.";
   }
-  if (wanted.subject != COMPOSE_SUBJECT_VIDEO_MODE || wanted.code <= last_library_vic) {
+  if (wanted.subject != COMPOSE_SUBJECT_EXTENDED_MODE) {
     return "";
   }
   const u32 clock = pixel_clock_of_vic(wanted.code);
-  const std::string needs = clock > hdmi_2_0_khz ? "HDMI 2.1" : "HDMI 2.0";
-  const std::string vic = "VIC " + std::to_string(wanted.code);
-  return clock > hdmi_1_4_khz
-             ? vic + " needs " + needs + ", and this library composes EDIDs of HDMI 1.4."
-             : "This library offers VICs 1 to 64 and the 4Kx2K modes of HDMI 1.4 only, and " + vic + " is neither.";
+  // In YCbCr 4:2:0 it takes half of its pixel clock.
+  return clock / 2 > hdmi_2_0_khz ? "VIC " + std::to_string(wanted.code) +
+                                        " needs a fixed rate link, as HDMI 2.1 has it, and this library "
+                                        "composes EDIDs for up to 600 MHz."
+                                  : "";
+}
+
+bool is_about(const compose_decision_t &decision, const wanted_t &wanted, const explained_t &explained) {
+  const bool has_one_only = wanted.subject == COMPOSE_SUBJECT_3D || wanted.subject == COMPOSE_SUBJECT_ALLM ||
+                            wanted.subject == COMPOSE_SUBJECT_VRR || wanted.subject == COMPOSE_SUBJECT_YCBCR_420;
+  // Without HDMI 2, a VIC above 64 of the sink is decided on as any other.
+  const bool is_same_kind =
+      decision.subject == static_cast<u32>(wanted.subject) ||
+      (wanted.subject == COMPOSE_SUBJECT_EXTENDED_MODE && decision.subject == COMPOSE_SUBJECT_VIDEO_MODE);
+  return is_same_kind && (has_one_only || sink_vic(decision, explained) == wanted.code);
 }
 
 std::vector<compose_decision_t> decisions_about(const wanted_t &wanted, const explained_t &explained) {
   std::vector<compose_decision_t> decisions;
   for (const compose_decision_t &decision : explained.composition.decisions) {
-    const bool is_same = wanted.subject == COMPOSE_SUBJECT_3D || sink_vic(decision, explained) == wanted.code;
-    if (decision.subject == static_cast<u32>(wanted.subject) && is_same) {
+    if (is_about(decision, wanted, explained)) {
       decisions.push_back(decision);
     }
   }
   return decisions;
 }
 
-std::string without_decision(const wanted_t &wanted) {
+std::string without_decision(const wanted_t &wanted, const explained_t &explained) {
+  if (is_of_hdmi2(wanted.subject) && !has_hdmi2(explained.composition)) {
+    return "The platform composes without HDMI 2: hdmi2.enable is not 1.";
+  }
   return wanted.subject == COMPOSE_SUBJECT_AUDIO_FORMAT ? "Neither the platform nor the sink has a format of this type."
                                                         : "Neither the sink nor any list of the platform names it.";
 }
@@ -65,7 +77,7 @@ std::vector<std::string> reasons_of(const wanted_t &wanted, bool is_offered, con
     }
   }
   if (reasons.empty()) {
-    reasons.push_back(without_decision(wanted));
+    reasons.push_back(without_decision(wanted, explained));
   }
   if (!is_offered && !is_told && !explained.is_extension_announced()) {
     reasons.push_back(
@@ -91,6 +103,18 @@ std::vector<steps_t> ways_to(const wanted_t &wanted, const trials_t &trials) {
   return ways;
 }
 
+/// What stands against it for good, as the end of a sentence.
+std::string why_no_way(const wanted_t &wanted) {
+  if (wanted.subject == COMPOSE_SUBJECT_PASSED_BLOCK) {
+    return ": such a block is only passed on from a sink, as it stands";
+  }
+  const u32 clock = wanted.subject == COMPOSE_SUBJECT_EXTENDED_MODE ? pixel_clock_of_vic(wanted.code) : 0;
+  return clock <= hdmi_2_0_khz ? ""
+                               : ": it needs " + std::to_string(clock / 1000) +
+                                     " MHz, or half of it where the sink takes it in YCbCr "
+                                     "4:2:0, and 600 MHz is the most that can be declared";
+}
+
 answer_t answer_to(const wanted_t &wanted, const trials_t &trials, const explained_t &explained) {
   answer_t answer;
   answer.name = wanted_name(wanted);
@@ -108,7 +132,7 @@ answer_t answer_to(const wanted_t &wanted, const trials_t &trials, const explain
   }
   answer.ways = ways_to(wanted, trials);
   if (answer.ways.empty()) {
-    answer.no_way = "No change was found that leads there.";
+    answer.no_way = "No change was found that leads there" + why_no_way(wanted) + ".";
   }
   return answer;
 }

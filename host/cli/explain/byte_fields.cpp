@@ -22,7 +22,12 @@ constexpr block_name_t block_names[byte_block_count] = {
     {"video", "Video data block"},
     {"audio", "Audio data block"},
     {"hdmi", "HDMI data block"},
+    {"forum", "HDMI Forum data block"},
+    {"capability", "Video capability data block"},
     {"colorimetry", "Colorimetry data block"},
+    {"hdr", "HDR data block"},
+    {"y420", "YCbCr 4:2:0 data block"},
+    {"freesync", "FreeSync data block"},
     {"other", "Other data block"},
     {"unused", "Unused"},
 };
@@ -35,6 +40,11 @@ const char *byte_block_title(byte_block_t block) {
 
 const char *byte_block_id(byte_block_t block) {
   return block_names[static_cast<std::size_t>(block)].id;
+}
+
+std::span<const u8> byte_naming_t::bytes(std::size_t begin, std::size_t end) const {
+  const std::size_t last = std::min(end, edid_.size());
+  return begin < last ? edid_.subspan(begin, last - begin) : std::span<const u8>();
 }
 
 void byte_naming_t::name(byte_block_t block, std::size_t size, const std::string &name, const std::string &meaning) {

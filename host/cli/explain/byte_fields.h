@@ -29,12 +29,14 @@ struct field_row_t {
 
 class byte_naming_t {
  public:
-  explicit byte_naming_t(std::span<const u8> edid) : edid_(edid) {}
+  explicit byte_naming_t(std::span<const u8> edid) : edid_(edid), end_(edid.size()) {}
 
   std::size_t position() const { return position_; }
   /// The byte that far after the position.
   unsigned next(std::size_t index = 0) const { return place(position_).here(index); }
   field_place_t place(std::size_t base) const { return {edid_, base, position_}; }
+  /// The bytes from @p begin to before @p end that are there.
+  std::span<const u8> bytes(std::size_t begin, std::size_t end) const;
 
   /// Names the next bytes, as many of them as there are before the end.
   void name(byte_block_t block, std::size_t size, const std::string &name, const std::string &meaning);
@@ -49,7 +51,7 @@ class byte_naming_t {
  private:
   std::span<const u8> edid_;
   std::size_t position_ = 0;
-  std::size_t end_ = 256;
+  std::size_t end_;
   std::vector<byte_field_t> fields_;
 };
 

@@ -12,8 +12,7 @@ namespace edid_cli {
 namespace {
 
 constexpr std::size_t block_size = 128;
-constexpr std::size_t extension_begin = block_size;
-constexpr std::size_t checksum_offset = extension_begin + block_size - 1;
+constexpr unsigned cta_tag = 2;
 
 constexpr field_bit_t flag_bits[] = {
     {0x80, "underscan"}, {0x40, "basic audio"}, {0x20, "YCbCr 4:4:4"}, {0x10, "YCbCr 4:2:2"}};
@@ -21,7 +20,7 @@ constexpr field_bit_t flag_bits[] = {
 constexpr field_row_t header_rows[] = {
     {1, "Extension tag",
      [](const field_place_t &place) -> std::string {
-       return place.here() == 2 ? "2: CEA-861" : std::to_string(place.here());
+       return place.here() == cta_tag ? "2: CEA-861" : std::to_string(place.here());
      }},
     {1, "Revision", [](const field_place_t &place) { return std::to_string(place.here()); }},
     {1, "Detailed timings begin",
@@ -36,25 +35,39 @@ constexpr field_row_t header_rows[] = {
 
 /// A descriptor begins with its clock, or with two zeros and a tag after them.
 bool is_descriptor_next(const byte_naming_t &naming) {
-  return naming.position() + descriptor_size <= checksum_offset &&
+  return naming.position() + descriptor_size <= naming.end() &&
          (naming.next(0) != 0 || naming.next(1) != 0 || naming.next(3) != 0);
 }
 
-void name_extension(byte_naming_t &naming) {
-  naming.set_end(checksum_offset);
-  const std::size_t timings = extension_begin + naming.next(2);
-  naming.name(byte_block_t::extension, header_rows, checksum_offset);
-  while (naming.position() < std::min(timings, checksum_offset)) {
+void name_cta_extension(byte_naming_t &naming) {
+  const std::size_t timings = naming.position() + naming.next(2);
+  naming.name(byte_block_t::extension, header_rows, naming.end());
+  while (naming.position() < std::min(timings, naming.end())) {
     name_data_block(naming);
   }
   while (is_descriptor_next(naming)) {
     name_descriptor(naming);
   }
-  if (naming.position() < checksum_offset) {
-    naming.name(byte_block_t::unused, checksum_offset - naming.position(), "Unused", "nothing is written here");
+  if (naming.position() < naming.end()) {
+    naming.name(byte_block_t::unused, naming.end() - naming.position(), "Unused", "nothing is written here");
   }
-  naming.set_end(checksum_offset + 1);
-  naming.name(byte_block_t::extension, 1, "Checksum", checksum_meaning(naming.place(extension_begin)));
+}
+
+void name_other_extension(byte_naming_t &naming) {
+  naming.name(byte_block_t::extension, 1, "Extension tag", hex_number(naming.next(), 2) + ": not CTA-861");
+  naming.name(byte_block_t::other, naming.end() - naming.position(), "Extension", "not looked at");
+}
+
+void name_extension(byte_naming_t &naming) {
+  const std::size_t begin = naming.position();
+  naming.set_end(begin + block_size - 1);
+  if (naming.next() == cta_tag) {
+    name_cta_extension(naming);
+  } else {
+    name_other_extension(naming);
+  }
+  naming.set_end(begin + block_size);
+  naming.name(byte_block_t::extension, 1, "Checksum", checksum_meaning(naming.place(begin)));
 }
 
 }  // namespace
@@ -62,7 +75,9 @@ void name_extension(byte_naming_t &naming) {
 std::vector<byte_field_t> name_bytes(std::span<const u8> edid) {
   byte_naming_t naming(edid);
   name_base_block(naming);
-  name_extension(naming);
+  while (naming.position() < edid.size()) {
+    name_extension(naming);
+  }
   return std::move(naming).take();
 }
 

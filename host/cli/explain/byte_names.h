@@ -1,4 +1,4 @@
-// What each byte of an EDID is: EDID 1.3, CEA-861, HDMI 1.4.
+// What each byte of an EDID is: EDID 1.3, CTA-861, HDMI.
 #pragma once
 
 #include <span>
@@ -20,7 +20,12 @@ enum class byte_block_t {
   video,
   audio,
   hdmi,
+  forum,
+  capability,
   colorimetry,
+  hdr,
+  y420,
+  freesync,
   other,
   unused
 };
@@ -40,7 +45,8 @@ struct byte_field_t {
   std::string meaning;
 };
 
-/// The fields of a base block and a CEA-861 extension, 256 bytes: each byte is in one field, in order.
+/// The fields of an EDID of any number of blocks: each byte is in one field, in order. Of extensions that are not
+/// CTA-861's only the tag and the checksum are looked at.
 std::vector<byte_field_t> name_bytes(std::span<const u8> edid);
 
 }  // namespace edid_cli

@@ -4,13 +4,12 @@
 
 #include "edid_text/mode_names.h"
 #include "edid_text/speaker_names.h"
+#include "explain/hdmi2_bytes.h"
 #include "explain/hdmi_bytes.h"
 
 namespace edid_cli {
 namespace {
 
-constexpr field_bit_t colorimetry_bits[] = {{0x01, "xvYCC601"}, {0x02, "xvYCC709"}};
-constexpr field_bit_t metadata_bits[] = {{0x01, "MD0"}, {0x02, "MD1"}, {0x04, "MD2"}, {0x08, "MD3"}};
 constexpr field_bit_t rate_bits[] = {{0x01, "32 kHz"}, {0x02, "44.1 kHz"},  {0x04, "48 kHz"}, {0x08, "88.2 kHz"},
                                      {0x10, "96 kHz"}, {0x20, "176.4 kHz"}, {0x40, "192 kHz"}};
 constexpr field_bit_t size_bits[] = {{0x01, "16 bits"}, {0x02, "20 bits"}, {0x04, "24 bits"}};
@@ -46,9 +45,9 @@ void name_audio(byte_naming_t &naming, std::size_t end) {
 
 void name_video(byte_naming_t &naming, std::size_t end) {
   for (int number = 1; naming.position() < end; ++number) {
-    const unsigned byte = naming.next();
+    const svd_t svd = decoded_svd(naming.next());
     naming.name(byte_block_t::video, 1, "Video descriptor " + std::to_string(number),
-                video_mode_name(byte & 0x7FU) + ((byte & 0x80U) != 0 ? ", native" : ""));
+                video_mode_name(svd.vic) + (svd.native ? ", native" : ""));
   }
 }
 
@@ -64,15 +63,6 @@ void name_speakers(byte_naming_t &naming, std::size_t) {
 void name_vendor(byte_naming_t &naming, std::size_t end) {
   if (naming.next(0) == 0x03 && naming.next(1) == 0x0C && naming.next(2) == 0x00) {
     name_hdmi_block(naming, end);
-  }
-}
-
-void name_extended(byte_naming_t &naming, std::size_t end) {
-  constexpr unsigned colorimetry = 5;
-  if (naming.position() < end && naming.next() == colorimetry) {
-    naming.name(byte_block_t::colorimetry, 1, "Extended tag", "5: colorimetry");
-    naming.name(byte_block_t::colorimetry, 1, "Colorimetry", set_bit_names(naming.next(), colorimetry_bits));
-    naming.name(byte_block_t::colorimetry, 1, "Gamut metadata profiles", set_bit_names(naming.next(), metadata_bits));
   }
 }
 
@@ -93,17 +83,22 @@ constexpr data_block_t data_blocks[8] = {
     {byte_block_t::speakers, "Speaker allocation", name_speakers},
     {byte_block_t::other, "VESA DTC", name_nothing},
     {byte_block_t::other, "Reserved", name_nothing},
-    {byte_block_t::colorimetry, "Extended", name_extended},
+    {byte_block_t::other, "Extended", name_nothing},
 };
+
+data_block_t kind_of(unsigned tag, std::span<const u8> payload) {
+  const known_block_t *const known = find_hdmi2_block(payload, tag);
+  return known != nullptr ? data_block_t{known->block, known->name, known->name_payload} : data_blocks[tag];
+}
 
 }  // namespace
 
 void name_data_block(byte_naming_t &naming) {
   const unsigned header = naming.next();
-  const data_block_t &kind = data_blocks[header >> 5];
-  const std::size_t length = header & 0x1FU;
+  const std::size_t begin = naming.position() + 1;
+  const std::size_t end = std::max(begin, std::min(begin + (header & 0x1FU), naming.end()));
+  const data_block_t kind = kind_of(header >> 5, naming.bytes(begin, end));
   naming.name(kind.block, 1, std::string(kind.name) + " data block", number_text(header & 0x1FU, "bytes follow"));
-  const std::size_t end = std::min(naming.position() + length, naming.end());
   kind.name_payload(naming, end);
   if (naming.position() < end) {
     naming.name(kind.block, end - naming.position(), "Not known", "not looked at");

@@ -7,6 +7,7 @@
 #include "edid_text/edid_value_texts.h"
 #include "edid_text/mode_names.h"
 #include "edid_text/physical_address_text.h"
+#include "explain/hdmi2_features.h"
 #include "explain/reason_texts.h"
 
 namespace edid_cli {
@@ -73,8 +74,40 @@ std::string unread_blocks(const sink_reading_t &reading) {
   return text;
 }
 
+constexpr const char *room_item_names[] = {"",
+                                           "FreeSync",
+                                           "HDR dynamic metadata",
+                                           "HDR10+",
+                                           "Dolby Vision",
+                                           "3D structures",
+                                           "modes up to VIC 64",
+                                           "modes in 4:2:0 only",
+                                           "modes above VIC 64",
+                                           "serial number text"};
+
+/// A feature, with the number where it has one.
+std::string feature_name(const compose_decision_t &decision, const hdmi2_feature_t &feature) {
+  const std::string name = feature.name;
+  const std::string code = std::to_string(decision.code);
+  switch (decision.subject) {
+    case COMPOSE_SUBJECT_LINK_RATE:
+      return name + " " + code + " MHz";
+    case COMPOSE_SUBJECT_YCBCR_420:
+      return name + ": " + code + (decision.code == 1 ? " mode" : " modes");
+    case COMPOSE_SUBJECT_VRR:
+      return name + (decision.code != 0 ? " from " + code + " Hz" : "");
+    case COMPOSE_SUBJECT_PREFERRED_TIMING:
+      return name + (decision.code != 0 ? ": " + short_mode_name(decision.code) : "");
+    default:
+      return name;
+  }
+}
+
 std::string derived_name(const compose_decision_t &decision) {
   const std::string code = std::to_string(decision.code);
+  if (const hdmi2_feature_t *const feature = find_hdmi2_feature(decision.subject, decision.code)) {
+    return feature_name(decision, *feature);
+  }
   switch (decision.subject) {
     case COMPOSE_SUBJECT_NATIVE_RATE:
       return "refresh family " + code + " Hz";
@@ -98,6 +131,9 @@ std::string derived_name(const compose_decision_t &decision) {
       return "padding: " + code + (decision.code == 1 ? " mode" : " modes");
     case COMPOSE_SUBJECT_EXTENSION_ROOM:
       return "extension: " + code + " bytes";
+    case COMPOSE_SUBJECT_ROOM_ITEM:
+      return std::string("room for ") +
+             (decision.code < std::size(room_item_names) ? room_item_names[decision.code] : code.c_str());
     default:
       return std::string(compose_subject_string(decision.subject)) + " " + code;
   }
@@ -112,6 +148,8 @@ bool is_of_unread_block(const compose_decision_t &decision, const sink_reading_t
 
 std::string decision_name(const compose_decision_t &decision, const explained_t &explained) {
   switch (decision.subject) {
+    case COMPOSE_SUBJECT_EXTENDED_MODE:
+      return video_mode_name(decision.code);
     case COMPOSE_SUBJECT_VIDEO_MODE:
       return video_mode_name(sink_vic(decision, explained));
     case COMPOSE_SUBJECT_SINK_TIMING:

@@ -28,6 +28,11 @@ struct explained_t {
 
 /// The refresh family whose lists a composition has used.
 u32 family_of(const composition_t &composition);
+/// The lists of the platform that a mode's subject hangs on.
+std::string priority_list_of(u32 subject, u32 family);
+std::string addition_list_of(u32 subject, u32 family);
+/// Whether a composition offers what HDMI 2 added.
+bool has_hdmi2(const composition_t &composition);
 /// Whether sources look at the extension at all.
 bool announces_extension(const composition_t &composition);
 

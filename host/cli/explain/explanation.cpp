@@ -2,7 +2,6 @@
 
 #include <string_view>
 
-#include "edid_text/alignment.h"
 #include "edid_text/edid_fields.h"
 #include "io/program_name.h"
 #include "io/standard_output.h"
@@ -49,7 +48,7 @@ std::string title_of(const explained_t &explained) {
   return "EDID of " + explained.places.name() + " for " + sink;
 }
 
-std::vector<fact_t> edid_facts(const edid_t &edid, const std::string &source) {
+std::vector<fact_t> edid_facts(const edid_records_t &edid, const std::string &source) {
   std::vector<fact_t> facts{{"from", {source}}};
   for (const told_field_t &told : told_fields) {
     for (const edid_field_t &field : edid_fields()) {
@@ -77,16 +76,6 @@ std::vector<fact_t> platform_facts(const platform_check_t &check, const std::str
   return facts;
 }
 
-std::vector<compared_t> comparison_of(const edid_t &sink, const edid_t &new_edid) {
-  std::vector<compared_t> rows;
-  for (const edid_field_t &field : edid_fields()) {
-    for (const aligned_row_t &row : align(field.values(sink), field.values(new_edid))) {
-      rows.push_back({std::string(field.name), row.left.value_or("-"), row.right.value_or("-")});
-    }
-  }
-  return rows;
-}
-
 }  // namespace
 
 std::string line_text(const position_t &position) {
@@ -98,6 +87,8 @@ explanation_t explanation_of(const explained_t &explained) {
   // What the library prints here it has printed before, or the document says it in other words.
   const discarded_output_t unseen;
   const decoded_edid_t new_edid(std::vector<u8>(bytes.begin(), bytes.end()));
+  const hdmi2_t sink_hdmi2 = decoded_hdmi2(explained.sink_bytes);
+  const edid_records_t sink_records{explained.sink, sink_hdmi2};
 
   explanation_t explanation;
   explanation.title = title_of(explained);
@@ -116,10 +107,10 @@ explanation_t explanation_of(const explained_t &explained) {
   explanation.summary = summary_of(explanation.rows, explained);
 
   explanation.platform_check = check_platform(explained.options.settings, {});
-  explanation.sink_facts = edid_facts(explained.sink, explanation.sink_file);
+  explanation.sink_facts = edid_facts(sink_records, explanation.sink_file);
   explanation.platform_facts = platform_facts(explanation.platform_check, explanation.platform);
-  explanation.new_edid_facts = edid_facts(new_edid.record(), "composed");
-  explanation.comparison = comparison_of(explained.sink, new_edid.record());
+  explanation.new_edid_facts = edid_facts(new_edid.records(), "composed");
+  explanation.comparison = comparison_of(sink_records, new_edid.records());
   explanation.new_edid = bytes;
   explanation.bytes = name_bytes(bytes);
   return explanation;

@@ -4,6 +4,7 @@
 #include <string>
 #include <vector>
 
+#include "edid_text/edid_comparison.h"
 #include "explain/byte_names.h"
 #include "explain/rows.h"
 #include "explain/summary.h"
@@ -15,13 +16,6 @@ namespace edid_cli {
 struct fact_t {
   std::string name;
   std::vector<std::string> values;
-};
-
-/// A field of both EDIDs; "-" where one hasn't it.
-struct compared_t {
-  std::string field;
-  std::string sink;
-  std::string new_edid;
 };
 
 struct explanation_t {
@@ -43,7 +37,7 @@ struct explanation_t {
   std::vector<fact_t> sink_facts;
   std::vector<fact_t> platform_facts;
   std::vector<fact_t> new_edid_facts;
-  std::vector<compared_t> comparison;
+  std::vector<compared_t> comparison;  ///< Of the sink, to the left, and the new EDID.
   platform_check_t platform_check;
   new_edid_t new_edid{};
   std::vector<byte_field_t> bytes;  ///< What each of the new EDID's bytes is.

@@ -76,6 +76,7 @@ json_t json_summary(const summary_t &summary) {
   return {{"status", json_text(summary.status)},
           {"preferred_video", json_text(summary.preferred_video)},
           {"best_video", json_text(summary.best_video)},
+          {"hdmi2", json_list(summary.hdmi2, json_text)},
           {"audio", json_list(summary.audio, json_text)},
           {"lost", json_list(summary.lost, json_text)},
           {"counts", json_list(summary.counts, json_count)},
@@ -83,7 +84,7 @@ json_t json_summary(const summary_t &summary) {
 }
 
 json_t json_compared(const compared_t &row) {
-  return {{"field", json_text(row.field)}, {"sink", json_text(row.sink)}, {"new_edid", json_text(row.new_edid)}};
+  return {{"field", json_text(row.field)}, {"sink", json_text(row.left)}, {"new_edid", json_text(row.right)}};
 }
 
 json_t json_key(const key_reading_t &key) {

@@ -47,7 +47,7 @@ std::string explanation_page(const explanation_t &explanation) {
       part_t{"sink", facts_html(explanation.sink_facts)},
       part_t{"platform", facts_html(explanation.platform_facts)},
       part_t{"new_edid", facts_html(explanation.new_edid_facts)},
-      part_t{"sections", section_options_html()},
+      part_t{"sections", section_options_html(explanation.rows)},
       part_t{"decisions", decisions_html(explanation.rows)},
       part_t{"legend", legend_html(fields)},
       part_t{"base_bytes", bytes_html(bytes, fields, 0)},

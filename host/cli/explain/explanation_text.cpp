@@ -43,6 +43,9 @@ std::string head_of(const explanation_t &explanation, std::size_t columns) {
   table.add({"platform:", explanation.platform});
   table.add({"status:", summary.status});
   table.add({"video:", video_text(summary)});
+  if (!summary.hdmi2.empty()) {
+    table.add({"hdmi 2:", first_of(summary.hdmi2, summary.hdmi2.size())});
+  }
   table.add({"audio:", none_if_empty(first_of(summary.audio, summary.audio.size()))});
   if (explanation.reading.is_given) {
     table.add({"lost:", none_if_empty(first_of(summary.lost, shown_losses))});
@@ -71,7 +74,7 @@ std::string section_table(const explanation_t &explanation, section_t section, t
     }
     table.add(std::move(cells));
   }
-  return table.empty() ? "none\n" : table.text(is_wide ? text_table_t::any_width : most_columns);
+  return table.text(is_wide ? text_table_t::any_width : most_columns);
 }
 
 std::string way_text(const steps_t &steps) {
@@ -101,7 +104,10 @@ std::string one_answer(const answer_t &answer) {
 std::string explanation_text(const explanation_t &explanation, table_width_t width) {
   std::string text = head_of(explanation, width == table_width_t::wide ? text_table_t::any_width : most_columns);
   for (const section_t section : sections) {
-    text += std::string("\n") + section_title(section) + "\n" + section_table(explanation, section, width);
+    const std::string rows = section_table(explanation, section, width);
+    if (!rows.empty() || is_always_there(section)) {
+      text += std::string("\n") + section_title(section) + "\n" + (rows.empty() ? "none\n" : rows);
+    }
   }
   return text;
 }

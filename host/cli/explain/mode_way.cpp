@@ -9,6 +9,7 @@ namespace edid_cli {
 namespace {
 
 constexpr std::size_t most_4k_entries = 7;
+constexpr std::size_t most_extended_entries = HDMI2_MOST_LISTED_VICS;
 
 /// The lists of one kind of mode, and how an entry of them is written.
 struct mode_lists_t {
@@ -22,6 +23,9 @@ mode_lists_t lists_of(const wanted_t &wanted, const trial_t &trial) {
   const std::string number = std::to_string(wanted.code);
   if (wanted.subject == COMPOSE_SUBJECT_4K_MODE) {
     return {platform_list::priority_4k, platform_list::addition_4k, number, most_4k_entries};
+  }
+  if (wanted.subject == COMPOSE_SUBJECT_EXTENDED_MODE) {
+    return {platform_list::priority_extended, platform_list::addition_extended, number, most_extended_entries};
   }
   return {platform_list::priority(trial.family()), platform_list::addition(trial.family()), quoted(number), 0};
 }
@@ -82,6 +86,9 @@ std::optional<step_t> step_that_makes_room(const wanted_t &wanted, const trial_t
 }
 
 std::optional<step_t> next_mode_step(const wanted_t &wanted, const trial_t &trial) {
+  if (wanted.subject == COMPOSE_SUBJECT_EXTENDED_MODE && !has_hdmi2(trial.composition)) {
+    return step_that_enables_hdmi2();
+  }
   const mode_lists_t lists = lists_of(wanted, trial);
   const compose_decision_t *const decision = trial.find(wanted.subject, wanted.code);
   if (decision == nullptr) {
@@ -91,6 +98,9 @@ std::optional<step_t> next_mode_step(const wanted_t &wanted, const trial_t &tria
     case COMPOSE_REASON_NOT_IN_PRIORITY_LIST:
     case COMPOSE_REASON_OTHER_REFRESH_FAMILY:
       return adding_step(lists.priority, lists, trial, "");
+    case COMPOSE_REASON_ABOVE_RATE:
+    case COMPOSE_REASON_SINK_HAS_IT_IN_420:
+      return next_rate_step(wanted, trial);
     case COMPOSE_REASON_NOT_AVAILABLE:
       return adding_step(lists.addition, lists, trial, "the platform must be able to take it without the sink");
     case COMPOSE_REASON_TALLER_THAN_SINK:

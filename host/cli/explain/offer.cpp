@@ -3,6 +3,8 @@
 #include <algorithm>
 
 #include "edid_text/decoded_edid.h"
+#include "edid_text/mode_names.h"
+#include "explain/hdmi2_features.h"
 #include "io/standard_output.h"
 
 namespace edid_cli {
@@ -48,6 +50,44 @@ u32 channels_of(const edid_t &edid, u32 type) {
   return most;
 }
 
+bool has_extended_mode(const hdmi2_t &hdmi2, u32 vic) {
+  const auto is_it = [vic](u8 code) { return decoded_svd(code).vic == vic; };
+  return std::any_of(hdmi2.svds, hdmi2.svds + hdmi2.svd_count, is_it) ||
+         std::any_of(hdmi2.y420_vics, hdmi2.y420_vics + hdmi2.y420_count, is_it);
+}
+
+bool has_passed_block(const hdmi2_t &hdmi2, u32 block) {
+  switch (block) {
+    case COMPOSE_ROOM_HDR10PLUS:
+      return hdmi2.hdr10plus.length != 0;
+    case COMPOSE_ROOM_DOLBY_VISION:
+      return hdmi2.dolby_vision.length != 0;
+    case COMPOSE_ROOM_FREESYNC:
+      return hdmi2.freesync.length != 0;
+    default:
+      return hdmi2.hdr_dynamic.length != 0;
+  }
+}
+
+bool has_feature(const hdmi2_t &hdmi2, const wanted_t &wanted) {
+  switch (wanted.subject) {
+    case COMPOSE_SUBJECT_EXTENDED_MODE:
+      return has_extended_mode(hdmi2, wanted.code);
+    case COMPOSE_SUBJECT_HDR:
+      return (hdmi2.eotfs & wanted.code) != 0;
+    case COMPOSE_SUBJECT_COLORIMETRY:
+      return (hdmi2.colorimetry & wanted.code) != 0;
+    case COMPOSE_SUBJECT_YCBCR_420:
+      return hdmi2.y420_count != 0 || hdmi2.y420_map_present != 0;
+    case COMPOSE_SUBJECT_ALLM:
+      return hdmi2.allm != 0;
+    case COMPOSE_SUBJECT_VRR:
+      return hdmi2.vrr_min != 0;
+    default:
+      return has_passed_block(hdmi2, wanted.code);
+  }
+}
+
 bool has_depth(const edid_t &edid, u32 bits) {
   return bits == 30 ? edid.dc_30bit != 0 : bits == 36 ? edid.dc_36bit != 0 : edid.dc_48bit != 0;
 }
@@ -58,6 +98,9 @@ bool is_offered(const wanted_t &wanted, const new_edid_t &new_edid) {
   const discarded_output_t unseen;
   const decoded_edid_t decoded(bytes_that_are_read(new_edid));
   const edid_t &edid = decoded.record();
+  if (is_of_hdmi2(wanted.subject)) {
+    return has_feature(decoded.hdmi2(), wanted);
+  }
   switch (wanted.subject) {
     case COMPOSE_SUBJECT_4K_MODE: {
       const auto *const end = edid.hdmi_vic + std::min<std::size_t>(edid.hdmi_vic_len, std::size(edid.hdmi_vic));

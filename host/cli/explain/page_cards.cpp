@@ -36,8 +36,8 @@ std::string facts_html(const std::vector<fact_t> &facts) {
 std::string comparison_html(const std::vector<compared_t> &rows) {
   std::string html;
   for (const compared_t &row : rows) {
-    html += "<tr><th scope=\"row\">" + html_text(row.field) + "</th>" + cell_html(row.sink, "Sink:") +
-            cell_html(row.new_edid, "New:") + "</tr>\n";
+    html += "<tr><th scope=\"row\">" + html_text(row.field) + "</th>" + cell_html(row.left, "Sink:") +
+            cell_html(row.right, "New:") + "</tr>\n";
   }
   return html;
 }

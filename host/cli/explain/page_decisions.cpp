@@ -14,7 +14,7 @@ const char *verdict_class(const row_t &row) {
     case COMPOSE_VERDICT_CHANGED:
       return "changed";
     default:
-      return row.section == section_t::derived ? "idle" : "out";
+      return is_of_values(row.section) ? "idle" : "out";
   }
 }
 
@@ -63,15 +63,21 @@ std::vector<std::string> reason_texts(const summary_t &summary) {
   return texts;
 }
 
+bool is_shown(section_t section, const std::vector<row_t> &rows) {
+  return is_always_there(section) ||
+         std::any_of(rows.begin(), rows.end(), [section](const row_t &row) { return row.section == section; });
+}
+
 }  // namespace
 
 std::string summary_html(const explanation_t &explanation) {
   const summary_t &summary = explanation.summary;
   // What was not read of the sink stands among the warnings.
   const bool is_told = !explanation.reading.gaps.empty();
-  std::string html = "<dl class=\"first\">" + (is_told ? "" : fact_html("Sink", {summary.status})) +
-                     fact_html("Best video", {summary.best_video}) +
-                     fact_html("Preferred video", {summary.preferred_video}) + fact_html("Audio", summary.audio);
+  std::string html =
+      "<dl class=\"first\">" + (is_told ? "" : fact_html("Sink", {summary.status})) +
+      fact_html("Best video", {summary.best_video}) + fact_html("Preferred video", {summary.preferred_video}) +
+      (summary.hdmi2.empty() ? "" : fact_html("HDMI 2", summary.hdmi2)) + fact_html("Audio", summary.audio);
   if (explanation.reading.is_given) {
     html += fact_html("Lost", first_ones(summary.lost));
   }
@@ -94,9 +100,12 @@ std::string warnings_html(const explanation_t &explanation) {
   return html;
 }
 
-std::string section_options_html() {
+std::string section_options_html(const std::vector<row_t> &rows) {
   std::string html;
   for (const section_t section : sections) {
+    if (!is_shown(section, rows)) {
+      continue;
+    }
     html += std::string("<option value=\"") + section_id(section) + "\">" + section_title(section) + "</option>";
   }
   return html;
@@ -105,6 +114,9 @@ std::string section_options_html() {
 std::string decisions_html(const std::vector<row_t> &rows) {
   std::string html;
   for (const section_t section : sections) {
+    if (!is_shown(section, rows)) {
+      continue;
+    }
     html += std::string("<tbody><tr><th colspan=\"4\" scope=\"rowgroup\">") + section_title(section) + "</th></tr>\n";
     for (const row_t &row : rows) {
       html += row.section == section ? row_html(row) : "";

@@ -27,17 +27,13 @@ draft_entry_t read_entry(const configuration_node_t &node, const std::string &ke
   return entry;
 }
 
-bool is_of_audio_table(const std::string &key) {
-  return key.starts_with(std::string(audio_table) + ".");
-}
-
 /// The key without its table, and its value.
 std::string assignment(const draft_entry_t &entry) {
   std::string values;
   for (const draft_value_t &value : entry.values) {
     values += (values.empty() ? "" : ", ") + value.text;
   }
-  const std::string key = is_of_audio_table(entry.key) ? entry.key.substr(entry.key.find('.') + 1) : entry.key;
+  const std::string key = entry.key.substr(entry.key.find('.') + 1);
   return quoted(key) + " = " + (entry.is_list ? "[" + values + "]" : values) + "\n";
 }
 
@@ -64,14 +60,16 @@ std::string quoted(const std::string &text) {
 
 platform_draft_t::platform_draft_t() {
   read_table(platform_domain, "");
-  read_table(platform_path(audio_table), std::string(audio_table) + ".");
+  for (const char *const table : inner_tables) {
+    read_table(platform_path(table), std::string(table) + ".");
+  }
 }
 
 void platform_draft_t::read_table(const std::string &path, const std::string &prefix) {
   const auto table = configuration_node_t::find(path);
   for (const configuration_node_t &node : table ? table->children() : std::vector<configuration_node_t>{}) {
     const std::string key = prefix + node.name();
-    if (key != audio_table || !node.is_branch()) {
+    if (!is_inner_table(key) || !node.is_branch()) {
       entries_.push_back(read_entry(node, key));
     }
   }
@@ -132,13 +130,20 @@ void platform_draft_t::replace_in_list(const std::string &key, const std::string
   }
 }
 
-std::string platform_draft_t::toml() const {
-  std::string keys = "[" + std::string(platform_domain) + "]\n";
-  std::string audio_keys = "[" + platform_path(audio_table) + "]\n";
+std::string platform_draft_t::keys_of(const std::string &table) const {
+  std::string keys;
   for (const draft_entry_t &entry : entries_) {
-    (is_of_audio_table(entry.key) ? audio_keys : keys) += assignment(entry);
+    keys += inner_table_of(entry.key) == table ? assignment(entry) : "";
   }
-  return keys + audio_keys;
+  return keys;
+}
+
+std::string platform_draft_t::toml() const {
+  std::string text = "[" + std::string(platform_domain) + "]\n" + keys_of("");
+  for (const char *const table : inner_tables) {
+    text += "[" + platform_path(table) + "]\n" + keys_of(table);
+  }
+  return text;
 }
 
 }  // namespace edid_cli

@@ -46,6 +46,7 @@ class platform_draft_t {
  private:
   draft_entry_t &at(const std::string &key);
   void read_table(const std::string &path, const std::string &prefix);
+  std::string keys_of(const std::string &table) const;
 
   std::vector<draft_entry_t> entries_;
 };

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <iterator>
 
+#include "explain/hdmi2_reason_table.h"
+
 namespace edid_cli {
 namespace {
 
@@ -205,9 +207,14 @@ constexpr reason_text_t unknown_row{0, nullptr};
 }  // namespace
 
 const reason_text_t &reason_text(u32 reason) {
-  const auto *const found =
-      std::find_if(std::begin(rows), std::end(rows), [reason](const auto &row) { return row.reason == reason; });
-  return found != std::end(rows) ? *found : unknown_row;
+  const auto is_it = [reason](const reason_text_t &row) { return row.reason == reason; };
+  const auto *const found = std::find_if(std::begin(rows), std::end(rows), is_it);
+  if (found != std::end(rows)) {
+    return *found;
+  }
+  const auto further = hdmi2_reason_texts();
+  const auto other = std::find_if(further.begin(), further.end(), is_it);
+  return other != further.end() ? *other : unknown_row;
 }
 
 }  // namespace edid_cli

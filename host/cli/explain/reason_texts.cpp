@@ -4,6 +4,7 @@
 
 #include "edid_text/mode_names.h"
 #include "edid_text/physical_address_text.h"
+#include "explain/hdmi2_features.h"
 #include "explain/reason_table.h"
 #include "text/hexadecimal.h"
 
@@ -52,13 +53,11 @@ std::string formatted(i32 value, char form) {
 }
 
 std::string priority_list(const compose_decision_t &decision, const explained_t &explained) {
-  return decision.subject == COMPOSE_SUBJECT_4K_MODE ? platform_list::priority_4k
-                                                     : platform_list::priority(explained.family());
+  return priority_list_of(decision.subject, explained.family());
 }
 
 std::string addition_list(const compose_decision_t &decision, const explained_t &explained) {
-  return decision.subject == COMPOSE_SUBJECT_4K_MODE ? platform_list::addition_4k
-                                                     : platform_list::addition(explained.family());
+  return addition_list_of(decision.subject, explained.family());
 }
 
 /// Who has a mode that the priority list doesn't name.
@@ -78,6 +77,10 @@ std::string missing_part(const compose_decision_t &, const explained_t &explaine
 
 /// Where a source finds none of its kind, it is the extension that it does not find.
 std::string why_no_room(const compose_decision_t &decision, const explained_t &explained) {
+  // Not of modes but of blocks: what takes the room is the rest of the extension.
+  if (decision.subject == COMPOSE_SUBJECT_PASSED_BLOCK || decision.subject == COMPOSE_SUBJECT_ROOM_ITEM) {
+    return "the extension has no room for it";
+  }
   return explained.is_extension_announced()
              ? "there is no room for it: a source finds " + std::to_string(decision.value[0]) + " of its kind"
              : "without a monitor name sources do not read the extension";
@@ -117,15 +120,49 @@ std::string unlisted(const compose_decision_t &decision, const explained_t &) {
   return decision.code != 0 ? "" : ", and it has no short video descriptor";
 }
 
+std::string key_of_feature(const compose_decision_t &decision, const explained_t &) {
+  const hdmi2_feature_t *const feature = find_hdmi2_feature(decision.subject, decision.code);
+  return feature != nullptr ? feature->key : "the platform";
+}
+
+std::string though_sink_has_it(const compose_decision_t &decision, const explained_t &) {
+  return decision.value[1] != 0 ? ", though the sink has it" : "";
+}
+
+/// Whose rate a mode is above.
+std::string link(const compose_decision_t &decision, const explained_t &explained) {
+  const compose_decision_t *const rate = find_decision(explained.composition, COMPOSE_SUBJECT_LINK_RATE);
+  const bool is_of_box = decision.value[2] != 0 || rate == nullptr || rate->value[0] <= rate->value[1];
+  return is_of_box ? "the box's receiver takes" : "the sink takes";
+}
+
+std::string vrr_range(const compose_decision_t &decision, const explained_t &) {
+  const i32(&value)[4] = decision.value;
+  return "refresh rates from " + std::to_string(value[0]) + " Hz " +
+         (value[1] == 0 ? "without a limit" : "to " + std::to_string(value[1]) + " Hz");
+}
+
 struct named_place_t {
   std::string_view name;
   std::string (*text)(const compose_decision_t &decision, const explained_t &explained);
 };
 
 constexpr named_place_t named_places[] = {
-    {"priority", priority_list}, {"addition", addition_list}, {"who", who_has_it},    {"other", other_family},
-    {"missing", missing_part},   {"no_room", why_no_room},    {"narrowed", narrowed}, {"rate1", rate},
-    {"raster0", raster},         {"declared", declared},      {"unlisted", unlisted},
+    {"priority", priority_list},
+    {"addition", addition_list},
+    {"who", who_has_it},
+    {"other", other_family},
+    {"missing", missing_part},
+    {"no_room", why_no_room},
+    {"narrowed", narrowed},
+    {"rate1", rate},
+    {"raster0", raster},
+    {"declared", declared},
+    {"unlisted", unlisted},
+    {"key", key_of_feature},
+    {"though", though_sink_has_it},
+    {"link", link},
+    {"vrr_range", vrr_range},
 };
 
 /// What a place in braces stands for.
@@ -148,7 +185,7 @@ std::string above_last_vic(const compose_decision_t &decision, const explained_t
       vic == decision.code ? "" : " It takes this one for VIC " + std::to_string(decision.code) + ".";
   const u32 hdmi_vic = hdmi_vic_of_vic(vic);
   const std::string other = hdmi_vic == 0 ? "" : " HDMI 1.4 has it as 4k:" + std::to_string(hdmi_vic) + ".";
-  return "The sink has it; this library offers VICs up to 64." + read_as + other;
+  return "The sink has it; VICs above 64 are offered with hdmi2.enable = 1 only." + read_as + other;
 }
 
 }  // namespace

@@ -6,14 +6,18 @@
 #include <limits>
 #include <tuple>
 
+#include "edid_text/mode_names.h"
 #include "explain/decision_names.h"
+#include "explain/hdmi2_features.h"
 #include "explain/reason_texts.h"
 
 namespace edid_cli {
 namespace {
 
-constexpr const char *section_titles[] = {"Video modes", "4Kx2K modes", "Audio formats", "Limits and derived values"};
-constexpr const char *section_ids[] = {"video", "4k", "audio", "derived"};
+constexpr const char *section_titles[] = {
+    "Video modes", "4Kx2K modes", "Modes above VIC 64", "Audio formats", "Limits and derived values", "HDMI 2"};
+constexpr const char *section_ids[] = {"video", "4k", "extended", "audio", "derived", "hdmi2"};
+
 section_t section_of(u32 subject) {
   switch (subject) {
     case COMPOSE_SUBJECT_VIDEO_MODE:
@@ -21,24 +25,43 @@ section_t section_of(u32 subject) {
       return section_t::video;
     case COMPOSE_SUBJECT_4K_MODE:
       return section_t::mode_4k;
+    case COMPOSE_SUBJECT_EXTENDED_MODE:
+      return section_t::extended;
     case COMPOSE_SUBJECT_AUDIO_FORMAT:
       return section_t::audio;
     default:
-      return section_t::derived;
+      return is_of_hdmi2(subject) ? section_t::hdmi2 : section_t::derived;
   }
 }
 
 auto order_of(const row_t &row) {
   constexpr i32 last = std::numeric_limits<i32>::max();
   const compose_decision_t &decision = row.decision;
-  const bool is_derived = row.section == section_t::derived;
+  const bool is_derived = is_of_values(row.section);
   const bool is_placed = row.is_offered() && decision.position >= 0;
   return std::tuple(row.section, is_derived ? decision.subject : 0U, !is_derived && !row.is_offered(),
                     is_placed ? decision.position : last, decision.subject, decision.code);
 }
 
 constexpr u32 sink_origins = COMPOSE_ORIGIN_DETAILED_TIMING | COMPOSE_ORIGIN_STANDARD_TIMING |
-                             COMPOSE_ORIGIN_SHORT_VIDEO | COMPOSE_ORIGIN_SINK_4K | COMPOSE_ORIGIN_SINK_AUDIO;
+                             COMPOSE_ORIGIN_SHORT_VIDEO | COMPOSE_ORIGIN_SINK_4K | COMPOSE_ORIGIN_SINK_AUDIO |
+                             COMPOSE_ORIGIN_SINK_420;
+
+/// Whether the sink has a feature that is left out, as the numbers behind its reason say.
+bool is_lost_feature(const compose_decision_t &decision) {
+  switch (decision.reason) {
+    case COMPOSE_REASON_OFF:
+      return decision.value[1] != 0;
+    case COMPOSE_REASON_NO_ROOM:
+      return decision.subject == COMPOSE_SUBJECT_PASSED_BLOCK;
+    case COMPOSE_REASON_VRR_RANGE_INVALID:
+    case COMPOSE_REASON_RATE_BELOW_BLOCK:
+    case COMPOSE_REASON_VRR_CHANGED:
+      return true;
+    default:
+      return false;
+  }
+}
 
 /// Whether a timing stands in an extension that is malformed.
 bool is_doubtful(const compose_decision_t &decision, const sink_reading_t &reading) {
@@ -46,6 +69,19 @@ bool is_doubtful(const compose_decision_t &decision, const sink_reading_t &readi
          (decision.origins & COMPOSE_ORIGIN_DETAILED_TIMING) != 0 &&
          reading.extension_status == COMPOSE_EXTENSION_MALFORMED && decision.sink_index >= 0 &&
          static_cast<std::size_t>(decision.sink_index) >= reading.base_timings;
+}
+
+/// The VIC above 64 under which a timing of the sink is offered; 0 for none.
+u32 offered_vic_of(const row_t &row, const composition_t &composition) {
+  if (row.decision.reason != COMPOSE_REASON_TIMING_WITHOUT_VIC) {
+    return 0;
+  }
+  const auto found = std::find_if(
+      composition.decisions.begin(), composition.decisions.end(), [&row](const compose_decision_t &decision) {
+        return decision.subject == COMPOSE_SUBJECT_EXTENDED_MODE && decision.verdict != COMPOSE_VERDICT_LEFT_OUT &&
+               short_mode_name(decision.code) == row.name;
+      });
+  return found != composition.decisions.end() ? found->code : 0;
 }
 
 row_t row_of(const compose_decision_t &decision, const explained_t &explained) {
@@ -57,6 +93,9 @@ row_t row_of(const compose_decision_t &decision, const explained_t &explained) {
   } else if (is_doubtful(decision, explained.reading)) {
     row.sentence = "It is in an extension that is malformed, and may not be a timing.";
     row.rests_on_unread = true;
+  } else if (const u32 vic = offered_vic_of(row, explained.composition)) {
+    row.sentence = "The sink has it; it is offered as VIC " + std::to_string(vic) + ".";
+    row.is_offered_otherwise = true;
   }
   return row;
 }
@@ -110,7 +149,7 @@ void merge_unread_blocks(std::vector<row_t> &rows, const sink_reading_t &reading
 }  // namespace
 
 bool row_t::is_of_sink() const {
-  return (decision.origins & sink_origins) != 0;
+  return (decision.origins & sink_origins) != 0 || (section == section_t::hdmi2 && is_lost_feature(decision));
 }
 
 std::vector<std::string> warnings_of(const std::vector<row_t> &rows) {
@@ -127,10 +166,18 @@ std::vector<std::string> warnings_of(const std::vector<row_t> &rows) {
 }
 
 const char *verdict_text(const row_t &row) {
-  if (row.section != section_t::derived || row.decision.verdict == COMPOSE_VERDICT_CHANGED) {
+  if (!is_of_values(row.section) || row.decision.verdict == COMPOSE_VERDICT_CHANGED) {
     return compose_verdict_string(row.decision.verdict);
   }
   return row.is_offered() ? "in force" : "not in force";
+}
+
+bool is_of_values(section_t section) {
+  return section == section_t::derived || section == section_t::hdmi2;
+}
+
+bool is_always_there(section_t section) {
+  return section != section_t::extended && section != section_t::hdmi2;
 }
 
 const char *section_title(section_t section) {

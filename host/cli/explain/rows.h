@@ -9,8 +9,13 @@
 
 namespace edid_cli {
 
-enum class section_t { video, mode_4k, audio, derived };
-inline constexpr section_t sections[] = {section_t::video, section_t::mode_4k, section_t::audio, section_t::derived};
+enum class section_t { video, mode_4k, extended, audio, derived, hdmi2 };
+inline constexpr section_t sections[] = {section_t::video, section_t::mode_4k, section_t::extended,
+                                         section_t::audio, section_t::derived, section_t::hdmi2};
+/// Whether a section's rows are limits and features rather than modes and formats.
+bool is_of_values(section_t section);
+/// Whether a section is there without rows too: those of HDMI 2 are not.
+bool is_always_there(section_t section);
 
 struct row_t {
   section_t section{};
@@ -19,6 +24,7 @@ struct row_t {
   std::string sentence;
   bool rests_on_unread = false;  ///< On a part of the sink's EDID that was not read.
   std::vector<source_t> sources;
+  bool is_offered_otherwise = false;  ///< Left out as what it is here, but offered under a VIC above 64.
   std::vector<row_t> merged{};  ///< Decisions that are told on this row, as of the sink's format like an offered one.
 
   bool is_offered() const { return decision.verdict != COMPOSE_VERDICT_LEFT_OUT; }

@@ -4,6 +4,7 @@
 #include <iterator>
 
 #include "edid_input/edid_file.h"
+#include "explain/explained.h"
 #include "text/hexadecimal.h"
 
 namespace edid_cli {
@@ -59,11 +60,45 @@ bool is_extension_read(const compose_result_t &result) {
          result.sink_extension_status == COMPOSE_EXTENSION_MALFORMED;
 }
 
-std::vector<sink_block_t> blocks_of(const sink_bytes_t &sink, const compose_result_t &result) {
+/// Whether HDMI 2 reads a block: a CTA-861 extension of revision 3 with a right checksum.
+bool is_read_by_hdmi2(const sink_bytes_t &sink, std::size_t number) {
+  constexpr unsigned revision = 3;
+  constexpr std::size_t most_timings_offset = edid_block_size - 1;
+  const std::size_t begin = number * edid_block_size;
+  unsigned sum = 0;
+  for (std::size_t offset = begin; offset < begin + edid_block_size; ++offset) {
+    sum += sink[offset];
+  }
+  return sink[begin] == cta_tag && sink[begin + 1] == revision && sink[begin + 2] <= most_timings_offset &&
+         sum % 256 == 0;
+}
+
+/// The numbers of the blocks after the base block that HDMI 2 reads.
+std::vector<std::size_t> blocks_of_hdmi2(const sink_bytes_t &sink) {
+  constexpr std::size_t most_extensions = 8;
+  constexpr std::size_t count_offset = 126;
+  std::vector<std::size_t> numbers;
+  for (std::size_t number = 1; number < sink.blocks() && number <= sink[count_offset]; ++number) {
+    if (numbers.size() < most_extensions && is_read_by_hdmi2(sink, number)) {
+      numbers.push_back(number);
+    }
+  }
+  return numbers;
+}
+
+std::vector<sink_block_t> blocks_of(const sink_bytes_t &sink, const composition_t &composition) {
+  const compose_result_t &result = composition.result;
+  const bool is_base_read = result.sink_status == COMPOSE_SINK_READ;
+  std::vector<std::size_t> read;
+  if (has_hdmi2(composition)) {
+    read = is_base_read ? blocks_of_hdmi2(sink) : read;
+  } else if (is_extension_read(result)) {
+    read = {1};
+  }
   std::vector<sink_block_t> blocks;
   for (std::size_t number = 0; number < sink.blocks(); ++number) {
     const bool is_base = number == 0;
-    const bool is_read = is_base ? result.sink_status == COMPOSE_SINK_READ : number == 1 && is_extension_read(result);
+    const bool is_read = is_base ? is_base_read : std::find(read.begin(), read.end(), number) != read.end();
     blocks.push_back({number, is_base ? "base block" : extension_kind(sink[number * edid_block_size]), is_read});
   }
   return blocks;
@@ -222,20 +257,37 @@ void add_gap(std::vector<std::string> &gaps, const std::string &gap) {
   }
 }
 
-/// A sentence for all blocks after the one extension that is read.
-std::string later_blocks_gap(const std::vector<sink_block_t> &blocks) {
+/// A sentence for all blocks after the first extension that are not read.
+std::string later_blocks_gap(const std::vector<sink_block_t> &blocks, bool with_hdmi2) {
   std::string names;
   for (const sink_block_t &block : blocks) {
-    if (block.number > 1) {
+    if (block.number > 1 && !block.is_read) {
       names += (names.empty() ? "block " : ", block ") + std::to_string(block.number) + " (" + block.kind + ")";
     }
   }
-  return names.empty() ? "" : "Not read of the sink: " + names + ". This library reads one extension.";
+  return names.empty() ? ""
+                       : "Not read of the sink: " + names +
+                             (with_hdmi2 ? ". This library reads CTA-861 extensions of revision 3."
+                                         : ". This library reads one extension.");
 }
 
 }  // namespace
 
-sink_reading_t sink_reading(const std::vector<u8> &sink, const compose_result_t &result) {
+std::vector<u8> sink_of_stages(const std::vector<u8> &sink, const composition_t &composition) {
+  const sink_bytes_t bytes(sink);
+  const std::vector<std::size_t> read = has_hdmi2(composition) ? blocks_of_hdmi2(bytes) : std::vector<std::size_t>{};
+  if (read.empty() || read.front() == 1) {
+    return sink;
+  }
+  std::vector<u8> stages(sink.begin(), sink.begin() + edid_block_size);
+  const auto begin = sink.begin() + static_cast<std::ptrdiff_t>(read.front() * edid_block_size);
+  stages.insert(stages.end(), begin, begin + edid_block_size);
+  return stages;
+}
+
+sink_reading_t sink_reading(const std::vector<u8> &original, const composition_t &composition) {
+  const std::vector<u8> sink = sink_of_stages(original, composition);
+  const compose_result_t &result = composition.result;
   sink_reading_t reading;
   reading.is_given = !sink.empty();
   reading.base_status = result.sink_status;
@@ -244,12 +296,12 @@ sink_reading_t sink_reading(const std::vector<u8> &sink, const compose_result_t 
     return reading;
   }
   const sink_bytes_t bytes(sink);
-  reading.blocks = blocks_of(bytes, result);
+  reading.blocks = blocks_of(sink_bytes_t(original), composition);
   reading.missing_part = missing_part(result);
   add_gap(reading.gaps, base_gap(bytes, result.sink_status));
   if (result.sink_status == COMPOSE_SINK_READ) {
     add_gap(reading.gaps, extension_gap(bytes, result));
-    add_gap(reading.gaps, later_blocks_gap(reading.blocks));
+    add_gap(reading.gaps, later_blocks_gap(reading.blocks, has_hdmi2(composition)));
   }
   reading.base_timings = timings_of_base_block(bytes);
   reading.detailed_timings = reading.base_timings;

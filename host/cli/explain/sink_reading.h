@@ -35,6 +35,10 @@ struct sink_reading_t {
   bool is_incomplete() const { return !missing_part.empty(); }
 };
 
-sink_reading_t sink_reading(const std::vector<u8> &sink, const compose_result_t &result);
+sink_reading_t sink_reading(const std::vector<u8> &sink, const composition_t &composition);
+
+/// The sink as the stages of a composition see it: with HDMI 2, its base block and the first extension that can be
+/// read.
+std::vector<u8> sink_of_stages(const std::vector<u8> &sink, const composition_t &composition);
 
 }  // namespace edid_cli

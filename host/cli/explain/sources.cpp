@@ -5,6 +5,7 @@
 #include "edid_text/mode_names.h"
 #include "edid_text/physical_address_text.h"
 #include "explain/decision_names.h"
+#include "explain/hdmi2_features.h"
 #include "explain/reason_table.h"
 #include "text/hexadecimal.h"
 
@@ -22,7 +23,7 @@ struct sink_origin_t {
 constexpr sink_origin_t sink_origins[] = {
     {COMPOSE_ORIGIN_DETAILED_TIMING, "detailed timing"},    {COMPOSE_ORIGIN_STANDARD_TIMING, "standard timing"},
     {COMPOSE_ORIGIN_SHORT_VIDEO, "short video descriptor"}, {COMPOSE_ORIGIN_SINK_4K, "HDMI VIC"},
-    {COMPOSE_ORIGIN_SINK_AUDIO, "short audio descriptor"},
+    {COMPOSE_ORIGIN_SINK_AUDIO, "short audio descriptor"},  {COMPOSE_ORIGIN_SINK_420, "mode in YCbCr 4:2:0 only"},
 };
 
 struct sink_part_name_t {
@@ -44,6 +45,9 @@ class gathering_t {
   std::vector<source_t> run() && {
     add_sink();
     add_lists();
+    if (const hdmi2_feature_t *const feature = find_hdmi2_feature(decision_.subject, decision_.code)) {
+      add_key(feature->key);
+    }
     add_reason(reason_text(decision_.reason));
     if (names(COMPOSE_ORIGIN_LIBRARY)) {
       sources_.push_back({source_kind_t::library, "the library"});
@@ -82,17 +86,16 @@ class gathering_t {
   }
 
   void add_lists() {
-    const bool is_4k = decision_.subject == COMPOSE_SUBJECT_4K_MODE;
     const u32 family = explained_.family();
     const u32 other = family == 60 ? 50 : 60;
     const bool is_of_other_family = decision_.reason == COMPOSE_REASON_OTHER_REFRESH_FAMILY;
     if (names(COMPOSE_ORIGIN_PRIORITY_LIST)) {
-      add_entry(is_4k ? platform_list::priority_4k : platform_list::priority(family), decision_.priority_index);
+      add_entry(priority_list_of(decision_.subject, family), decision_.priority_index);
     } else if (names(COMPOSE_ORIGIN_OTHER_PRIORITY_LIST) && is_of_other_family) {
       add_entry(platform_list::priority(other), decision_.priority_index);
     }
     if (names(COMPOSE_ORIGIN_ADDITION_LIST)) {
-      add_entry(is_4k ? platform_list::addition_4k : platform_list::addition(family), decision_.addition_index);
+      add_entry(addition_list_of(decision_.subject, family), decision_.addition_index);
     } else if (names(COMPOSE_ORIGIN_OTHER_ADDITION_LIST) && is_of_other_family) {
       add_entry(platform_list::addition(other), decision_.addition_index);
     }

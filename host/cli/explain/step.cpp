@@ -25,11 +25,13 @@ unsigned line_of(const step_t &step, const platform_draft_t &original) {
   return is_of_value && found != entry->values.rend() ? found->line : entry->line;
 }
 
-/// The line that a new audio format follows.
-unsigned last_audio_line(const platform_draft_t &original) {
+/// The line that a new key of an inner table follows.
+unsigned last_line_of(const std::string &table, const platform_draft_t &original) {
   unsigned line = 0;
   for (const draft_entry_t &entry : original.entries()) {
-    line = entry.key.starts_with(std::string(audio_table) + ".") ? std::max(line, entry.line) : line;
+    for (const draft_value_t &value : entry.values) {
+      line = inner_table_of(entry.key) == table ? std::max({line, entry.line, value.line}) : line;
+    }
   }
   return line;
 }
@@ -39,29 +41,36 @@ std::string place(unsigned line, const std::string &platform_name) {
 }
 
 std::string table_of(const std::string &key) {
-  return key.starts_with(std::string(audio_table) + ".") ? platform_path(audio_table) : std::string(platform_domain);
+  const std::string table = inner_table_of(key);
+  return table.empty() ? std::string(platform_domain) : platform_path(table);
 }
 
 std::string key_in_table(const std::string &key) {
   return table_of(key) == platform_domain ? key : key.substr(key.find('.') + 1);
 }
 
+/// With a key that is not there yet.
+std::string adding_text(const std::string &key, const std::string &value, const platform_draft_t &original,
+                        const std::string &where) {
+  const std::string table = inner_table_of(key);
+  const unsigned neighbour = table.empty() ? 0 : last_line_of(table, original);
+  return "add " + key_in_table(key) + " = " + value + " to the table " + table_of(key) + " of " + where +
+         (neighbour != 0 ? ", after line " + std::to_string(neighbour) : "");
+}
+
 std::string set_text(const step_t &step, const platform_draft_t &original, const std::string &where) {
   if (step.line != 0) {
     return "set " + step.key + " = " + step.value + " (" + where + ")";
   }
-  const unsigned neighbour = table_of(step.key) == platform_domain ? 0 : last_audio_line(original);
-  return "add " + key_in_table(step.key) + " = " + step.value + " to the table " + table_of(step.key) + " of " + where +
-         (neighbour != 0 ? ", after line " + std::to_string(neighbour) : "");
+  return adding_text(step.key, step.value, original, where);
 }
 
 std::string text_of(const step_t &step, const platform_draft_t &original, const std::string &platform_name) {
   const std::string where = place(step.line, platform_name);
   switch (step.action) {
     case step_action_t::add_to_list:
-      return step.line != 0
-                 ? "add " + step.value + " to " + step.key + " (" + where + ")"
-                 : "add " + step.key + " = [" + step.value + "] to the table " + platform_domain + " of " + where;
+      return step.line != 0 ? "add " + step.value + " to " + step.key + " (" + where + ")"
+                            : adding_text(step.key, "[" + step.value + "]", original, where);
     case step_action_t::take_out_of_list:
       return "take " + step.value + " out of " + step.key + " (" + where + ")";
     case step_action_t::replace_in_list:

@@ -13,7 +13,7 @@ namespace {
 constexpr std::size_t shown_reasons = 3;
 
 bool is_mode(const row_t &row) {
-  return row.section == section_t::video || row.section == section_t::mode_4k;
+  return row.section == section_t::video || row.section == section_t::mode_4k || row.section == section_t::extended;
 }
 
 /// Pixels a second; 0 for what is no mode.
@@ -22,6 +22,8 @@ std::uint64_t pixel_rate(const row_t &row, const explained_t &explained) {
   std::optional<raster_t> raster;
   if (row.decision.subject == COMPOSE_SUBJECT_VIDEO_MODE) {
     raster = raster_of_vic(sink_vic(row.decision, explained));
+  } else if (row.decision.subject == COMPOSE_SUBJECT_EXTENDED_MODE) {
+    raster = raster_of_vic(row.decision.code);
   } else if (row.decision.subject == COMPOSE_SUBJECT_4K_MODE) {
     raster = raster_of_hdmi_vic(row.decision.code);
   } else if (row.decision.subject == COMPOSE_SUBJECT_SINK_TIMING) {
@@ -53,6 +55,16 @@ std::string best_video(const std::vector<row_t> &rows, const explained_t &explai
   return best != modes.end() ? best->name : "";
 }
 
+std::vector<std::string> offered_features(const std::vector<row_t> &rows) {
+  std::vector<std::string> names;
+  for (const row_t &row : rows) {
+    if (row.section == section_t::hdmi2 && row.is_offered()) {
+      names.push_back(row.name);
+    }
+  }
+  return names;
+}
+
 /// A format's name is its type and channels: "PCM, 8 channels".
 std::vector<std::string> offered_audio(const std::vector<row_t> &rows) {
   std::vector<const row_t *> best;
@@ -68,16 +80,15 @@ std::vector<std::string> offered_audio(const std::vector<row_t> &rows) {
       *same = &row;
     }
   }
-  std::vector<std::string> names;
-  for (const row_t *const row : best) {
-    names.push_back(row->name);
-  }
+  std::vector<std::string> names(best.size());
+  std::transform(best.begin(), best.end(), names.begin(), [](const row_t *row) { return row->name; });
   return names;
 }
 
 /// Whether a mode that is left out as a VIC is offered as the 4Kx2K mode that it is in HDMI 1.4.
 bool is_offered_as_4k(const row_t &row, const std::vector<row_t> &rows) {
-  const u32 hdmi_vic = row.decision.subject == COMPOSE_SUBJECT_VIDEO_MODE ? hdmi_vic_of_vic(row.decision.code) : 0;
+  const bool has_vic = row.decision.subject == COMPOSE_SUBJECT_VIDEO_MODE || row.section == section_t::extended;
+  const u32 hdmi_vic = has_vic ? hdmi_vic_of_vic(row.decision.code) : 0;
   return hdmi_vic != 0 && std::any_of(rows.begin(), rows.end(), [hdmi_vic](const row_t &other) {
            return other.section == section_t::mode_4k && other.is_offered() && other.decision.code == hdmi_vic;
          });
@@ -87,7 +98,7 @@ std::vector<std::string> lost_of_sink(const std::vector<row_t> &rows, const expl
   std::vector<row_t> lost;
   std::copy_if(rows.begin(), rows.end(), std::back_inserter(lost), [&](const row_t &row) {
     return row.is_of_sink() && !row.is_offered() && row.merged.empty() && !row.rests_on_unread &&
-           !is_offered_as_4k(row, rows);
+           !row.is_offered_otherwise && !is_offered_as_4k(row, rows);
   });
   std::stable_sort(lost.begin(), lost.end(), [&explained](const row_t &left, const row_t &right) {
     return pixel_rate(left, explained) > pixel_rate(right, explained);
@@ -106,13 +117,13 @@ std::string reason_in_common(const row_t &row, const sink_reading_t &reading) {
     return reading.missing_part;
   }
   const bool is_above = row.decision.subject == COMPOSE_SUBJECT_VIDEO_MODE && row.decision.code > last_library_vic;
-  return is_above ? "this library offers VICs up to 64" : compose_reason_string(row.decision.reason);
+  return is_above ? "VICs above 64 need hdmi2.enable = 1" : compose_reason_string(row.decision.reason);
 }
 
 std::vector<common_reason_t> common_reasons(const std::vector<row_t> &rows, const sink_reading_t &reading) {
   std::vector<common_reason_t> reasons;
   for (const row_t &row : rows) {
-    if (row.section == section_t::derived || row.is_offered()) {
+    if (is_of_values(row.section) || row.is_offered()) {
       continue;
     }
     const std::string text = reason_in_common(row, reading);
@@ -128,14 +139,19 @@ std::vector<common_reason_t> common_reasons(const std::vector<row_t> &rows, cons
 
 std::vector<count_t> counts_of(const std::vector<row_t> &rows) {
   std::vector<count_t> counts;
-  for (const section_t section : {section_t::video, section_t::mode_4k, section_t::audio}) {
+  for (const section_t section : sections) {
+    if (is_of_values(section)) {
+      continue;
+    }
     count_t count{section};
     for (const row_t &row : rows) {
       if (row.section == section) {
         ++(row.is_offered() ? count.offered : count.left_out);
       }
     }
-    counts.push_back(count);
+    if (is_always_there(section) || count.offered + count.left_out != 0) {
+      counts.push_back(count);
+    }
   }
   return counts;
 }
@@ -155,9 +171,9 @@ std::string status_of(const sink_reading_t &reading) {
 
 summary_t summary_of(const std::vector<row_t> &rows, const explained_t &explained) {
   const sink_reading_t &reading = explained.reading;
-  return {status_of(reading),           preferred_video(rows),         best_video(rows, explained),
-          offered_audio(rows),          lost_of_sink(rows, explained), counts_of(rows),
-          common_reasons(rows, reading)};
+  return {status_of(reading),     preferred_video(rows),        best_video(rows, explained),
+          offered_features(rows), offered_audio(rows),          lost_of_sink(rows, explained),
+          counts_of(rows),        common_reasons(rows, reading)};
 }
 
 std::string first_of(const std::vector<std::string> &texts, std::size_t shown) {

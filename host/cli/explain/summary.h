@@ -25,6 +25,7 @@ struct summary_t {
   std::string status;                    ///< What was read of the sink, in one sentence.
   std::string preferred_video;           ///< The mode that a source prefers; empty: none.
   std::string best_video;                ///< The mode with the most pixels a second; empty: none.
+  std::vector<std::string> hdmi2;        ///< What HDMI 2 adds: rate, HDR, colours and so on; empty without it.
   std::vector<std::string> audio;        ///< Each type that is offered, with the most channels.
   std::vector<std::string> lost;         ///< What the sink has and the new EDID doesn't offer, best first.
   std::vector<count_t> counts;           ///< Of video modes, 4Kx2K modes and audio formats.

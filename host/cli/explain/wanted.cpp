@@ -2,11 +2,13 @@
 
 #include <algorithm>
 #include <array>
+#include <cctype>
 #include <cstdio>
 #include <iterator>
 #include <optional>
 
 #include "edid_text/mode_names.h"
+#include "explain/hdmi2_features.h"
 #include "io/bad_input.h"
 #include "text/lower_case.h"
 #include "text/whole_number.h"
@@ -62,6 +64,28 @@ constexpr code_name_t channel_names[] = {{"2.0", 2}, {"2.1", 3}, {"5.1", 6}, {"7
 
 constexpr code_name_t depth_names[] = {
     {"deep-color", 36}, {"deep-colour", 36}, {"deepcolor", 36}, {"30bit", 30}, {"36bit", 36}, {"48bit", 48},
+};
+
+struct feature_name_t {
+  std::string_view name;
+  wanted_t wanted;
+};
+
+/// What HDMI 2 added besides modes.
+constexpr feature_name_t feature_names[] = {
+    {"hdr", {COMPOSE_SUBJECT_HDR, HDMI2_EOTF_PQ}},
+    {"hdr10", {COMPOSE_SUBJECT_HDR, HDMI2_EOTF_PQ}},
+    {"hlg", {COMPOSE_SUBJECT_HDR, HDMI2_EOTF_HLG}},
+    {"hdr10+", {COMPOSE_SUBJECT_PASSED_BLOCK, COMPOSE_ROOM_HDR10PLUS}},
+    {"hdr10plus", {COMPOSE_SUBJECT_PASSED_BLOCK, COMPOSE_ROOM_HDR10PLUS}},
+    {"dolby-vision", {COMPOSE_SUBJECT_PASSED_BLOCK, COMPOSE_ROOM_DOLBY_VISION}},
+    {"dolbyvision", {COMPOSE_SUBJECT_PASSED_BLOCK, COMPOSE_ROOM_DOLBY_VISION}},
+    {"freesync", {COMPOSE_SUBJECT_PASSED_BLOCK, COMPOSE_ROOM_FREESYNC}},
+    {"bt2020", {COMPOSE_SUBJECT_COLORIMETRY, HDMI2_BT2020_YCC}},
+    {"4:2:0", {COMPOSE_SUBJECT_YCBCR_420, 1}},
+    {"420", {COMPOSE_SUBJECT_YCBCR_420, 1}},
+    {"allm", {COMPOSE_SUBJECT_ALLM, 1}},
+    {"vrr", {COMPOSE_SUBJECT_VRR, 1}},
 };
 
 struct line_width_t {
@@ -142,6 +166,10 @@ bool is_called(const raster_t &mode, const raster_t &wanted) {
          mode.lines == wanted.lines && mode.interlaced == wanted.interlaced && mode.rate == wanted.rate;
 }
 
+compose_subject subject_of_vic(u32 vic) {
+  return vic > last_library_vic ? COMPOSE_SUBJECT_EXTENDED_MODE : COMPOSE_SUBJECT_VIDEO_MODE;
+}
+
 /// What the library can offer of a raster; only where that is nothing, the first VIC that a sink might list.
 std::vector<wanted_t> modes_called(const raster_t &wanted) {
   std::vector<wanted_t> modes;
@@ -153,7 +181,7 @@ std::vector<wanted_t> modes_called(const raster_t &wanted) {
   for (u32 vic = 1; vic <= last_vic; ++vic) {
     const auto raster = raster_of_vic(vic);
     if (raster && is_called(*raster, wanted) && (vic <= last_library_vic || modes.empty())) {
-      modes.push_back({COMPOSE_SUBJECT_VIDEO_MODE, vic});
+      modes.push_back({subject_of_vic(vic), vic});
     }
   }
   return modes;
@@ -162,7 +190,7 @@ std::vector<wanted_t> modes_called(const raster_t &wanted) {
 /// A VIC that HDMI 1.4 has another number for is asked for by that.
 wanted_t wanted_vic(u32 vic) {
   const u32 hdmi_vic = hdmi_vic_of_vic(vic);
-  return hdmi_vic != 0 ? wanted_t{COMPOSE_SUBJECT_4K_MODE, hdmi_vic} : wanted_t{COMPOSE_SUBJECT_VIDEO_MODE, vic};
+  return hdmi_vic != 0 ? wanted_t{COMPOSE_SUBJECT_4K_MODE, hdmi_vic} : wanted_t{subject_of_vic(vic), vic};
 }
 
 /// "ac3", "pcm8" or "pcm7.1".
@@ -220,6 +248,11 @@ std::vector<wanted_t> parse_wanted(std::string_view original) {
                               "audio:1 to audio:14 or audio:16 to audio:18");
     return {{COMPOSE_SUBJECT_AUDIO_FORMAT, type}};
   }
+  for (const feature_name_t &feature : feature_names) {
+    if (feature.name == view) {
+      return {feature.wanted};
+    }
+  }
   const bool is_prefixed = view.starts_with(prefix_vic);
   if (is_prefixed || parse_whole_number(view)) {
     const std::string_view number = is_prefixed ? view.substr(prefix_vic.size()) : view;
@@ -241,11 +274,16 @@ std::vector<wanted_t> parse_wanted(std::string_view original) {
   }
   refuse(original,
          "a VIC such as 16, a mode such as 1080p60 or 4k30, a 4Kx2K mode such as 4k:1, an audio format such as ac3 or "
-         "pcm8, 3d or deep-color");
+         "pcm8, 3d, deep-color, hdr10, hlg, 4:2:0, allm, vrr or dolby-vision");
 }
 
 std::string wanted_name(const wanted_t &wanted) {
   const std::string code = std::to_string(wanted.code);
+  if (const hdmi2_feature_t *const feature = find_hdmi2_feature(wanted.subject, wanted.code)) {
+    std::string name = feature->name;
+    name.front() = static_cast<char>(std::toupper(static_cast<unsigned char>(name.front())));
+    return name;
+  }
   switch (wanted.subject) {
     case COMPOSE_SUBJECT_4K_MODE:
       return mode_4k_name(wanted.code);

@@ -23,7 +23,7 @@ std::optional<step_t> next_step(const wanted_t &wanted, const trial_t &trial, co
   if (!trial.composition.is_composed) {
     return step_that_drops_what_breaks(trial);
   }
-  if (const auto step = announcing_step(trial)) {
+  if (auto step = announcing_step(trial)) {
     return step;
   }
   switch (wanted.subject) {
@@ -32,6 +32,13 @@ std::optional<step_t> next_step(const wanted_t &wanted, const trial_t &trial, co
     case COMPOSE_SUBJECT_DEEP_COLOR:
     case COMPOSE_SUBJECT_3D:
       return next_setting_step(wanted, trial, explained);
+    case COMPOSE_SUBJECT_HDR:
+    case COMPOSE_SUBJECT_COLORIMETRY:
+    case COMPOSE_SUBJECT_YCBCR_420:
+    case COMPOSE_SUBJECT_ALLM:
+    case COMPOSE_SUBJECT_VRR:
+    case COMPOSE_SUBJECT_PASSED_BLOCK:
+      return next_feature_step(wanted, trial);
     default:
       return next_mode_step(wanted, trial);
   }

@@ -22,6 +22,12 @@ std::optional<step_t> step_that_drops_what_breaks(const trial_t &trial);
 /// For deep colour and 3D.
 std::optional<step_t> next_setting_step(const wanted_t &wanted, const trial_t &trial, const explained_t &explained);
 
+/// For what HDMI 2 added: the feature's own key, or what it depends on.
+std::optional<step_t> next_feature_step(const wanted_t &wanted, const trial_t &trial);
+/// For a mode above VIC 64 that is too fast for the link: another rate, 4:2:0, or a box that makes it itself.
+std::optional<step_t> next_rate_step(const wanted_t &wanted, const trial_t &trial);
+step_t step_that_enables_hdmi2();
+
 /// One mode less in the new EDID, the last that was chosen; none when there is no other.
 std::optional<step_t> step_that_makes_room(const wanted_t &wanted, const trial_t &trial);
 

@@ -54,8 +54,11 @@ class collector_t {
 
   void add(const composition_t &composition, const std::string &where, const edid_t *sink = nullptr) {
     for (const problem_t &problem : problems_of(composition, sink)) {
-      // Sinks are unread for different reasons; the rest is the same problem, whatever its numbers.
-      const std::string subject = problem.kind == problem_kind_t::sink_unread ? problem.text : "";
+      // Sinks are unread for different reasons, and different things lack room; the rest is the same problem, whatever
+      // its numbers.
+      const bool has_subjects =
+          problem.kind == problem_kind_t::sink_unread || problem.kind == problem_kind_t::left_out_for_room;
+      const std::string subject = has_subjects ? problem.text : "";
       const auto [known, is_new] = occurrences_.emplace(std::pair(problem.kind, subject),
                                                         occurrence_t{problem, where, family_of(composition), 0});
       known->second.others += is_new ? 0 : 1;
@@ -101,8 +104,10 @@ findings_t find_consequences(const composition_t &without_sink, const compose_cf
   collector.add(without_sink, "without a sink");
   for (const u32 family : {60U, 50U}) {
     const std::vector<u32> vics = modes_of(without_sink.readings, std::to_string(family) + "_hz_priority_list");
+    const std::vector<u32> extended = modes_of(without_sink.readings, "hdmi2.vic_priority_list");
     collector.compose_for(
-        {"with a " + std::to_string(family) + " Hz sink that takes everything", made_sink(family, vics)}, false);
+        {"with a " + std::to_string(family) + " Hz sink that takes everything", made_sink(family, vics, extended)},
+        false);
   }
   for (const named_sink_t &sink : sinks) {
     collector.compose_for({"with " + sink.name, sink.edid}, true);

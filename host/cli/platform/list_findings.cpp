@@ -18,6 +18,7 @@ constexpr pair_t pairs[] = {
     {"60_hz_addition_list", "60_hz_priority_list"},
     {"50_hz_addition_list", "50_hz_priority_list"},
     {"4k_x_2k_addition_list", "4k_x_2k_priority_list"},
+    {"hdmi2.vic_addition_list", "hdmi2.vic_priority_list"},
 };
 
 bool is_priority_list(std::string_view name) {
@@ -32,6 +33,7 @@ std::string subject_of(const kept_reading_t &entry) {
 std::string code_text(const kept_reading_t &entry) {
   switch (entry.key->kind) {
     case CONFIGURATION_VIDEO_MODES:
+    case CONFIGURATION_EXTENDED_VICS:
       return "VIC " + std::to_string(entry.used);
     case CONFIGURATION_HDMI_VICS:
       return "4Kx2K mode " + std::to_string(entry.used);
@@ -85,7 +87,9 @@ class finder_t {
       if (is_new) {
         continue;
       }
-      const bool takes_room = is_priority_list(list) || entry->key->kind == CONFIGURATION_STANDARD_TIMINGS;
+      const bool is_extended = entry->key->kind == CONFIGURATION_EXTENDED_VICS;
+      const bool takes_room =
+          (is_priority_list(list) && !is_extended) || entry->key->kind == CONFIGURATION_STANDARD_TIMINGS;
       find(takes_room ? severity_t::warning : severity_t::note, *entry,
            "repeats " + name_of(*first->second) + (takes_room ? ": " + code_text(*entry) + " is offered twice" : ""));
     }

@@ -68,17 +68,60 @@ constexpr std::size_t most_modes() {
   return left - (left + longest_block) / (longest_block + 1);
 }
 
+hdmi2_block_t block_of(std::initializer_list<u8> payload) {
+  hdmi2_block_t block{};
+  block.length = static_cast<u8>(payload.size());
+  std::copy(payload.begin(), payload.end(), block.payload);
+  return block;
+}
+
+hdmi2_t everything_of_hdmi2(std::span<const u32> vics) {
+  hdmi2_t hdmi2{};
+  hdmi2.size = sizeof hdmi2;
+  hdmi2.svd_count = static_cast<u32>(std::min<std::size_t>(vics.size(), HDMI2_MOST_LISTED_VICS));
+  std::transform(vics.begin(), vics.begin() + hdmi2.svd_count, hdmi2.svds,
+                 [](u32 vic) { return static_cast<u8>(vic); });
+  hdmi2.forum_present = hdmi2.forum_version = hdmi2.scdc = hdmi2.uhd_vic = 1;
+  hdmi2.max_tmds_rate = 600;
+  hdmi2.dc_30bit_420 = hdmi2.dc_36bit_420 = 1;
+  hdmi2.allm_present = hdmi2.allm = hdmi2.vrr_present = 1;
+  hdmi2.vrr_min = 48;
+  hdmi2.vrr_max = 120;
+  hdmi2.video_capability_present = hdmi2.rgb_quantization = hdmi2.ycc_quantization = 1;
+  hdmi2.colorimetry_present = 1;
+  hdmi2.colorimetry = HDMI2_BT2020_RGB | HDMI2_BT2020_YCC | HDMI2_BT2020_CYCC;
+  hdmi2.hdr_static_present = hdmi2.metadata_types = 1;
+  hdmi2.eotfs = HDMI2_EOTF_SDR | HDMI2_EOTF_GAMMA | HDMI2_EOTF_PQ | HDMI2_EOTF_HLG;
+  hdmi2.luminance_count = 3;
+  hdmi2.luminance[0] = hdmi2.luminance[1] = 96;
+  hdmi2.y420_map_present = 1;
+  hdmi2.hdr10plus = block_of({0x01, 0x8B, 0x84, 0x90, 0x01});
+  hdmi2.dolby_vision = block_of({0x01, 0x46, 0xD0, 0x00, 0x48, 0, 0, 0, 0, 0, 0});
+  hdmi2.freesync = block_of({0x1A, 0x00, 0x00, 0x01, 0x01, 48, 120, 0});
+  return hdmi2;
+}
+
+void append_hdmi2_extension(std::vector<u8> &edid, std::span<const u32> vics) {
+  constexpr std::size_t header = 4;
+  u8 blocks[room] = {};
+  u32 used = 0;
+  const hdmi2_t hdmi2 = everything_of_hdmi2(vics);
+  encode_hdmi2(&hdmi2, blocks, sizeof blocks, &used);
+  edid.insert(edid.end(), {0x02, 0x03, static_cast<u8>(header + used), 0xF0});
+  edid.insert(edid.end(), blocks, blocks + used);
+  finish_block(edid);
+}
+
 }  // namespace
 
-std::vector<u8> made_sink(u32 family, std::span<const u32> vics) {
+std::vector<u8> made_sink(u32 family, std::span<const u32> vics, std::span<const u32> extended_vics) {
   std::vector<u8> edid;
-  edid.reserve(2 * edid_block_size);
   append(edid, base_block_begin);
   family == 50 ? append(edid, timing_50) : append(edid, timing_60);
   append(edid, dummy_descriptor);
   append(edid, dummy_descriptor);
   append(edid, dummy_descriptor);
-  edid.push_back(1);
+  edid.push_back(extended_vics.empty() ? 1 : 2);
   finish_block(edid);
 
   edid.insert(edid.end(), {0x02, 0x03, 0x00, 0xF0});
@@ -90,6 +133,9 @@ std::vector<u8> made_sink(u32 family, std::span<const u32> vics) {
   // No detailed timings follow; they would begin here.
   edid[edid_block_size + 2] = static_cast<u8>(edid.size() - edid_block_size);
   finish_block(edid);
+  if (!extended_vics.empty()) {
+    append_hdmi2_extension(edid, extended_vics);
+  }
   return edid;
 }
 

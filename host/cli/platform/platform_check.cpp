@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <climits>
 
+#include "platform/hdmi2_findings.h"
 #include "platform/key_findings.h"
 #include "platform/list_findings.h"
 #include "platform/platform_keys.h"
@@ -80,6 +81,7 @@ platform_check_t check_platform(const compose_cfg_t &settings, std::span<const n
   if (check.findings.empty()) {
     append(check.findings, find_in_readings(without_sink.readings));
     append(check.findings, find_between_entries(without_sink));
+    append(check.findings, find_in_hdmi2_table(without_sink));
     append(check.findings, find_unknown_keys());
     append(check.findings, find_consequences(without_sink, settings, sinks));
   }

@@ -1,5 +1,8 @@
 #include "platform/platform_keys.h"
 
+#include <algorithm>
+#include <iterator>
+
 namespace edid_cli {
 namespace {
 
@@ -24,6 +27,15 @@ std::string platform_path(const std::string &key) {
   return std::string(platform_domain) + "." + key;
 }
 
+std::string inner_table_of(const std::string &key) {
+  const std::size_t dot = key.find('.');
+  return dot == std::string::npos ? "" : key.substr(0, dot);
+}
+
+bool is_inner_table(const std::string &name) {
+  return std::find(std::begin(inner_tables), std::end(inner_tables), name) != std::end(inner_tables);
+}
+
 std::vector<std::string> audio_entry_keys() {
   std::vector<std::string> entries;
   for (char letter = 'a'; letter <= 'z'; ++letter) {
@@ -34,7 +46,8 @@ std::vector<std::string> audio_entry_keys() {
 
 bool is_list(const configuration_key_t &key) {
   return key.kind == CONFIGURATION_VIDEO_MODES || key.kind == CONFIGURATION_HDMI_VICS ||
-         key.kind == CONFIGURATION_TIMING_BITS || key.kind == CONFIGURATION_STANDARD_TIMINGS;
+         key.kind == CONFIGURATION_TIMING_BITS || key.kind == CONFIGURATION_STANDARD_TIMINGS ||
+         key.kind == CONFIGURATION_EXTENDED_VICS;
 }
 
 bool is_number(const configuration_key_t &key) {
@@ -66,8 +79,9 @@ std::string limits_text(const configuration_key_t &key) {
   if (key.entry_characters != 0) {
     return std::to_string(key.entry_characters) + " characters each";
   }
-  return range_text(key) + " each" +
-         (key.most_entries != 0 ? ", " + std::to_string(key.most_entries) + " entries" : "");
+  // What lies between is not defined.
+  const std::string range = key.kind == CONFIGURATION_EXTENDED_VICS ? "65 to 127 and 193 to 219" : range_text(key);
+  return range + " each" + (key.most_entries != 0 ? ", " + std::to_string(key.most_entries) + " entries" : "");
 }
 
 std::string default_text(const configuration_key_t &key) {

@@ -13,6 +13,13 @@ inline constexpr const char *platform_domain = "platform.software.drivers.vorex.
 /// The table of the audio formats in it, and how the keys of these begin.
 inline constexpr const char *audio_table = "audio";
 inline constexpr const char *audio_entry_prefix = "entry_";
+/// The table of what HDMI 2 added.
+inline constexpr const char *hdmi2_table = "hdmi2";
+/// The tables in the domain.
+inline constexpr const char *inner_tables[] = {audio_table, hdmi2_table};
+/// "audio" of "audio.entry_a"; empty of a key of the domain itself.
+std::string inner_table_of(const std::string &key);
+bool is_inner_table(const std::string &name);
 
 /// In the order in which they are read.
 std::vector<const configuration_key_t *> platform_keys();

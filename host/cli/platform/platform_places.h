@@ -20,6 +20,8 @@ struct list_entry_t {
 namespace platform_list {
 inline constexpr const char *priority_4k = "4k_x_2k_priority_list";
 inline constexpr const char *addition_4k = "4k_x_2k_addition_list";
+inline constexpr const char *priority_extended = "hdmi2.vic_priority_list";
+inline constexpr const char *addition_extended = "hdmi2.vic_addition_list";
 inline constexpr const char *audio = "audio";
 std::string priority(u32 family);
 std::string addition(u32 family);

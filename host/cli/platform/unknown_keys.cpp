@@ -29,7 +29,7 @@ std::string last_name(const std::string &key) {
 
 /// The key that a name is nearest to: as it stands, or by its last name in another table.
 std::optional<std::string> suggestion_for(const std::string &key, const std::vector<std::string> &known) {
-  if (const auto nearest = nearest_name(key, known)) {
+  if (auto nearest = nearest_name(key, known)) {
     return nearest;
   }
   std::vector<std::string> names;
@@ -66,10 +66,10 @@ class search_t {
   void search_table(const configuration_node_t &table, const std::string &prefix) {
     for (const configuration_node_t &child : table.children()) {
       const std::string key = prefix + child.name();
-      if (key == audio_table && child.is_branch()) {
+      if (is_inner_table(key) && child.is_branch()) {
         search_table(child, key + ".");
       } else if (!is_known(key)) {
-        const auto suggestion = key == audio_table ? std::nullopt : suggestion_for(key, known_and_tables());
+        const auto suggestion = is_inner_table(key) ? std::nullopt : suggestion_for(key, known_and_tables());
         findings_.push_back(
             {severity_t::warning, child.position(), key,
              "nobody reads this key" + (suggestion ? ": did you mean " + *suggestion + "?" : std::string())});
@@ -91,7 +91,7 @@ class search_t {
 
   std::vector<std::string> known_and_tables() const {
     std::vector<std::string> names = known_;
-    names.emplace_back(audio_table);
+    names.insert(names.end(), std::begin(inner_tables), std::end(inner_tables));
     return names;
   }
 

@@ -7,7 +7,7 @@ namespace edid_composer {
 
 struct link_rates_t {
   u32 platform;  ///< What the box's receiver takes.
-  u32 sink;      ///< What the sink takes; the platform's where there is no sink behind it.
+  u32 sink;      ///< What the sink takes; the platform's without a sink.
   u32 both;      ///< What goes through to the sink.
 };
 

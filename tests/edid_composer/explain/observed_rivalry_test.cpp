@@ -300,7 +300,7 @@ TEST_F(ObservedRivalry, ThirtyThreeModesHaveNoRoomAtAll) {
     vics.push_back(vic);
   offer(vics);
   observe_it();
-  // 32 of them are written, behind a length of 0. A source reads them as other blocks, and none as a mode.
+  // 32 of them are written, after a length of 0. A source reads them as other blocks, and none as a mode.
   EXPECT_EQ(about_mode(33), words_of({mode(33, COMPOSE_VERDICT_LEFT_OUT, COMPOSE_REASON_NO_ROOM)
                                           .named_by(both_lists)
                                           .in_priority_list_at(32)

@@ -47,7 +47,7 @@ address_t expected_address(const address_t &sink, u8 port) {
   for (u8 &component : result) {
     if (component != 0) continue;
     component = port;
-    // What stands behind the first zero is replaced by zeros.
+    // What stands after the first zero is replaced by zeros.
     for (u8 *rest = &component + 1; rest != result.data() + 4; ++rest)
       *rest = 0;
     return result;

@@ -165,7 +165,7 @@ TEST_F(StandardTimingEntry, IncrementedRateWraps) {
 }
 
 TEST_F(StandardTimingEntry, NumbersThatFillTheBufferLeaveNoneBehindIt) {
-  // The third number ends at the last byte, so the fraction would begin behind the buffer.
+  // The third number ends at the last byte, so the fraction would begin after the buffer.
   const edid_composer::configuration_entry_t entry{
       &key("standard_timings"), 0, edid_composer::entry_kind_t::text, "node", -1, "00000000008 0000000008 000061"};
   ASSERT_EQ(std::strlen(entry.text), sizeof entry.text - 1);

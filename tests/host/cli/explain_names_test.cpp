@@ -61,12 +61,20 @@ TEST(ModeNames, HaveTheHdmiVicOfTheSameMode) {
   EXPECT_EQ(hdmi_vic_of_vic(97), 0U);
 }
 
+TEST(Wanted, MayBeWhatHdmi2AddedBesidesModes) {
+  EXPECT_THAT(codes("HDR10", COMPOSE_SUBJECT_HDR), ElementsAre(HDMI2_EOTF_PQ));
+  EXPECT_THAT(codes("hlg", COMPOSE_SUBJECT_HDR), ElementsAre(HDMI2_EOTF_HLG));
+  EXPECT_THAT(codes("4:2:0", COMPOSE_SUBJECT_YCBCR_420), ElementsAre(1));
+  EXPECT_THAT(codes("dolby-vision", COMPOSE_SUBJECT_PASSED_BLOCK), ElementsAre(COMPOSE_ROOM_DOLBY_VISION));
+  EXPECT_EQ(wanted_name({COMPOSE_SUBJECT_VRR, 1}), "Variable refresh rate");
+}
+
 TEST(Wanted, MayBeAVic) {
   EXPECT_THAT(codes("16", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(16));
   EXPECT_THAT(codes("64", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(64));
   EXPECT_THAT(codes("vic 16", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(16));
-  EXPECT_THAT(codes("VIC97", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(97));
-  EXPECT_THAT(codes("219", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(219));
+  EXPECT_THAT(codes("VIC97", COMPOSE_SUBJECT_EXTENDED_MODE), ElementsAre(97));
+  EXPECT_THAT(codes("219", COMPOSE_SUBJECT_EXTENDED_MODE), ElementsAre(219));
 }
 
 TEST(Wanted, OfAVicThatHdmi14HasAnotherNumberForIsThatMode) {
@@ -87,8 +95,8 @@ TEST(Wanted, MayBeCalledByItsLinesAndRate) {
   EXPECT_THAT(codes("1080P120", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(63));
   EXPECT_THAT(codes("720p60", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(4));
   EXPECT_THAT(codes("576i50", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(21, 22));
-  EXPECT_THAT(codes("2160p60", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(97));
-  EXPECT_THAT(codes("8k60", COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(199));
+  EXPECT_THAT(codes("2160p60", COMPOSE_SUBJECT_EXTENDED_MODE), ElementsAre(97));
+  EXPECT_THAT(codes("8k60", COMPOSE_SUBJECT_EXTENDED_MODE), ElementsAre(199));
   for (const char *rate : {"1080p59.94", "1080p59", "1080p60"}) {
     EXPECT_THAT(codes(rate, COMPOSE_SUBJECT_VIDEO_MODE), ElementsAre(16)) << rate;
   }

@@ -219,12 +219,13 @@ TEST_F(Reasons, ForNoRoomAreTheNameThatIsMissing) {
             "It was chosen, but without a monitor name sources do not read the extension.");
 }
 
-TEST_F(Reasons, OfVicsAboveTheLibrarysAreTheLibrary) {
+TEST_F(Reasons, OfVicsAbove64WithoutHdmi2AreTheKeyThatTurnsItOn) {
   compose_decision_t mode = left_out(COMPOSE_REASON_NOT_IN_PRIORITY_LIST, {});
   mode.code = 97;
-  EXPECT_EQ(sentence(mode), "The sink has it; this library offers VICs up to 64.");
+  EXPECT_EQ(sentence(mode), "The sink has it; VICs above 64 are offered with hdmi2.enable = 1 only.");
   mode.code = 95;
-  EXPECT_EQ(sentence(mode), "The sink has it; this library offers VICs up to 64. HDMI 1.4 has it as 4k:1.");
+  EXPECT_EQ(sentence(mode),
+            "The sink has it; VICs above 64 are offered with hdmi2.enable = 1 only. HDMI 1.4 has it as 4k:1.");
 }
 
 TEST_F(Reasons, ThatRestOnWhatWasNotReadSaySo) {
@@ -237,7 +238,7 @@ TEST_F(Reasons, ThatRestOnWhatWasNotReadSaySo) {
     EXPECT_EQ(says_so, rests_on_unread(known, explained())) << sentence(known);
     resting += says_so ? 1 : 0;
   }
-  EXPECT_EQ(resting, 14U);
+  EXPECT_EQ(resting, 16U);
   EXPECT_EQ(sentence(left_out(COMPOSE_REASON_NOT_AVAILABLE, {})),
             "Only 60_hz_priority_list names it, and the sink's extension was not read.");
   EXPECT_FALSE(rests_on_unread(left_out(COMPOSE_REASON_SINK_HAS_IT, {}), explained()));

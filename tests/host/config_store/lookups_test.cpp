@@ -29,7 +29,7 @@ struct guarded_buffer_t {
   guarded_buffer_t() { bytes.fill('x'); }
 
   char *begin() { return bytes.data() + 8; }
-  /// What stands from the buffer's begin to the end of the guard behind it.
+  /// What stands from the buffer's begin to the end of the guard after it.
   std::string from_begin(std::size_t length) { return {begin(), length}; }
   bool is_untouched_outside(std::size_t size) {
     const std::string text(bytes.data(), bytes.size());

@@ -139,7 +139,7 @@ class JsonTest(explaining.ExplainTest):
         sink = self.write("tv.bin", sinks.sink(vics=[16, 97, 95, 219, 100]))
         names = {decision["code"]: (decision["name"], decision["sentence"]) for decision in self.decisions("--sink", sink)
                  if decision["subject"] == "video mode"}
-        only = "The sink has it; this library offers VICs up to 64."
+        only = "The sink has it; VICs above 64 are offered with hdmi2.enable = 1 only."
         self.assertEqual(names[97], ("3840x2160p60 16:9 (VIC 97)", only))
         self.assertEqual(names[95], ("3840x2160p30 16:9 (VIC 95)", only + " HDMI 1.4 has it as 4k:1."))
         self.assertEqual(names[91], ("4096x2160p120 256:135 (VIC 219)", only + " It takes this one for VIC 91."))

@@ -163,38 +163,11 @@ class Fitting(PageTest):
         self.assertGreater(len(pages), 20000)
 
 
-# The relative luminance and the contrast of WCAG 2.1, of each text on the nearest background behind it.
-CONTRAST = """
-const parts = color => color.match(/[\\d.]+/g).map(Number);
-const luminance = color => {
-  const linear = value => value <= 0.03928 ? value / 12.92 : ((value + 0.055) / 1.055) ** 2.4;
-  const [r, g, b] = parts(color).map(value => linear(value / 255));
-  return 0.2126 * r + 0.7152 * g + 0.0722 * b;
-};
-const background = element => {
-  for (; element; element = element.parentElement) {
-    const color = getComputedStyle(element).backgroundColor;
-    if (parts(color).length === 3) return color;
-  }
-  return "rgb(255, 255, 255)";
-};
-let least = [99, ""];
-for (const element of document.querySelectorAll("body *")) {
-  const own = [...element.childNodes].some(node => node.nodeType === 3 && node.data.trim());
-  if (!own || !element.getClientRects().length) continue;
-  const [a, b] = [getComputedStyle(element).color, background(element)].map(luminance).sort((x, y) => y - x);
-  const contrast = (a + 0.05) / (b + 0.05);
-  if (contrast < least[0]) least = [contrast, element.outerHTML.slice(0, 200)];
-}
-return least;
-"""
-
-
 class Accessible(PageTest):
     def test_every_text_has_a_contrast_of_4_5(self):
         self.open("--sink", self.sample("tv_4k"))
         self.browser.run("document.querySelectorAll('details').forEach(part => part.open = true)")
-        contrast, where = self.browser.run(CONTRAST)
+        contrast, where = self.browser.run(browser.CONTRAST)
         self.assertGreaterEqual(contrast, 4.5, where)
 
     def test_it_begins_with_what_matters(self):

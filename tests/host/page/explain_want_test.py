@@ -333,12 +333,56 @@ class OwnWords(WantTest):
         self.check("3d", "3d", 1, platform(), without, told=["give --3d on"])
 
     def test_what_the_library_cannot_do_is_said_so(self):
-        for wanted, reason in (("2160p60", "VIC 97 needs HDMI 2.0"), ("vic 97", "VIC 97 needs HDMI 2.0"),
-                               ("8k60", "VIC 199 needs HDMI 2.1"), ("vic 90", "offers VICs 1 to 64"),
+        for wanted, reason in (("8k60", "VIC 199 needs a fixed rate link"),
+                               ("2160p120", "it needs 1188 MHz"), ("dolby-vision", "only passed on from a sink"),
                                ("48bit", "no configuration of this library offers it")):
             status, (answer,) = self.ask(platform(), sinks.sink(vics=[16, 97]), (), wanted)
             self.assertEqual((status, answer["offered"], answer["steps"], answer["other_ways"]), (1, False, [], []))
             self.assertIn(reason, answer["no_way"])
+
+    def hdmi2_steps(self, wanted, sink, keys=""):
+        """The steps as key and value, after checking that the program itself offers it once they are taken."""
+        table = f"\n[platform.software.drivers.vorex.edid.hdmi2]\n{keys}" if keys else ""
+        _, (answer,) = self.ask(platform() + table, self.sample(sink).read_text(), (), wanted)
+        self.assertFalse(answer["offered"])
+        changed = platform() + self.changed_table(keys, answer["steps"])
+        status, (after,) = self.ask(changed, self.sample(sink).read_text(), (), wanted)
+        self.assertEqual((status, after["offered"]), (0, True), changed)
+        return [(step["key"].removeprefix("hdmi2."), step["value"]) for step in answer["steps"]]
+
+    @staticmethod
+    def changed_table(keys, steps):
+        values = dict(line.split(" = ") for line in keys.splitlines())
+        for step in steps:
+            key = step["key"].removeprefix("hdmi2.")
+            if step["action"] == "add to list":
+                inner = values.get(key, "[]")[1:-1]
+                values[key] = f"[{inner}{', ' if inner else ''}{step['value']}]"
+            else:
+                values[key] = step["value"]
+        lines = "".join(f"{key} = {value}\n" for key, value in values.items())
+        return f"\n[platform.software.drivers.vorex.edid.hdmi2]\n{lines}"
+
+    def test_what_hdmi_2_added_is_turned_on_with_its_own_keys(self):
+        on = ("enable", "1")
+        for sink, wanted, steps in (
+                ("tv_4k_hdr", "2160p60", [on, ("vic_priority_list", "97"), ("tmds_limit", "595")]),
+                ("tv_4k_hdr", "97", [on, ("vic_priority_list", "97"), ("tmds_limit", "595")]),
+                ("tv_4k_hdr", "hdr10", [on, ("hdr_pq", "2")]),
+                ("tv_4k_hdr", "hlg", [on, ("hdr_hlg", "2")]),
+                ("tv_4k_hdr", "dolby-vision", [on, ("pass_dolby_vision", "1")]),
+                ("tv_4k_hdr", "allm", [on, ("allm", "1")]),
+                ("gaming_monitor", "vrr", [on, ("vrr", "2")]),
+                ("gaming_monitor", "allm", [on, ("allm", "2")]),
+                ("gaming_monitor", "freesync", [on, ("pass_freesync", "1"), ("vrr", "2")]),
+                ("projector_420", "2160p60", [on, ("vic_priority_list", "97"), ("y420", "2")]),
+                ("projector_420", "4:2:0", [on, ("y420", "2"), ("vic_priority_list", "97")])):
+            with self.subTest(sink=sink, wanted=wanted):
+                self.assertEqual(self.hdmi2_steps(wanted, sink), steps)
+
+    def test_a_sink_that_is_too_slow_leaves_it_to_the_box(self):
+        steps = self.hdmi2_steps("2160p60", "tv_4k", "enable = 1\ntmds_limit = 600\nvic_priority_list = [97]\n")
+        self.assertEqual(steps, [("vic_addition_list", "97")])
 
     def test_a_platform_that_no_edid_can_be_composed_with_is_mended_first(self):
         text = platform(audio=(0x077F7F, 0x500715), pass_through=2)

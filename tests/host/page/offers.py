@@ -23,7 +23,7 @@ def _audio_descriptors(edid):
 
 
 def audio_entries(edid):
-    """(type, channels) of each short audio descriptor; types from 16 on are those behind format 15."""
+    """(type, channels) of each short audio descriptor; types from 16 on are those after format 15."""
     entries = []
     for first, _, last in _audio_descriptors(edid):
         code = first >> 3 & 15
