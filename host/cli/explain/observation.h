@@ -1,7 +1,7 @@
 // A composition that is observed, and what an explanation of it rests on.
 #pragma once
 
-#include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -30,7 +30,7 @@ class observation_t {
  private:
   const composition_options_t &options_;
   given_sink_t sink_;
-  std::unique_ptr<decoded_edid_t> decoded_sink_;
+  std::optional<decoded_edid_t> decoded_sink_;
   platform_places_t places_;
   composition_t composition_;
   sink_reading_t reading_;
