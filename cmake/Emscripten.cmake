@@ -1,6 +1,8 @@
-# WebAssembly (web/): what is different with Emscripten's compiler. There are no shared libraries, so the library and the
-# store become static ones.
+# WebAssembly (web/): what is different with Emscripten's compiler. There are no shared libraries, the return addresses are
+# out of a program's reach, and one file is all that is made.
 set(CMAKE_POSITION_INDEPENDENT_CODE OFF)
+set(EDID_COMPOSER_HARDENING OFF)
+set(EDID_COMPOSER_INSTALL OFF)
 
 # The WebAssembly exceptions of browsers: smaller and faster than those that are emulated in JavaScript.
 add_compile_options(-fwasm-exceptions)
@@ -26,6 +28,3 @@ foreach(package CLI11::CLI11 nlohmann_json::nlohmann_json utf8cpp)
   file(WRITE ${header_links}/${name}-config.cmake "")
   set(${name}_DIR ${header_links})
 endforeach()
-
-# The return addresses are out of a program's reach there.
-target_compile_options(edid_composer_library_flags INTERFACE -fno-stack-protector)
