@@ -14,8 +14,9 @@ import scratch
 PACKAGES = {
     "runtime": f"libedid-composer{contents.MAJOR}",
     "development": "libedid-composer-dev",
-    "tools": "edid-composer",
     "store": f"libedid-config-store{contents.MAJOR}",
+    "store_development": "libedid-config-store-dev",
+    "tools": "edid-composer",
 }
 OF_THE_SYSTEM = ("libc6", "libgcc-s1", "libstdc++6")
 EXACT = f"(= {contents.VERSION})"
@@ -24,6 +25,7 @@ DEPENDS = {
     "development": {f"{PACKAGES['runtime']} {EXACT}"},
     "tools": {f"{PACKAGES['runtime']} {EXACT}", f"{PACKAGES['store']} {EXACT}", *OF_THE_SYSTEM},
     "store": set(OF_THE_SYSTEM),
+    "store_development": {f"{PACKAGES['store']} {EXACT}", f"{PACKAGES['development']} {EXACT}"},
 }
 
 
@@ -40,11 +42,13 @@ class Packages(scratch.ScratchTest):
     @classmethod
     def prepare(cls):
         cls.architecture = scratch.run_or_fail(["dpkg", "--print-architecture"]).strip()
-        scratch.run_or_fail(["cpack", "--config", cls.build / "CPackConfig.cmake", "-B", cls.folder / "packages"])
-        cls.made = sorted((cls.folder / "packages").glob("*.deb"))
+        triplet = scratch.run_or_fail(["dpkg-architecture", "-qDEB_HOST_MULTIARCH"]).strip()
+        cls.libdir = f"lib/{triplet}"
+        cls.packages = pathlib.Path(os.environ["PACKAGES"])
+        cls.made = sorted(cls.packages.glob("*.deb"))
 
     def package(self, component):
-        return self.folder / "packages" / f"{PACKAGES[component]}_{contents.VERSION}_{self.architecture}.deb"
+        return self.packages / f"{PACKAGES[component]}_{contents.VERSION}_{self.architecture}.deb"
 
     def unpacked(self, component):
         folder = self.folder / "unpacked" / component
@@ -62,8 +66,7 @@ class Packages(scratch.ScratchTest):
         self.assertEqual(set(self.made), {self.package(component) for component in contents.COMPONENTS})
 
     def test_each_holds_its_component_and_its_licence(self):
-        # Packages are installed in /usr/lib, whatever the build's own prefix.
-        expected = contents.installed(os.environ["LIBDIR"], os.environ["BUILD_TYPE"])
+        expected = contents.installed(self.libdir, os.environ["BUILD_TYPE"])
         for component in contents.COMPONENTS:
             with self.subTest(component=component):
                 files = {re.sub(r"(/man/man\d/.*)", r"\1.gz", f"usr/{path}") for path in expected[component]}
@@ -79,7 +82,7 @@ class Packages(scratch.ScratchTest):
                 # Versions of the system's libraries are those of the machine that builds.
                 named = {re.sub(r" \(>= .*\)", "", each) for each in depends}
                 self.assertEqual(named, DEPENDS[component])
-        self.assertEqual(self.field("store", "Suggests"), f"{PACKAGES['development']} {EXACT}")
+        self.assertEqual(self.field("tools", "Suggests"), PACKAGES["store_development"])
 
     def test_files_are_as_debian_expects_them(self):
         program = self.unpacked("tools") / "usr/bin/edid-composer"
