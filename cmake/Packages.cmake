@@ -35,9 +35,9 @@ function(edid_composer_package component package section what)
   set(CPACK_DEBIAN_${upper}_PACKAGE_SECTION ${section} PARENT_SCOPE)
   set(CPACK_DEBIAN_${upper}_PACKAGE_DEPENDS "${depends}" PARENT_SCOPE)
   set(CPACK_COMPONENT_${upper}_DESCRIPTION
-      "EDID composer for boxes with an HDMI input, ${what}\n\
- A repeater, a set-top box or a capture box must present an EDID on its HDMI input. libedid_composer composes it from the \
-display's EDID and the platform's configuration."
+      "EDID composer for boxes with an HDMI input, ${what}.
+A repeater, a set-top box or a capture box presents an EDID on its input.
+libedid_composer makes it, of the display's EDID and a configuration."
       PARENT_SCOPE)
 endfunction()
 
@@ -57,7 +57,7 @@ if(EDID_COMPOSER_HOST)
     edid_composer_package(store ${store} libs "configuration store")
     set(CPACK_DEBIAN_STORE_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/cmake/triggers)
   endif()
-  edid_composer_package(store_development libedid-config-store-dev libdevel "development files of the configuration store"
+  edid_composer_package(store_development libedid-config-store-dev libdevel "configuration store's files for compilers"
                         ${store} libedid-composer-dev)
 endif()
 

@@ -26,7 +26,8 @@ void add_long_numbers(random_source_t &random, test_support::configuration_tree_
     const std::uint64_t wraps_to = random.between(1, 64);
     std::uint64_t number = wraps_to + (std::uint64_t{random.between(0, 3)} << random.between(31, 33));
     if (random.chance(10)) number = random.next();
-    tree.add(random.one_of(lists), std::to_string(number) + (random.chance(30) ? " 1080 59.94" : ""));
+    const char *list = random.one_of(lists);
+    tree.add(list, std::to_string(number) + (random.chance(30) ? " 1080 59.94" : ""));
   }
 }
 
