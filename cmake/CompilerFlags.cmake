@@ -16,7 +16,8 @@ if(EDID_COMPOSER_FUZZ)
   add_compile_options(-fsanitize=fuzzer-no-link)
 endif()
 
-# The library itself: a C ABI outside, no exceptions, no run-time type information, nothing visible but what is exported.
+# The library itself: a C ABI outside, no exceptions, no run-time type information, nothing visible but what is
+# exported.
 add_library(edid_composer_library_flags INTERFACE)
 target_compile_options(edid_composer_library_flags INTERFACE -fno-exceptions -fno-rtti -fno-threadsafe-statics
                                                              -fvisibility=hidden -fvisibility-inlines-hidden)

@@ -1,5 +1,5 @@
-# WebAssembly (web/): what is different with Emscripten's compiler. There are no shared libraries, the return addresses are
-# out of a program's reach, and one file is all that is made.
+# WebAssembly (web/): what is different with Emscripten's compiler. There are no shared libraries, the return addresses
+# are out of a program's reach, and one file is all that is made.
 set(CMAKE_POSITION_INDEPENDENT_CODE OFF)
 set(EDID_COMPOSER_HARDENING OFF)
 set(EDID_COMPOSER_INSTALL OFF)
@@ -8,8 +8,8 @@ set(EDID_COMPOSER_INSTALL OFF)
 add_compile_options(-fwasm-exceptions)
 add_link_options(-fwasm-exceptions)
 
-# What consists of headers only is this machine's. Its folder as a whole, which the packages' own CMake files name, would
-# bring its C library along: so there are links beside the build, and packages that have nothing but them.
+# What consists of headers only is this machine's. Its folder as a whole, which the packages' own CMake files name,
+# would bring its C library along: so there are links beside the build, and packages that have nothing but them.
 set(header_links ${PROJECT_BINARY_DIR}/headers)
 file(MAKE_DIRECTORY ${header_links})
 foreach(header toml++ CLI nlohmann utf8 utf8.h)

@@ -20,7 +20,8 @@ function(edid_composer_install_library target file runtime development)
     DESTINATION ${package_dir}
     COMPONENT ${development})
 
-  # The prefix stands in it as it is: pkg-config puts the folder of a sysroot before it. It is known when it is installed.
+  # The prefix stands in it as it is: pkg-config puts the folder of a sysroot before it. It is known when it is
+  # installed.
   set(prefix "@CMAKE_INSTALL_PREFIX@")
   configure_file(cmake/${file}.pc.in ${file}.pc.in @ONLY)
   install(CODE "configure_file(\"${PROJECT_BINARY_DIR}/${file}.pc.in\" \"${PROJECT_BINARY_DIR}/${file}.pc\" @ONLY)"

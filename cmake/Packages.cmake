@@ -1,5 +1,5 @@
-# Debian packages, one for each component: `cpack` in a build folder that was configured for the prefix /usr, as the preset
-# "package" does. Needs `file` and `dpkg-dev`.
+# Debian packages, one for each component: `cpack` in a build folder that was configured for the prefix /usr, as the
+# preset "package" does. Needs `file` and `dpkg-dev`.
 set(EDID_COMPOSER_PACKAGER
     "libedid_composer contributors"
     CACHE STRING "Who makes the packages, as Debian wants it: NAME <ADDRESS>")
@@ -23,8 +23,8 @@ set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS ON)
 set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 set(CPACK_COMPONENTS_ALL "")
 
-# edid_composer_package(COMPONENT PACKAGE SECTION WHAT DEPENDS...): a package, and what it is: the second half of its first
-# line. It depends on packages of its own version.
+# edid_composer_package(COMPONENT PACKAGE SECTION WHAT DEPENDS...): a package, and what it is: the second half of its
+# first line. It depends on packages of its own version.
 function(edid_composer_package component package section what)
   string(TOUPPER ${component} upper)
   set(depends ${ARGN})
@@ -46,7 +46,8 @@ set(store "")
 if(EDID_COMPOSER_SHARED)
   set(library libedid-composer${PROJECT_VERSION_MAJOR})
   edid_composer_package(runtime ${library} libs "shared library")
-  # The loader is told with a trigger, not by a script that would do so for the running system, whatever is installed into.
+  # The loader is told with a trigger, not by a script that would do so for the running system, whatever is installed
+  # into.
   set(CPACK_DEBIAN_RUNTIME_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/cmake/triggers)
 endif()
 edid_composer_package(development libedid-composer-dev libdevel "development files" ${library})

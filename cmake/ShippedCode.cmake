@@ -40,14 +40,15 @@ macro(edid_composer_ships_from_here flags)
   string(PREPEND CMAKE_SHARED_LINKER_FLAGS "${EDID_COMPOSER_SHIPPED_LINK_FLAGS}")
   string(PREPEND CMAKE_EXE_LINKER_FLAGS "${EDID_COMPOSER_SHIPPED_LINK_FLAGS}")
 endmacro()
-# Containers of the C++ run-time library, which the library itself does without, end the process on an index out of range.
+# Containers of the C++ run-time library, which the library itself does without, end the process on an index out of
+# range.
 set(EDID_COMPOSER_CHECKED_CONTAINERS "")
 if(EDID_COMPOSER_HARDENING)
   set(EDID_COMPOSER_CHECKED_CONTAINERS -D_GLIBCXX_ASSERTIONS)
 endif()
 
-# edid_composer_optimise_less(TARGET|SOURCE NAME FLAG...): for what would take long to compile and runs for a moment. Not
-# where the user has chosen how much to optimise.
+# edid_composer_optimise_less(TARGET|SOURCE NAME FLAG...): for what would take long to compile and runs for a moment.
+# Not where the user has chosen how much to optimise.
 function(edid_composer_optimise_less kind name)
   if(NOT CMAKE_CXX_FLAGS MATCHES "(^| )-O" AND CMAKE_CXX_FLAGS_RELWITHDEBINFO STREQUAL "-O2 -g -DNDEBUG")
     set_property(${kind} ${name} APPEND PROPERTY COMPILE_OPTIONS "$<$<CONFIG:RelWithDebInfo>:${ARGN}>")

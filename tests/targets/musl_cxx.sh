@@ -1,7 +1,7 @@
 #!/bin/sh
-# A C++ compiler for musl as far as Debian has the parts. Files of the library, which are told by their module's name, see
-# musl's headers only; everything else sees glibc's, which Debian's C++ run-time library is made for. All of it is linked
-# with musl, statically.
+# A C++ compiler for musl as far as Debian has the parts. Files of the library, which are told by their module's name,
+# see musl's headers only; everything else sees glibc's, which Debian's C++ run-time library is made for. All of it is
+# linked with musl, statically.
 set -eu
 here=$(cd "$(dirname "$0")" && pwd)
 musl=/usr/lib/x86_64-linux-musl
