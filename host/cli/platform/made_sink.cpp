@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <iterator>
 #include <numeric>
 
 #include "edid_input/edid_file.h"
@@ -71,8 +72,7 @@ constexpr std::size_t most_modes() {
 }  // namespace
 
 std::vector<u8> made_sink(u32 family, std::span<const u32> vics) {
-  std::vector<u8> edid;
-  append(edid, base_block_begin);
+  std::vector<u8> edid(std::begin(base_block_begin), std::end(base_block_begin));
   family == 50 ? append(edid, timing_50) : append(edid, timing_60);
   append(edid, dummy_descriptor);
   append(edid, dummy_descriptor);
