@@ -5,8 +5,8 @@
 #include <vector>
 
 #include "edid_composer/composer_lines.h"
+#include "edid_composer/platform/configuration_keys.h"
 #include "edid_composer/platform/platform_values_reader.h"
-#include "support/configuration_keys.h"
 #include "support/configuration_tree.h"
 #include "support/output_capture.h"
 #include "support/records.h"
@@ -126,12 +126,12 @@ TEST(ConfigurationLog, EveryPathIsAskedForOnceAndFromTheRoot) {
     paths.push_back(call.path.substr(domain.size()));
   }
   std::vector<std::string> expected;
-  for (const configuration_key_t *key : test_support::configuration_keys()) {
-    if (key->kind == CONFIGURATION_AUDIO_FORMATS) {
+  for (const auto &row : edid_composer::platform_keys()) {
+    if (row.key.kind == CONFIGURATION_AUDIO_FORMATS) {
       for (char letter = 'a'; letter <= 'z'; ++letter)
         expected.push_back(std::string("audio.entry_") + letter);
     } else {
-      expected.emplace_back(key->name);
+      expected.emplace_back(row.key.name);
     }
   }
   EXPECT_EQ(paths, expected);
