@@ -3,12 +3,22 @@
 find_program(gzip gzip REQUIRED)
 find_program(strip strip REQUIRED)
 
+# With SOURCE_DATE_EPOCH, its date.
+string(TIMESTAMP date "%a, %d %b %Y %H:%M:%S +0000" UTC)
+set(changes "${CPACK_PACKAGE_NAME} (${CPACK_PACKAGE_VERSION}) unstable; urgency=medium
+
+  * Version ${CPACK_PACKAGE_VERSION}.
+
+ -- ${CPACK_PACKAGE_CONTACT}  ${date}
+")
+
 foreach(component ${CPACK_COMPONENTS_ALL})
   set(tree ${CPACK_TEMPORARY_DIRECTORY}/${component}/usr)
   string(TOUPPER ${component} upper_component)
-  set(copyright ${tree}/share/doc/${CPACK_DEBIAN_${upper_component}_PACKAGE_NAME}/copyright)
-  configure_file(${CPACK_RESOURCE_FILE_LICENSE} ${copyright} COPYONLY)
-  file(CHMOD ${copyright} PERMISSIONS OWNER_READ OWNER_WRITE GROUP_READ WORLD_READ)
+  set(documents ${tree}/share/doc/${CPACK_DEBIAN_${upper_component}_PACKAGE_NAME})
+  configure_file(${CPACK_RESOURCE_FILE_LICENSE} ${documents}/copyright COPYONLY)
+  file(WRITE ${documents}/changelog "${changes}")
+  file(CHMOD ${documents}/copyright ${documents}/changelog PERMISSIONS OWNER_READ OWNER_WRITE GROUP_READ WORLD_READ)
 
   # Libraries are in the system's places, where programs find them by themselves.
   file(GLOB programs ${tree}/bin/*)
@@ -22,8 +32,8 @@ foreach(component ${CPACK_COMPONENTS_ALL})
                     COMMAND_ERROR_IS_FATAL ANY)
   endforeach()
 
-  file(GLOB manuals ${tree}/share/man/man*/*)
-  foreach(manual ${manuals})
-    execute_process(COMMAND ${gzip} -9n ${manual} COMMAND_ERROR_IS_FATAL ANY)
+  file(GLOB compressed ${tree}/share/man/man*/* ${documents}/changelog)
+  foreach(file ${compressed})
+    execute_process(COMMAND ${gzip} -9n ${file} COMMAND_ERROR_IS_FATAL ANY)
   endforeach()
 endforeach()

@@ -8,7 +8,8 @@ cd "$(dirname "$0")/.."
 
 seconds=${1:-1800}
 [ $# -gt 0 ] && shift
-targets=${*:-base_block extension print compose encode hdmi2 store hex_text explain}
+all_targets=$(find fuzz/targets -name '*.cpp' | sed 's/.*fuzz_\(.*\)\.cpp/\1/' | sort | tr '\n' ' ')
+targets=${*:-$all_targets}
 echo "Fuzzing ($targets) for $seconds seconds each, then random properties and valgrind."
 install_packages build-essential cmake ninja-build clang libclang-rt-14-dev python3 libgtest-dev libgmock-dev \
   libtomlplusplus-dev libcli11-dev nlohmann-json3-dev libutfcpp-dev valgrind

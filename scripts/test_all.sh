@@ -10,7 +10,7 @@ cd "$(dirname "$0")/.."
 . scripts/install_packages.sh
 . scripts/run_tests.sh
 
-install_packages doxygen groff-base man-db pkg-config fakeroot file valgrind chromium chromium-driver clang-format
+install_packages doxygen groff-base man-db pkg-config fakeroot file lintian valgrind chromium chromium-driver clang-format
 scripts/test.sh $no_install
 run_tests release_only build/test
 git ls-files '*.h' '*.hpp' '*.c' '*.cpp' | xargs clang-format --dry-run --Werror

@@ -1,6 +1,7 @@
 """What `cmake --install` puts where, and that hosts outside of the tree build on it and run."""
 
 import os
+import pathlib
 import shutil
 import unittest
 
@@ -21,7 +22,7 @@ class Install(scratch.ScratchTest):
     def prepare(cls):
         cls.expected = contents.installed(cls.libdir, os.environ["BUILD_TYPE"])
         cls.prefixes = {component: cls.install(component, [component]) for component in contents.COMPONENTS}
-        # Moved, because nothing that is installed may know its prefix.
+        # Moved: only pkg-config's files know their prefix.
         installed = cls.install("anywhere", contents.COMPONENTS)
         cls.everything = installed.rename(cls.folder / "somewhere else")
         cls.without_store = cls.install("without_store", ["runtime", "development"])
@@ -56,8 +57,8 @@ class Install(scratch.ScratchTest):
                 self.assertEqual(os.readlink(library.with_name(soname)), f"lib{name}.so.{contents.VERSION}")
 
     def test_nothing_that_is_installed_names_the_source_or_the_prefix(self):
-        texts = [path for path in scratch.files_below(self.everything) if path.endswith((".pc", ".cmake", ".h"))]
-        self.assertGreater(len(texts), 8)
+        texts = [path for path in scratch.files_below(self.everything) if path.endswith((".cmake", ".h"))]
+        self.assertGreater(len(texts), 6)
         for path in texts:
             text = (self.everything / path).read_text()
             for place in (self.source, self.build, self.folder):
@@ -77,9 +78,11 @@ class Install(scratch.ScratchTest):
 
     # ---- Hosts with pkg-config
 
-    def pkg_config(self, prefix, *arguments):
+    def pkg_config(self, prefix, *arguments, **environment):
         path = str(prefix / self.libdir / "pkgconfig")
-        flags = scratch.run_or_fail(["pkg-config", *arguments], PKG_CONFIG_PATH=path, PKG_CONFIG_LIBDIR=path).strip()
+        moved = ["--define-prefix"] if prefix == self.everything else []
+        flags = scratch.run_or_fail(["pkg-config", *moved, *arguments], PKG_CONFIG_PATH=path, PKG_CONFIG_LIBDIR=path,
+                                    **environment).strip()
         # pkg-config writes a blank of a path as "\ ".
         return [flag.replace("\0", " ") for flag in flags.replace("\\ ", "\0").split()]
 
@@ -127,6 +130,34 @@ class Install(scratch.ScratchTest):
                     self.assertIn("address FFFF", printed)
                     self.assertIn("libedid_config_store", needed)
                     self.assertEqual("libedid_composer" in needed, not static)
+
+    @unittest.skipUnless(shutil.which("pkg-config"), "pkg-config is not installed")
+    def test_pkg_config_s_files_name_the_prefix_only_so_that_a_sysroot_can_stand_before_it(self):
+        sysroot = self.folder / "sysroot"
+        for component in contents.COMPONENTS:
+            scratch.run_or_fail(["cmake", "--install", self.build, "--prefix", "/usr", "--component", component],
+                                DESTDIR=str(sysroot))
+        for name in ("edid_composer", "edid_config_store"):
+            with self.subTest(package=name):
+                text = (sysroot / "usr" / self.libdir / "pkgconfig" / f"{name}.pc").read_text()
+                self.assertIn("\nprefix=/usr\n", "\n" + text)
+                # Every version puts the sysroot before what begins with the prefix, and 0.29 twice where it stands already.
+                self.assertNotIn("pcfiledir", text)
+                self.assertNotIn(str(sysroot), text)
+        in_sysroot = {"PKG_CONFIG_SYSROOT_DIR": str(sysroot)}
+        flags = self.pkg_config(sysroot / "usr", "--cflags", "--libs", "edid_config_store", **in_sysroot)
+        self.assertIn(f"-I{sysroot}/usr/include/edid_composer", flags)
+        printed, _ = self.build_and_run(sysroot / "usr", C, self.store_host, flags)
+        self.assertIn(STORE_HOST_SHOWS, printed)
+        archive = self.pkg_config(sysroot / "usr", "--variable=archive", "edid_composer", **in_sysroot)
+        self.assertTrue(pathlib.Path(archive[0]).samefile(sysroot / "usr" / self.libdir / "libedid_composer.a"), archive)
+
+    @unittest.skipUnless(shutil.which("pkg-config"), "pkg-config is not installed")
+    def test_hosts_link_the_static_store_with_pkg_config(self):
+        flags = ["-static", *self.pkg_config(self.everything, "--cflags", "--static", "--libs", "edid_config_store")]
+        printed, needed = self.build_and_run(self.everything, C, self.store_host, flags)
+        self.assertIn(STORE_HOST_SHOWS, printed)
+        self.assertEqual(needed, set())
 
     # ---- Hosts with CMake
 

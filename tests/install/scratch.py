@@ -7,19 +7,19 @@ import tempfile
 import unittest
 
 
-def run(command, **environment):
+def run(command, timeout=120, **environment):
     """Runs a command; its exit status and what it printed, standard error in its place among standard output."""
     without = ("CPATH", "LIBRARY_PATH", "LD_LIBRARY_PATH", "CMAKE_PREFIX_PATH", "DESTDIR")
     inherited = {name: value for name, value in os.environ.items() if name not in without}
     done = subprocess.run([str(word) for word in command], env={**inherited, "LC_ALL": "C", **environment}, text=True,
-                          stdin=subprocess.DEVNULL, stdout=subprocess.PIPE, stderr=subprocess.STDOUT, timeout=120,
+                          stdin=subprocess.DEVNULL, stdout=subprocess.PIPE, stderr=subprocess.STDOUT, timeout=timeout,
                           check=False)
     return done.returncode, done.stdout
 
 
-def run_or_fail(command, **environment):
+def run_or_fail(command, timeout=120, **environment):
     """Runs a command that must succeed; what it printed."""
-    status, printed = run(command, **environment)
+    status, printed = run(command, timeout, **environment)
     if status != 0:
         told = " ".join(str(word) for word in command)
         raise AssertionError(f"{told}\nended with status {status} and printed:\n{printed}")

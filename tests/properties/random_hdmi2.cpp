@@ -146,6 +146,7 @@ hdmi2_values_t random_hdmi2_values(random_source_t &random) {
     set("pass_dolby_vision", &values.pass_dolby_vision);
     set("pass_freesync", &values.pass_freesync);
   }
+  if (random.chance(60)) values.tmds_limit = 600;
   values.deep_color = random.flag() != 0 ? 2 : 0;
   return values;
 }

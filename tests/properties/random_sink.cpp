@@ -141,7 +141,8 @@ bytes_t random_bytes_of_a_sink(random_source_t &random) {
     for (u32 i = random.between(1, 8); i > 0; --i)
       bytes[random.between(8, static_cast<u32>(bytes.size()) - 1)] = random.byte();
   }
-  bytes.resize(block_size * random.between(0, 4), random.byte());
+  const u32 blocks = random.between(0, 4);
+  bytes.resize(block_size * blocks, random.byte());
   for (std::size_t offset = 0; offset < bytes.size(); offset += block_size) {
     if (random.chance(95)) test_support::mend_checksum(bytes, offset);
   }

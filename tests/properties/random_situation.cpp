@@ -13,7 +13,7 @@ using test_support::platform_configuration_t;
 std::vector<test_support::mode_pair_t> random_modes(random_source_t &random, u32 most) {
   std::vector<test_support::mode_pair_t> modes;
   for (u32 i = random.between(0, most); i > 0; --i)
-    modes.emplace_back(random_vic(random, 64), random.between(0, 7));
+    modes.push_back({random_vic(random, 64), random.between(0, 7)});
   return modes;
 }
 
@@ -30,7 +30,8 @@ std::vector<i32> random_audio_entries(random_source_t &random) {
   for (u32 i = random.between(0, 8); i > 0; --i) {
     const u32 type = random.chance(95) ? random.between(1, 14) : random.between(0, 15);
     const u32 third = type == 15 ? random.between(1, 3) << 3 : random.byte();
-    entries.push_back(static_cast<i32>(third << 16 | random.between(0, 127) << 8 | type << 3 | random.between(0, 7)));
+    const u32 frequencies = random.between(0, 127);
+    entries.push_back(static_cast<i32>(third << 16 | frequencies << 8 | type << 3 | random.between(0, 7)));
   }
   return entries;
 }

@@ -1,4 +1,5 @@
-// Random numbers that are the same on every machine for the same seed.
+// Random numbers that are the same on every machine for the same seed: as long as no two are drawn in one expression
+// that leaves their order to the compiler, as arguments of a call do.
 #pragma once
 
 #include <array>

@@ -151,7 +151,7 @@ const std::map<std::string, outcome_t> &outcomes() {
       {"linked_list:N:ll_copy_list() BUG: Failed creating entry for the destination list.\n" +
            of_composing("ERROR: Failed populating the new edid."),
        outcome_t::refused},
-      {error(of_composer + "change_record") + of_composing("ERROR: Failed adding HDMI 2 to the new edid."),
+      {error(of_composer + "change_record") + of_composing("ERROR: Failed adding HDMI # to the new edid."),
        outcome_t::refused},
       // Of the explanation.
       {error(of_composer + "compose_edid_internal"), outcome_t::untold},

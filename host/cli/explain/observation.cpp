@@ -6,9 +6,12 @@ namespace edid_cli {
 namespace {
 
 /// None of no sink. Unseen: the composition decodes it as well, and passes on what the library says of it.
-std::unique_ptr<decoded_edid_t> decoded(const std::vector<u8> &bytes) {
+std::optional<decoded_edid_t> decoded(const std::vector<u8> &bytes) {
   const discarded_output_t unseen;
-  return bytes.empty() ? nullptr : std::make_unique<decoded_edid_t>(bytes);
+  if (bytes.empty()) {
+    return std::nullopt;
+  }
+  return std::optional<decoded_edid_t>(std::in_place, bytes);
 }
 
 }  // namespace

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <iterator>
 #include <numeric>
 
 #include "edid_input/edid_file.h"
@@ -115,8 +116,7 @@ void append_hdmi2_extension(std::vector<u8> &edid, std::span<const u32> vics) {
 }  // namespace
 
 std::vector<u8> made_sink(u32 family, std::span<const u32> vics, std::span<const u32> extended_vics) {
-  std::vector<u8> edid;
-  append(edid, base_block_begin);
+  std::vector<u8> edid(std::begin(base_block_begin), std::end(base_block_begin));
   family == 50 ? append(edid, timing_50) : append(edid, timing_60);
   append(edid, dummy_descriptor);
   append(edid, dummy_descriptor);

@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cinttypes>
 #include <cstdio>
 #include <cstring>
 #include <random>
@@ -19,8 +20,8 @@ void expect_as_scanf(const std::string &text) {
   video_mode_words_t words{-7, {"first", "second", "third"}};
   video_mode_words_t scanned = words;
   const int fields = _scan_video_mode(text.c_str(), &words);
-  const int scanned_fields =
-      std::sscanf(text.c_str(), "%ld%9s%9s%9s", &scanned.number, scanned.flags[0], scanned.flags[1], scanned.flags[2]);
+  const int scanned_fields = std::sscanf(text.c_str(), "%" SCNd64 "%9s%9s%9s", &scanned.number, scanned.flags[0],
+                                         scanned.flags[1], scanned.flags[2]);
   // scanf tells a text that ends before any number (EOF) from one that holds something else.
   ASSERT_EQ(fields, scanned_fields < 0 ? 0 : scanned_fields) << testing::PrintToString(text);
   if (fields == 0) return;
