@@ -58,6 +58,28 @@ def of_library(scratch):
     return keys
 
 
+def of_hdmi2(scratch):
+    """The same of the table hdmi2, whose missing keys have their defaults without a word: the traces have them."""
+    table = f"[{platform_keys.DOMAIN}.hdmi2]\n"
+    read = re.compile(rf"Platform config read\. Path:{re.escape(platform_keys.DOMAIN)}\.(hdmi2\.\S+) val:(-?\d+)")
+    limited = re.compile(r"The value of (hdmi2\.\S+) is \w+ than .* Min:(-?\d+) Val:-?\d+ Max:(-?\d+)")
+    in_list = re.compile(r"(hdmi2\.\S+) holds a VIC that is not supported")
+
+    def compose(text):
+        return scratch.run(["edid-composer", "compose", "--debug", "--platform", "-", "-o", "-"], text.encode())[1]
+
+    defaults = dict(read.findall(compose(table + "enable = 1\n")))
+    names = [name.removeprefix("hdmi2.") for name in defaults]
+    limits = {}
+    for value in (SMALLEST, 2147483647):
+        enable = max(value, 1)  # Without it, no other key is read.
+        text = table + f"enable = {enable}\n" + "".join(f"{name} = {value}\n" for name in names)
+        limits.update({name: (low, high) for name, low, high in limited.findall(compose(text))})
+    keys = {name: (*limits[name], default) for name, default in (defaults | {"hdmi2.enable": "0"}).items()}
+    lists = compose(table + "enable = 1\nvic_priority_list = [1]\nvic_addition_list = [1]\n")
+    return keys | dict.fromkeys(in_list.findall(lists))
+
+
 def of_table(text):
     """The same from the library's own table."""
     keys = {}
@@ -82,8 +104,8 @@ def comment_problems(text, library):
     for block in re.split(r"\n\n", text):
         comment = " ".join(line.lstrip("# ") for line in block.splitlines() if line.startswith("#"))
         for name in re.findall(r"^(\w+) = ", block, re.MULTILINE):
-            key = name if name in library else f"audio.{name}"
-            if not library.get(key):
+            key = next((key for key in (name, f"audio.{name}", f"hdmi2.{name}") if library.get(key)), None)
+            if key is None:
                 continue
             low, high, default = library[key]
             if not re.search(limits_in_words(low, high), comment):
@@ -117,11 +139,11 @@ def main():
         "docs/man/edid-platform.toml.5": of_man_page,
     }
     with scratch_folder.Scratch(arguments.source, arguments.prefix, arguments.libdir) as scratch:
-        library = of_library(scratch)
+        library = of_library(scratch) | of_hdmi2(scratch)
         table = of_table(scratch.run(["edid-composer", "platform", "--keys"], b"")[1])
     found = list(problems(table, library, "edid-composer platform --keys"))
-    platform = arguments.source / "host/config_store/platform.toml"
-    found += comment_problems(platform.read_text(), library)
+    for platform in ("platform.toml", "platform_hdmi2.toml"):
+        found += comment_problems((arguments.source / "host/config_store" / platform).read_text(), library)
     for name, reader in documents.items():
         found += problems(reader((arguments.source / name).read_text()), library, name)
     for problem in found:

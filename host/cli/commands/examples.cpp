@@ -40,6 +40,7 @@ constexpr example_t examples[] = {
     {"check-platform", "A platform before it ships:", "edid-composer check-platform box.toml"},
     {"audio-mask", "PCM and AC-3:", "edid-composer audio-mask 0x3"},
     {"platform", "A platform to start from:", "edid-composer platform > box.toml"},
+    {"platform", "One for 4K60 and HDR:", "edid-composer platform --hdmi2 > box.toml"},
 };
 
 }  // namespace

@@ -108,7 +108,7 @@ command_t explain_command() {
   options.insert(options.end(), {option(
                                      "--want", "MODE", target->want, [](const std::string &text) { return text; },
                                      "Print whether one mode or format is offered, why, and what to change: 1080p60, "
-                                     "4k30, vic 16, pcm8, ac3, 3d, deep-color"),
+                                     "4k30, vic 16, pcm8, ac3, 3d, deep-color, hdr10, vrr"),
                                  flag("--wide", target->wide, "Print where each row comes from, without wrapping"),
                                  flag("--json", target->json, "Print a JSON document"),
                                  option("--html", "FILE", target->html_file, parse_file_name,

@@ -123,7 +123,7 @@ std::string reason_in_common(const row_t &row, const sink_reading_t &reading) {
 std::vector<common_reason_t> common_reasons(const std::vector<row_t> &rows, const sink_reading_t &reading) {
   std::vector<common_reason_t> reasons;
   for (const row_t &row : rows) {
-    if (is_of_values(row.section) || row.is_offered()) {
+    if (is_of_values(row.section) || row.is_offered() || row.is_offered_otherwise) {
       continue;
     }
     const std::string text = reason_in_common(row, reading);

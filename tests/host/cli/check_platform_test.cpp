@@ -514,5 +514,60 @@ TEST_F(CheckPlatform, TheLibrarysOwnLinesDoNotShow) {
   EXPECT_THAT(result.output, Not(HasSubstr("print_platform_node")));
 }
 
+/// The findings about the table of HDMI 2, without place and severity.
+class CheckHdmi2 : public CheckPlatform {
+ protected:
+  std::vector<std::string> about(const std::string &keys) {
+    std::vector<std::string> texts;
+    for (const std::string &finding : findings(complete_with() + "[" + domain + ".hdmi2]\n" + keys)) {
+      const std::size_t key = finding.find("hdmi2");
+      texts.push_back(key == std::string::npos ? finding : finding.substr(key));
+    }
+    return texts;
+  }
+};
+
+TEST_F(CheckHdmi2, FindsNothingInTheTableThatTheProgramPrints) {
+  const std::string printed = run_cli({"platform", "--hdmi2"}).output;
+  EXPECT_EQ(counted(findings(printed), "warning"), 0U);
+  EXPECT_EQ(counted(findings(printed), "error"), 0U);
+}
+
+TEST_F(CheckHdmi2, FindsKeysThatContradictEachOther) {
+  const std::string on = "enable = 1\nvic_priority_list = [97]\ntmds_limit = 600\n";
+  const std::string bt2020 = "bt2020_ycc = 2\n";
+  EXPECT_THAT(about(on), ElementsAre());
+  EXPECT_THAT(about(on + bt2020 + "hdr_pq = 2\n"), ElementsAre());
+  EXPECT_THAT(about(on + "hdr_pq = 2\n"), ElementsAre(HasSubstr("hdr_pq: HDR with PQ needs BT.2020")));
+  EXPECT_THAT(about(on + "hdr_hlg = 1\n"), ElementsAre(HasSubstr("hdr_hlg: HDR with HLG needs BT.2020")));
+  EXPECT_THAT(about(on + "y420 = 2\ndc_36bit_420 = 2\n"), ElementsAre(HasSubstr("ask for 30 bits as well")));
+  EXPECT_THAT(about(on + "dc_30bit_420 = 2\n"), ElementsAre(HasSubstr("has no effect: y420 is 0")));
+  EXPECT_THAT(about(on + "vrr = 1\nvrr_max = 90\n"), ElementsAre(HasSubstr("ends below 100 Hz")));
+  EXPECT_THAT(about(on + "pass_freesync = 1\n"), ElementsAre(HasSubstr("with vrr = 2 only")));
+  EXPECT_THAT(about("enable = 1\nvic_priority_list = [95]\nread_request = 1\n"),
+              ElementsAre(HasSubstr("read_request: has no effect")));
+  EXPECT_THAT(
+      about("enable = 1\npreferred_extended = 1\n"),
+      ElementsAre(HasSubstr("vic_priority_list: names no mode"), HasSubstr("preferred_extended: has no effect")));
+  EXPECT_THAT(about("allm = 1\n"), ElementsAre(HasSubstr("has no effect: enable is not 1")));
+}
+
+TEST_F(CheckHdmi2, FindsModesThatNobodyCanGet) {
+  EXPECT_THAT(about("enable = 1\nvic_priority_list = [97, 95]\n"),
+              ElementsAre("hdmi2.vic_priority_list[0]: no composition can offer VIC 97: it needs 594 MHz, and "
+                          "tmds_limit is 340"));
+  EXPECT_THAT(about("enable = 1\nvic_priority_list = [97]\ny420 = 2\n"), ElementsAre());
+  EXPECT_THAT(about("enable = 1\nvic_priority_list = [95]\nvic_addition_list = [94]\n"),
+              ElementsAre(HasSubstr("hdmi2.vic_priority_list does not name it")));
+}
+
+TEST_F(CheckHdmi2, FindsUnknownKeysLimitsAndEntries) {
+  const std::string on = "enable = 1\nvic_priority_list = [95]\n";
+  EXPECT_THAT(about(on + "alm = 1\n"), ElementsAre(HasSubstr("did you mean hdmi2.allm?")));
+  EXPECT_THAT(about(on + "tmds_limit = 900\n"), ElementsAre(HasSubstr("900 is not within 165 to 600: 600 is taken")));
+  EXPECT_THAT(about("enable = 1\nvic_priority_list = [95, 16]\n"),
+              ElementsAre(HasSubstr("passed over: VIC 16 is not within 65 to 127 or 193 to 219")));
+}
+
 }  // namespace
 }  // namespace host_test

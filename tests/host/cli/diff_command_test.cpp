@@ -52,6 +52,14 @@ TEST_F(DiffCommand, OfTheSameEdidMarksNothingAndEndsWithStatusZero) {
   }
 }
 
+TEST_F(DiffCommand, ComparesWhatHdmi2Added) {
+  const process_result_t result = diff(sample_bytes("tv_4k_hdr"), sample_bytes("gaming_monitor"));
+  EXPECT_EQ(result.status, 1);
+  EXPECT_THAT(result.output, ContainsRegex("\n   highest TMDS rate +600 MHz +600 MHz\n"));
+  EXPECT_THAT(result.output, ContainsRegex("\n\\*  auto low-latency mode +- +yes\n"));
+  EXPECT_THAT(result.output, ContainsRegex("\n\\*  transfer function +HLG +-\n"));
+}
+
 TEST_F(DiffCommand, ShowsBothSidesAndMarksWhatDiffers) {
   const process_result_t result = diff(tv_, changed(tv_, 16, 33));
   EXPECT_EQ(result.status, 1);

@@ -123,6 +123,40 @@ TEST_F(ByteNames, OfADataBlockOfNoKnownKind) {
   expect(136, byte_block_t::video, "Video data block", "14 bytes follow");
 }
 
+TEST_F(ByteNames, OfTheDataBlocksOfHdmi2) {
+  edid_ = read_edid_file(std::string(SAMPLE_SINKS_DIRECTORY) + "/tv_4k_hdr.txt");
+  fields_ = name_bytes(edid_);
+  expect_complete(fields_);
+  expect(133, byte_block_t::video, "Video descriptor 1", "3840x2160p60 16:9 (VIC 97)");
+  expect(182, byte_block_t::forum, "HDMI Forum data block", "7 bytes follow");
+  expect(187, byte_block_t::forum, "Highest TMDS rate", "600 MHz");
+  expect(189, byte_block_t::forum, "Fixed rate link, UHD and deep colour in 4:2:0",
+         "fixed rate link: none; VICs of the modes that have an HDMI_VIC, 36 bits in 4:2:0, 30 bits in 4:2:0");
+  expect(192, byte_block_t::colorimetry, "Colorimetry", "BT2020YCC, BT2020RGB");
+  expect(196, byte_block_t::hdr, "Transfer functions", "SDR, PQ (SMPTE ST 2084), HLG");
+  expect(198, byte_block_t::hdr, "Highest luminance", "644.20 cd/m2");
+  expect(200, byte_block_t::hdr, "Lowest luminance", "0.1431 cd/m2");
+  expect(206, byte_block_t::y420, "Video descriptors 1 to 8", "in 4:2:0 too: video descriptor 1, 2, 6, 7");
+  expect(213, byte_block_t::hdr, "Dolby Vision data block", "11 bytes follow");
+}
+
+TEST_F(ByteNames, OfEveryExtension) {
+  const std::vector<u8> two = read_edid_file(std::string(SAMPLE_SINKS_DIRECTORY) + "/gaming_monitor.txt");
+  edid_ = two;
+  edid_.insert(edid_.end(), two.begin() + 128, two.end());
+  edid_.insert(edid_.end(), 128, 0x70);
+  fields_ = name_bytes(edid_);
+  std::size_t named = 0;
+  for (const byte_field_t &field : fields_) {
+    EXPECT_EQ(field.offset, named);
+    named += field.size;
+  }
+  EXPECT_EQ(named, edid_.size());
+  EXPECT_EQ(field_at(fields_, 128 + 5).meaning, field_at(fields_, 256 + 5).meaning);
+  expect(256 + 5, byte_block_t::video, "Video descriptor 1", "3840x2160p60 16:9 (VIC 97)");
+  expect(384, byte_block_t::extension, "Extension tag", "0x70: not CTA-861");
+}
+
 TEST_F(ByteNames, AWrongChecksumIsToldAsWrong) {
   edid_[20] ^= 1;
   fields_ = name_bytes(edid_);

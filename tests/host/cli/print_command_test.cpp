@@ -37,6 +37,19 @@ TEST_F(PrintCommand, BriefPrintsTheShortReport) {
   EXPECT_THAT(result.output, Not(HasSubstr("Version.Revision")));
 }
 
+TEST_F(PrintCommand, ASecondReportFollowsOnHdmi2) {
+  const process_result_t result = run_cli({"print", sample_sink("tv_4k_hdr")});
+  EXPECT_EQ(result.status, 0);
+  EXPECT_THAT(result.output, HasSubstr("\n\ntv_4k_hdr.txt: HDMI 2\n"));
+  EXPECT_THAT(result.output, HasSubstr("\t97\t3840x2160p60Hz16x9 YCbCr 4:2:0\n"));
+  EXPECT_THAT(result.output, HasSubstr("Max TMDS rate           = 600 MHz\n"));
+}
+
+TEST_F(PrintCommand, ThereIsNoSecondReportInShortOrWithoutSuchBlocks) {
+  EXPECT_THAT(run_cli({"print", "--brief", sample_sink("tv_4k_hdr")}).output, Not(HasSubstr(": HDMI 2\n")));
+  EXPECT_THAT(run_cli({"print", sample_sink("monitor_base_block")}).output, Not(HasSubstr(": HDMI 2\n")));
+}
+
 TEST_F(PrintCommand, EverySampleSinkPrintsWithoutASingleComplaint) {
   for (const char *name : sample_names) {
     const process_result_t result = run_cli({"print", sample_sink(name)});

@@ -35,11 +35,14 @@ const showSummary = explanation => {
       title, ": ", element("b", {}, `${offered} offered`), `, ${leftOutCount} left out`))));
 };
 
+/** Of the sections that the summary does not count. */
+const SECTION_TITLES = { derived: "Derived values", hdmi2: "HDMI 2" };
+
 const sectionTitles = ({ summary, decisions }) => {
   const titles = new Map(summary.counts.map(({ section, title }) => [section, title]));
   for (const { section } of decisions) {
     if (!titles.has(section)) {
-      titles.set(section, section === "derived" ? "Derived values" : section[0].toUpperCase() + section.slice(1));
+      titles.set(section, SECTION_TITLES[section] || section[0].toUpperCase() + section.slice(1));
     }
   }
   return titles;
@@ -47,7 +50,7 @@ const sectionTitles = ({ summary, decisions }) => {
 
 /** The class of a verdict; one that is new has none. */
 const verdictClass = ({ verdict, section }) =>
-  ({ "offered": "offered", "changed": "changed", "left out": section === "derived" ? "idle" : "out" })[verdict] || "";
+  ({ "offered": "offered", "changed": "changed", "left out": section === "derived" || section === "hdmi2" ? "idle" : "out" })[verdict] || "";
 
 const decisionFilter = { text: "", verdict: "", section: "" };
 
