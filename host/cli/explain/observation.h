@@ -1,7 +1,7 @@
 // A composition that is observed, and what an explanation of it rests on.
 #pragma once
 
-#include <optional>
+#include <memory>
 #include <string>
 #include <vector>
 
