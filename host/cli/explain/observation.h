@@ -1,7 +1,7 @@
 // A composition that is observed, and what an explanation of it rests on.
 #pragma once
 
-#include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
