@@ -8,8 +8,8 @@ import pathlib
 import re
 
 # In this order they are one script; a name is made before what uses it when it begins.
-SCRIPTS = ["elements", "core", "state", "editor", "inputs", "results", "bytes", "comparison", "want", "tabs", "downloads",
-           "page"]
+SCRIPTS = ["elements", "core", "state", "link", "editor", "files", "displays", "settings", "platform", "summary", "decisions",
+           "bytes", "comparison", "texts", "want", "tabs", "downloads", "page"]
 # Nothing may be asked for, or sent; scripts and styles are the file's own, by their hashes.
 POLICY = {
     "default-src": "'none'",

@@ -68,8 +68,12 @@ class Composing(page.PageTest):
 
     def test_settings_are_those_of_the_program_and_their_mistakes_stand_below_them(self):
         settings = self.ask("about")["settings"]
-        self.assertEqual([setting["name"] for setting in settings],
-                         ["port", "current-mode", "audio-mask", "audio-sink-filter", "3d", "latency"])
+        help_text = page.run_program("compose", "--help")
+        for setting in settings:
+            self.assertIn(f"--{setting['name']}", help_text)
+            self.assertEqual(len(self.texts(f"#setting-{setting['name']}")), 1)
+        self.assertGreaterEqual({setting["name"] for setting in settings},
+                                {"port", "current-mode", "audio-mask", "audio-sink-filter", "3d", "latency"})
         self.drop("tv_4k.txt", (page.SOURCE / "examples/sinks/tv_4k.txt").read_bytes())
         self.browser.click("#tab-report")
         self.browser.press("#setting-port", "3")

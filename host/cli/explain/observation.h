@@ -1,7 +1,7 @@
 // A composition that is observed, and what an explanation of it rests on.
 #pragma once
 
-#include <optional>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -32,7 +32,7 @@ class observation_t {
   given_sink_t sink_;
   platform_places_t places_;
   composition_t composition_;
-  std::unique_ptr<decoded_edid_t> decoded_sink_;  ///< As far as the composition has read it.
+  std::optional<decoded_edid_t> decoded_sink_;  ///< As far as the composition has read it.
   sink_reading_t reading_;
 };
 

@@ -41,24 +41,26 @@ const showBytes = ({ explanation }) => {
     cells.push(colored(element("button", { type: "button", class: "byte", tabindex: offset ? -1 : 0,
       "aria-label": `${hexNumber(offset)}: ${hexNumber(byte)}, ${field.name}`,
       onfocus: () => tell(offset), onmouseenter: () => tell(offset), onclick: () => tell(offset),
-      onkeydown: event => step(event, offset) }, byte.toString(16).toUpperCase().padStart(2, "0")), field.part));
+      onkeydown: event => step(event, offset) }, hexDigits(byte)), field.part));
   });
 
   /** Lines of 16, or of 8 on a narrow screen: the second half has an offset of its own, shown there only. */
-  const block = begin => element("div", { class: "grid" }, cells.slice(begin, begin + BLOCK_SIZE).flatMap((cell, index) =>
-    index % 8 ? [cell] : [element("span", { class: index % 16 ? "half" : "", "aria-hidden": "true" }, hexNumber(begin + index).slice(2)), cell]));
+  const offsetOf = index =>
+    element("span", { class: index % 16 ? "half" : "", "aria-hidden": "true" }, hexDigits(index));
+  const block = begin => element("div", { class: "grid" }, cells.slice(begin, begin + BLOCK_SIZE).map((cell, index) =>
+    [index % 8 ? null : offsetOf(begin + index), cell]));
   const blocks = [];
   for (let begin = 0; begin < bytes.length; begin += BLOCK_SIZE) {
     blocks.push(element("h4", {}, begin ? "CEA-861 extension" : "Base block"), block(begin));
   }
 
   const rows = fields.map(field => [hexNumber(field.offset),
-    element("code", {}, bytes.slice(field.offset, field.offset + field.size).map(byte => byte.toString(16).toUpperCase().padStart(2, "0")).join(" ")),
+    element("code", {}, bytes.slice(field.offset, field.offset + field.size).map(hexDigits).join(" ")),
     colored(element("span", { class: "part" }, field.part), field.part), field.name, field.meaning]);
   const fieldTable = table(["Offset", "Bytes", "Part", "Field", "Meaning"], rows);
   fieldTable.className = "bytewise";
   fill(byId("bytes"), element("h3", {}, `The ${bytes.length} bytes`),
-    element("p", { class: "quiet hint" }, "Point at, tap or move to a byte with the arrow keys: what it means stands below."),
+    element("p", { class: "quiet hint" }, "Point at, tap or move to a byte with the arrow keys: its meaning is below."),
     blocks, now, element("h4", {}, "Byte by byte"), fieldTable);
   tell(0);
 };

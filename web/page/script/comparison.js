@@ -7,7 +7,8 @@ let lastHex = "";  // The new EDID as text.
 
 /** What can be compared, by a key that stays when the list of displays changes. */
 const comparable = () => {
-  const entries = state.sinks.map((sink, index) => [index === state.active ? "sink" : `display ${index}`, sink.name, sink]);
+  const keyOf = index => index === state.active ? "sink" : `display ${index}`;
+  const entries = state.sinks.map((sink, index) => [keyOf(index), sink.name, sink]);
   return [...entries, ["new", "new EDID", { name: "new EDID", text: lastHex }]];
 };
 
@@ -50,12 +51,13 @@ const showDifferences = ({ explanation, hex }) => {
     differences[side] = event.target.value;
     draw();
   } }, choices.map(([key, name]) => element("option", { value: key, selected: differences[side] === key }, name))));
+  const changesOnly = element("input", { type: "checkbox", checked: differences.changesOnly, onchange: event => {
+    differences.changesOnly = event.target.checked;
+    draw();
+  } });
   fill(byId("differences"), element("h3", {}, "Field by field"),
     element("div", { class: "filters" }, select("left", "Left "), select("right", "Right "),
-      element("label", { class: "check" }, element("input", { type: "checkbox", checked: differences.changesOnly, onchange: event => {
-        differences.changesOnly = event.target.checked;
-        draw();
-      } }), " only what differs")), body);
+      element("label", {}, changesOnly, " only what differs")), body);
   draw();
 };
 
@@ -70,9 +72,11 @@ const showDisplays = async () => {
     } }, sink.name);
     try {
       const { explanation, problems } = await core.ask("compose", composition(sink));
-      return explanation
-        ? [name, explanation.summary.best_video || "none", explanation.summary.preferred_video || "none", lines(explanation.summary.audio), lines(explanation.summary.lost.slice(0, SHOWN_LOST))]
-        : [name, problems.map(problem => problem.text).join("; "), "", "", ""];
+      if (!explanation) {
+        return [name, problems.map(problem => problem.text).join("; "), "", "", ""];
+      }
+      const { best_video: best, preferred_video: preferred, audio, lost } = explanation.summary;
+      return [name, best || "none", preferred || "none", lines(audio), lostOf(lost)];
     } catch (failure) {
       return [name, failure.message, "", "", ""];
     }

@@ -1,11 +1,12 @@
-// The platform's text with line numbers, and with findings at their lines. Only the lines that can be seen are drawn, so
-// that a text of any length costs the same.
+// The platform's text with line numbers, and with findings at their lines. Of these, only those that can be seen are
+// drawn.
 
 const editor = (() => {
   const MARKS = { error: "✕", warning: "!", note: "i" };
   // A browser lays out the whole text at once, and stands still as long.
   const MOST_LINES = 5000;
   const MOST_CHARACTERS = 256 * 1024;
+  const MOST_SEEN = 300;  // Characters of a line.
   const LINE = 20;  // Pixels, as in the style sheet.
   const MARGIN = 8;
   const field = byId("platform-text");
@@ -28,7 +29,8 @@ const editor = (() => {
     const here = findings.get(line);
     const said = here.map(finding => finding.text).join("; ");
     const mark = element("div", { class: severest(here) },
-      element("span", { class: "ghost" }, lines[line - 1].slice(0, 300)), element("span", { class: "said" }, said.slice(0, 300)));
+      element("span", { class: "ghost" }, lines[line - 1].slice(0, MOST_SEEN)),
+      element("span", { class: "said" }, said.slice(0, MOST_SEEN)));
     mark.style.top = `${top}px`;
     return mark;
   };

@@ -32,7 +32,7 @@ const fillAnew = (node, content, make) => {
   }
 };
 
-/** A table with headers. Each row is a list of cells, the first of which names it where @p named; a cell is a text or an element. */
+/** A table with headers. Each row is a list of cells, texts or elements; the first names the row where @p named. */
 const table = (headers, rows, named = true) => element("table", {},
   element("thead", {}, element("tr", {}, headers.map(header => element("th", { scope: "col" }, header)))),
   element("tbody", {}, rows.map(row => tableRow(headers, row, named))));
@@ -48,5 +48,10 @@ const limited = (list, most = MOST_ROWS) => list.slice(0, most);
 const leftOut = (list, most = MOST_ROWS) => list.length <= most ? null
   : element("p", { class: "quiet" }, `${list.length - most} more are not shown.`);
 
-const hexNumber = (value, digits = 2) => "0x" + value.toString(16).toUpperCase().padStart(digits, "0");
+const hexDigits = value => value.toString(16).toUpperCase().padStart(2, "0");
+const hexNumber = value => `0x${hexDigits(value)}`;
+/** Leads to a line of the platform. */
+const lineLink = (line, text = `line ${line}`) =>
+  element("button", { type: "button", class: "source", onclick: () => editor.goTo(line) }, text);
+
 const counted = (number, noun) => `${number} ${noun}${number === 1 ? "" : "s"}`;

@@ -10,8 +10,9 @@ const show = result => {
   const ofPlatform = problems.filter(problem => problem.place === "platform" && problem.line)
     .map(problem => ({ severity: "error", key: "", ...problem }));
   // What is wrong with the settings' table of a platform is among the findings already.
-  const isFound = problem => result.findings.some(finding => finding.line === problem.line && finding.severity === "error");
-  platform.showFindings([...ofPlatform.filter(problem => !isFound(problem)), ...result.findings], result.findings_in_all || 0);
+  const isFound = ({ line }) => result.findings.some(finding => finding.line === line && finding.severity === "error");
+  const findings = [...ofPlatform.filter(problem => !isFound(problem)), ...result.findings];
+  platform.showFindings(findings, result.findings_in_all || 0);
   settings.complain(problems);
   showProblems(problems);
   byId("results").classList.toggle("old", !explanation);
@@ -22,8 +23,7 @@ const show = result => {
   }
   byId("title").textContent = explanation.title;
   document.title = explanation.title;
-  byId("footer").firstChild.data = `${explanation.program}, composed in ${Math.max(1, Math.round(result.milliseconds))} ms. ` +
-    "One file, no requests: save this page, and it works without a network.";
+  byId("made").textContent = `${explanation.program}, composed in ${Math.max(1, Math.round(result.milliseconds))} ms.`;
   showSummary(explanation);
   announceSummary(explanation);
   tabs.show(result);

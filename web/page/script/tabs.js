@@ -1,7 +1,7 @@
 // The parts of a result behind tabs. One that is not seen is drawn when it is opened, or printed.
 
 const tabs = (() => {
-  /** How each is drawn, and from what: while that is the same, what is drawn stays, with its scroll bar and the focus in it. */
+  /** How each is drawn, and from what: while that is the same, what is drawn stays, and so do focus and scroll bar. */
   const parts = {
     decisions: [showDecisions, ({ explanation }) => explanation.decisions],
     bytes: [showBytes, ({ explanation }) => explanation.edid],
@@ -57,8 +57,9 @@ const tabs = (() => {
 
   return {
     listen: () => {
-      buttons = panels.map(panel => element("button", { type: "button", role: "tab", id: `tab-${panel.id}`, "data-panel": panel.id,
-        "aria-controls": panel.id, onclick: () => show(panel.id, false), onkeydown: step }, panel.dataset.tab));
+      buttons = panels.map(panel => element("button", { type: "button", role: "tab", id: `tab-${panel.id}`,
+        "data-panel": panel.id, "aria-controls": panel.id, onclick: () => show(panel.id, false),
+        onkeydown: step }, panel.dataset.tab));
       panels.forEach(panel => panel.setAttribute("aria-labelledby", `tab-${panel.id}`));
       fill(byId("tabs"), buttons);
       show(open, false);

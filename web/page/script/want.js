@@ -34,13 +34,15 @@ const want = (() => {
 
   const way = (steps, answer, number, isOther) => element("div", { class: "way" },
     element("p", {}, isOther ? "Or:" : "To have it offered:"),
-    element("ul", {}, steps.map(step => element("li", {}, step.text, step.line
-      ? [" ", element("button", { type: "button", class: "source", onclick: () => editor.goTo(step.line) }, `line ${step.line}`)] : null))),
+    element("ul", {}, steps.map(step => element("li", {}, step.text, step.line ? [" ", lineLink(step.line)] : null))),
     element("button", { type: "button", class: isOther ? "" : "main", onclick: () => apply(answer, number) },
       steps.length === 1 ? "Do this step" : `Do these ${steps.length} steps`));
 
+  const verdictOf = ({ offered }) =>
+    element("span", { class: `verdict ${offered ? "offered" : "out"}` }, offered ? "offered" : "not offered");
+
   const shown = (answer, number) => element("article", { class: `answer ${answer.offered ? "yes" : "no"}` },
-    element("h3", {}, element("span", { class: `verdict ${answer.offered ? "offered" : "out"}` }, answer.offered ? "offered" : "not offered"), " ", answer.name),
+    element("h3", {}, verdictOf(answer), " ", answer.name),
     answer.reasons.map(reason => element("p", {}, reason)),
     answer.steps.length ? way(answer.steps, number, 0, false) : null,
     answer.other_ways.map((steps, index) => way(steps, number, index + 1, true)),
@@ -55,7 +57,8 @@ const want = (() => {
     try {
       const { answer, problems } = await core.ask("want", { ...composition(), want: wanted });
       if (wanted === state.want) {
-        fill(answers, answer ? answer.answers.map(shown) : problems.map(problem => element("p", { class: "quiet" }, problem.text)));
+        fill(answers, answer ? answer.answers.map(shown)
+          : problems.map(problem => element("p", { class: "quiet" }, problem.text)));
       }
     } catch (failure) {
       if (wanted === state.want) {
