@@ -10,9 +10,8 @@ if [ $# -ne 3 ]; then
   sed -n '4,6s/^# //p' "$0" >&2
   exit 2
 fi
-cd_target=$(dirname "$0")/..
 edid_decode=$(realpath "$1") libdisplay_info=$(realpath "$2") sinks=$(realpath "$3")
-cd "$cd_target"
+cd "$(dirname "$0")/.."
 
 mkdir -p build/judges
 build_judges() {
