@@ -35,7 +35,7 @@ function(edid_composer_package component package section what)
   set(CPACK_DEBIAN_${upper}_PACKAGE_SECTION ${section} PARENT_SCOPE)
   set(CPACK_DEBIAN_${upper}_PACKAGE_DEPENDS "${depends}" PARENT_SCOPE)
   set(CPACK_COMPONENT_${upper}_DESCRIPTION
-      "EDID composer for boxes with an HDMI input, ${what}.
+      "EDID composer for HDMI inputs: ${what}.
 A repeater, a set-top box or a capture box presents an EDID on its input.
 libedid_composer makes it, of the display's EDID and a configuration."
       PARENT_SCOPE)
