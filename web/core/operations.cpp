@@ -88,14 +88,13 @@ json_t json_findings(const edid_cli::findings_t &findings) {
   return {{"findings", std::move(list)}, {"findings_in_all", findings.size()}};
 }
 
-/// Composes, and complains where the library refuses.
-observation_t observe(inputs_t &inputs, transcript_t &transcript) {
-  observation_t observation(inputs.options, inputs.sink, inputs.platform_name, transcript.listener());
-  if (!observation.is_composed()) {
-    inputs.complaints.push_back({"library", "refuses to compose: " + observation.composition().refusal});
+/// Composes on construction, and complains where the library refuses.
+struct complaining_observation_t : observation_t {
+  complaining_observation_t(inputs_t &inputs, transcript_t &transcript)
+      : observation_t(inputs.options, inputs.sink, inputs.platform_name, transcript.listener()) {
+    if (!is_composed()) inputs.complaints.push_back({"library", "refuses to compose: " + composition().refusal});
   }
-  return observation;
-}
+};
 
 std::string compose(const json_t &request, std::string_view) {
   inputs_t inputs(request);
@@ -103,7 +102,7 @@ std::string compose(const json_t &request, std::string_view) {
   std::string explanation;
   if (inputs.are_usable()) {
     transcript_t transcript;
-    const observation_t observation = observe(inputs, transcript);
+    const complaining_observation_t observation(inputs, transcript);
     members["messages"] = transcript.text();
     if (observation.is_composed()) {
       explanation = explanation_json(explanation_of(observation.explained()));
@@ -123,7 +122,7 @@ std::string answered(const json_t &request, use_t use) {
   inputs_t inputs(request);
   if (inputs.are_usable()) {
     transcript_t unused;
-    const observation_t observation = observe(inputs, unused);
+    const complaining_observation_t observation(inputs, unused);
     if (observation.is_composed()) {
       const auto wanted = edid_cli::parse_wanted(request.at("want").get<std::string>());
       return use(inputs, answers_to(wanted, observation.explained()));
