@@ -3,6 +3,7 @@
 #include <cstdio>
 #include <memory>
 
+#include "edid_text/edid_report.h"
 #include "io/bad_input.h"
 #include "io/standard_output.h"
 #include "text/printable_text.h"
@@ -27,11 +28,13 @@ file_t open_file(const char *mode) {
 
 }  // namespace
 
-std::string printed_report(std::span<const u8> edid, const std::string &title) {
+std::string printed_report(std::span<const u8> bytes, const std::string &title) {
+  const std::vector<u8> edid(bytes.begin(), bytes.end());
+  const edid_cli::report_content_t content = edid_cli::report_content(edid);
   {
     const file_t file = open_file("w");
     const edid_cli::standard_output_redirect_t redirect(fileno(file.get()));
-    print_edid(edid.data(), static_cast<u32>(edid.size()), 0, title.c_str());
+    print_report(edid, content, title, false);
   }
   const file_t file = open_file("r");
   std::string text;

@@ -11,7 +11,7 @@
 #include "commands/exit_status.h"
 #include "commands/shared_options.h"
 #include "edid_input/edid_file.h"
-#include "edid_text/decoded_edid.h"
+#include "edid_text/edid_report.h"
 #include "io/input.h"
 #include "io/program_name.h"
 #include "io/standard_output.h"
@@ -26,18 +26,6 @@ struct print_options_t {
   bool brief = false;
 };
 
-struct content_t {
-  bool is_complete;
-  bool has_hdmi2;
-};
-
-/// Printing has no result, so the same decoding is tried first, unseen.
-content_t content_of(const std::vector<u8> &edid) {
-  const discarded_output_t unseen;
-  const decoded_edid_t decoded(edid);
-  return {decoded.is_complete(), has_hdmi2(decoded.hdmi2())};
-}
-
 /// The name of a file without its folders.
 std::string title_of(const std::string &file) {
   return file == standard_stream ? input_name(file) : std::filesystem::path(file).filename().string();
@@ -45,16 +33,8 @@ std::string title_of(const std::string &file) {
 
 int run(const print_options_t &options) {
   const std::vector<u8> edid = read_edid(options.source, options.drm_directory);
-  const content_t content = content_of(edid);
-  const auto print = [&] {
-    const std::string title = title_of(options.source);
-    print_edid(edid.data(), static_cast<u32>(edid.size()), options.brief ? 1 : 0, title.c_str());
-    if (content.has_hdmi2 && !options.brief) {
-      std::fputs("\n", stdout);
-      const hdmi2_t hdmi2 = decoded_hdmi2(edid);
-      print_hdmi2(&hdmi2, (title + ": HDMI 2").c_str());
-    }
-  };
+  const report_content_t content = report_content(edid);
+  const auto print = [&] { print_report(edid, content, title_of(options.source), options.brief); };
   // The library prints a sink's texts as they are, and a terminal obeys what is among them.
   if (isatty(STDOUT_FILENO) == 1) {
     std::fputs(printable_lines(printed_by(print)).c_str(), stdout);
