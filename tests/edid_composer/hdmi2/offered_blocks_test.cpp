@@ -32,6 +32,23 @@ TEST_F(OfferedBlocks, OfTheForumAreThereOnlyWithSomethingToSay) {
   EXPECT_EQ(forum(), (bytes_t{1, 0, 0x80, 0}));
 }
 
+TEST_F(OfferedBlocks, OfTheForumTellNoReadRequestsOrScramblingWithoutScdc) {
+  situation_.values.read_request = situation_.values.scramble_low = 1;
+  situation_.values.allm = 1;
+  EXPECT_EQ(forum(), (bytes_t{1, 0, 0, 0, 0x02}));
+}
+
+TEST_F(OfferedBlocks, OfTheForumTellNoDepthForAModeThatIsLeftOut) {
+  situation_.name({97});
+  situation_.add({97});
+  situation_.values.y420 = situation_.values.dc_30bit_420 = 1;
+  situation_.values.tmds_limit = 600;
+  situation_.sink.blocks = {forum_block(120)};
+  EXPECT_EQ(forum(), (bytes_t{1, 120, 0x80, 0x01}));
+  situation_.platform.geometry_limit = 1;
+  EXPECT_EQ(forum(), (bytes_t{1, 120, 0x80, 0})) << "2160 lines are more than the sink's 1080";
+}
+
 TEST_F(OfferedBlocks, OfTheForumTellARateAbove340Mhz) {
   situation_.sink.blocks = {forum_block(120)};
   situation_.values.tmds_limit = 340;
