@@ -56,9 +56,9 @@ class SameAsProgram(page.PageTest):
             if not members["sink"]:
                 continue
             # Their headings name what each of them knows the sink by.
-            page_title, program_title = "Sink", members["sink"]["name"]
+            page_title, program_title = "Sink", pathlib.Path(members["sink"]["name"]).name
             report = self.ask("compose", **members)["sink_report"]
-            printed = page.run_program("print", program_title)
+            printed = page.run_program("print", members["sink"]["name"])
             self.assertEqual(report.partition("\n")[2].replace(f"{page_title}: HDMI 2\n", "HDMI 2\n"),
                              printed.partition("\n")[2].replace(f"{program_title}: HDMI 2\n", "HDMI 2\n"))
 
